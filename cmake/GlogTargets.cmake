@@ -1,0 +1,46 @@
+# How every target of this tree is compiled.
+
+add_library(glog_flags INTERFACE)
+target_compile_options(glog_flags INTERFACE -Wall -Wextra -Wpedantic -Werror -fno-omit-frame-pointer)
+if(GLOG_SANITIZE)
+  # A recovering sanitizer would let a broken test pass.
+  add_compile_options(-fsanitize=${GLOG_SANITIZE} -fno-sanitize-recover=all)
+  add_link_options(-fsanitize=${GLOG_SANITIZE})
+endif()
+
+# glog_library(NAME FOLDER...): the shared library libglogNAME from all sources of the folders.
+function(glog_library name)
+  set(sources "")
+  foreach(folder ${ARGN})
+    file(GLOB found CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/${folder}/*.cpp)
+    list(APPEND sources ${found})
+  endforeach()
+  add_library(${name} SHARED ${sources})
+  set_target_properties(${name} PROPERTIES OUTPUT_NAME glog${name} VERSION ${PROJECT_VERSION} SOVERSION 0)
+  target_include_directories(${name} PUBLIC $<BUILD_INTERFACE:${CMAKE_SOURCE_DIR}>
+                             $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}/glogpanes>)
+  target_compile_definitions(${name} PUBLIC BOOST_ENABLE_ASSERT_HANDLER)
+  target_compile_features(${name} PUBLIC cxx_std_17)
+  target_link_libraries(${name} PRIVATE $<BUILD_INTERFACE:glog_flags>)
+endfunction()
+
+# glog_program(NAME SOURCES...): a program of this tree.
+function(glog_program name)
+  add_executable(${name} ${ARGN})
+  target_link_libraries(${name} PRIVATE glog_flags)
+endfunction()
+
+# glog_add_test(NAME FOLDER LIBS...): one GoogleTest program from all sources of tests/FOLDER, its tests known to ctest.
+function(glog_add_test name folder)
+  file(GLOB sources CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/tests/${folder}/*.cpp)
+  if(NOT sources)
+    return()
+  endif()
+  glog_program(${name} ${sources})
+  target_include_directories(${name} PRIVATE ${CMAKE_SOURCE_DIR})
+  target_link_libraries(${name} PRIVATE ${ARGN} GTest::gtest GTest::gtest_main)
+  target_precompile_headers(${name} PRIVATE <gtest/gtest.h>)
+  target_compile_definitions(${name} PRIVATE GLOG_TEST_SOURCE_DIR="${CMAKE_SOURCE_DIR}/tests"
+                             GLOG_TEST_OUTPUT_DIR="${CMAKE_BINARY_DIR}/test-output")
+  gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 120)
+endfunction()

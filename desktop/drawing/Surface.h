@@ -1,0 +1,45 @@
+// A window's pixels, on which integer drawing and curves both work.
+#pragma once
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <vector>
+#include "desktop/drawing/DeviceScale.h"
+
+typedef union pixman_image pixman_image_t;
+typedef struct _cairo_surface cairo_surface_t;
+
+// Device pixels, 0xAARRGGBB premultiplied, rows from top to bottom without gaps. One block of memory that pixman and Cairo share.
+class Surface {
+public:
+    // Sizes below 1 are taken as 1. The pixels start opaque black.
+    Surface(int width, int height);
+    ~Surface();
+    Surface(Surface const &) = delete;
+    Surface &operator=(Surface const &) = delete;
+
+    int Width() const { return width; }
+    int Height() const { return height; }
+    std::uint32_t *Pixels() { return pixels.data(); }
+    std::uint32_t const *Pixels() const { return pixels.data(); }
+    std::uint32_t *Row(int y) { return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width); }
+    std::uint32_t const *Row(int y) const {
+        return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
+    }
+
+    pixman_image_t *PixmanImage() const { return image; }
+    // Made at the first call: a window without text or curves needs none.
+    cairo_surface_t *CairoSurface();
+
+    // Writes a PNG file; false, with the reason in `error`, when it cannot be written.
+    bool WritePng(std::string const &path, std::string &error) const;
+    // Reads a PNG file; null, with the reason in `error`, for a broken file or one of more than 8192 pixels a side.
+    static std::unique_ptr<Surface> ReadPng(std::string const &path, std::string &error);
+
+private:
+    int width, height;
+    std::vector<std::uint32_t> pixels;
+    pixman_image_t *image;
+    cairo_surface_t *cairo;
+};

@@ -1,0 +1,14 @@
+// Between UTF-8 outside and UTF-16 inside.
+#pragma once
+#include <string>
+#include <string_view>
+#include "host/UString.h"
+
+namespace Utf {
+// Broken sequences become U+FFFD.
+UString FromUtf8(std::string_view);
+std::string ToUtf8(UString const &); // lone surrogates become U+FFFD
+// The units themselves; valid until the string changes.
+std::u16string_view View(UString const &);
+UString FromUnits(std::u16string_view);
+}
