@@ -1,0 +1,7 @@
+#pragma once
+class UIEvent;
+
+struct CustomEventHandler {
+    virtual bool HandleEvent(UIEvent *) = 0;
+    virtual CustomEventHandler *Clone() = 0;
+};

@@ -1,0 +1,6 @@
+#pragma once
+#include <exception>
+
+class TarnError : public std::exception {};
+
+void FailMemFullError();
