@@ -1,24 +1,37 @@
+// Finds the help tag for a place in a pane.
 #pragma once
 #include "host/Geometry.h"
 #include "host/LocalizedStrings.h"
 
+// Belongs to one pane, given to it by GlogPane::SetHelpTagHelper.
 class HelpTagHelper {
 public:
     virtual ~HelpTagHelper() {}
-    virtual bool IsDefaultHelper() const = 0;
 
-    virtual bool GetHelpTag(Point, LocalizedStrings::HelpTag const *&, Rect &, OS::Help::Placement &, double &) = 0;
+    // Whether GlogPane::SetHelpTag installed this helper, for one tag on the whole pane. Such a helper may be
+    // replaced by one that knows parts.
+    virtual bool IsDefaultHelper() const = 0;
+    // Looks up the tag for the point, in pane coordinates. When there is one, answers true and writes the
+    // tag, the rectangle for which it holds, its placement, and the delay in seconds before it appears; else
+    // writes nothing.
+    virtual bool GetHelpTag(Point, LocalizedStrings::HelpTag const *&, Rect &, OS::Help::Placement &,
+                            double &) = 0;
 };
 
+// A tag for each of several rectangles.
 class MultiHelpTagHelper : public HelpTagHelper {
 public:
-    MultiHelpTagHelper();
+    MultiHelpTagHelper(); // without tags
     virtual ~MultiHelpTagHelper();
-    virtual bool IsDefaultHelper() const;
-    virtual bool GetHelpTag(Point, LocalizedStrings::HelpTag const *&, Rect &, OS::Help::Placement &, double &);
+    virtual bool IsDefaultHelper() const; // false
+    virtual bool GetHelpTag(Point, LocalizedStrings::HelpTag const *&, Rect &, OS::Help::Placement &,
+                            double &);
 
+    // Adds a rectangle in pane coordinates. Where rectangles overlap, the one added first counts. The tag
+    // stays the host's; one that is null is not added.
     void AddHelpTag(LocalizedStrings::HelpTag const *, Rect, OS::Help::Placement, double delaySeconds);
     void ClearHelpTags();
+
 private:
     struct Rep;
     Rep *rep;

@@ -1,56 +1,87 @@
+// Menus, and the pop-up that lets the user choose from one.
 #pragma once
-#include <boost/shared_ptr.hpp>
 #include "host/Geometry.h"
 #include "host/UString.h"
+#include <boost/shared_ptr.hpp>
 
+// Draws something beside a menu item; only the host looks inside.
 class MenuItemDecorator;
 
+// A counted reference to a menu, or to none (invalid). Copies name the same menu, which goes with its last
+// reference.
+//
+// Items count from 1; separators are items too. An item that does not exist reads as empty, disabled and
+// without icon or submenu, and changing it has no effect. The same holds for all operations on an invalid
+// handle.
 class OSMenuHandle {
 public:
-    OSMenuHandle();
+    OSMenuHandle(); // invalid
     OSMenuHandle(OSMenuHandle const &);
     ~OSMenuHandle();
     OSMenuHandle &operator=(OSMenuHandle const &);
-    bool operator==(OSMenuHandle const &) const;
+    bool operator==(OSMenuHandle const &) const; // whether both name the same menu, or both none
 
+    // A new menu without items, under an id of its own, which is not 0.
     static OSMenuHandle CreateNewHierarchicalMenu();
+    // A copy of the stored menu, for the caller alone; invalid when there is none of that id.
     static OSMenuHandle CopyPrototypeMenu(short id);
+    // The stored menu itself, shared by all who ask for it; invalid when there is none of that id.
     static OSMenuHandle GetSingletonMenu(short id);
+    // Whether GetSingletonMenu knows the id.
     static bool IsSingletonMenu(short id);
+    // Looks for the id among the installed menus. True and the menu, or false and `out` untouched.
     static bool FindInMenuList(short id, OSMenuHandle &out);
 
     bool IsValid() const;
-    void clear();
+    void clear(); // drops this reference; other handles keep theirs
     short GetMenuID() const;
+    // Makes the menu a copy of the other's items; ids stay.
     void CloneMenu(OSMenuHandle const &);
+
+    // Installs the menu so that its id can be found: before the installed menu of that id, or as a submenu
+    // for -1.
     void InsertMenuBeforeMenuID(short id);
     void RemoveFromMenuList();
+
+    // A disabled menu shows its items grey and lets none be chosen.
     void SetEnabled(bool);
     bool IsEnabled() const;
     void DisableItem(short item);
     void SetItemEnabled(short item, bool);
     bool IsItemEnabled(short item) const;
+
     void SetMenuItemText(short item, UString const &);
     void GetMenuItemText(short item, UString &) const;
     void SetMenuItemIcon(short item, short icon);
-    short GetMenuItemIcon(short item) const;
+    short GetMenuItemIcon(short item) const; // 0: none
+
+    // An item is hierarchical when it opens a submenu: the installed menu of the item's hierarchical id.
     bool IsMenuItemHierarchical(short item) const;
-    void SetMenuItemHierarchicalID(short item, short menuID);
+    void SetMenuItemHierarchicalID(short item, short menuID); // 0: none
     short GetMenuItemHierarchicalID(short item) const;
+
     void ApplyDecoratorToItem(short item, boost::shared_ptr<MenuItemDecorator> const &);
     void SetMenuItemCheck(short item, bool);
+
+    // Inserts an item; after item 0 is at the beginning, after the last or beyond at the end.
     void InsertItem(short afterItem, UString const &);
+    // Appends an item. Attribute 0x40: the text is taken as it stands, without marks for keys or styles.
     void AppendItem(UString const &, int attributes);
     void AppendItem(UString const &);
     void DeleteItem(short item);
-    void ChangeItemAttributes(short item, int set, int clear);
+    void ChangeItemAttributes(short item, int set, int clear); // attribute bits, as above
     void InsertMenuSeparator(short afterItem);
     void AppendMenuSeparator();
     void SetMenuTitle(UString const &);
     short NumMenuItems() const;
+
 private:
     struct Rep;
     Rep *rep;
 };
 
+// Opens the menu with its current item over the rectangle, in the current pane's coordinates, and waits for
+// the choice. Answers the id of the menu that was chosen from, it or a submenu, in the upper 16 bits and the
+// item in the lower, or 0 when nothing was chosen. A current item of 0 means none: the menu then opens with
+// its first item there.
 int RunPopupMenu(OSMenuHandle &, short currentItem, Rect *);

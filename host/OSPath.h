@@ -21,6 +21,8 @@ private:
     OSPath(OSPath const &);
     OSPath &operator=(OSPath const &);
 
+    friend struct PathAccess; // the host's way to the representation
+
     struct Rep;
     Rep *rep;
 };

@@ -19,6 +19,8 @@ public:
     void Offset(double dh, double dv);
 
 private:
+    friend struct RegionAccess; // the host's way to the representation
+
     struct Rep;
     Rep *rep;
 };

@@ -1,6 +1,8 @@
+// A line of text in which each part has a look of its own.
 #pragma once
-#include <memory>
+#include "host/AutoPtr.h"
 
+// One part of the line; only the host looks inside.
 class StyledStringItem {
 public:
     virtual ~StyledStringItem() {}
@@ -8,15 +10,22 @@ public:
 
 class StyledString {
 public:
-    StyledString();
+    StyledString(); // without parts
     ~StyledString();
-    void Add(std::auto_ptr<StyledStringItem>);
+
+    // Appends a part and takes it over; an empty pointer has no effect.
+    void Add(AutoPtr<StyledStringItem>);
+    // Sum of the parts' widths, in pixels.
     int GetWidth() const;
+    // The greatest height of a part above the baseline, in pixels.
     short GetAscent() const;
+    // Draws the parts one after the other, with their baseline at the pen.
     void Draw();
+
 private:
     StyledString(StyledString const &);
     StyledString &operator=(StyledString const &);
+
     struct Rep;
     Rep *rep;
 };

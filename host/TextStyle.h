@@ -1,3 +1,4 @@
+// The look of a run of editable text.
 #pragma once
 #include "host/OSFont.h"
 #include "host/RGBColor.h"
@@ -6,9 +7,13 @@ namespace OS {
 
 struct TextStyle {
     Font::FamilyID family;
-    int face;
-    short size;
-    RGBAColor color;
-    TextStyle() : face(0), size(0) {}
+    int face;        // 0 plain, 1 bold, 32 condensed; the values add up
+    short size;      // logical pixels
+    RGBAColor color; // black and opaque by default
+
+    TextStyle()
+        : face(0)
+        , size(0) {}
 };
-}
+
+} // namespace OS
