@@ -1,8 +1,8 @@
 // Between UTF-8 outside and UTF-16 inside.
 #pragma once
+#include "host/UString.h"
 #include <string>
 #include <string_view>
-#include "host/UString.h"
 
 namespace Utf {
 // Broken sequences become U+FFFD.
@@ -11,4 +11,4 @@ std::string ToUtf8(UString const &); // lone surrogates become U+FFFD
 // The units themselves; valid until the string changes.
 std::u16string_view View(UString const &);
 UString FromUnits(std::u16string_view);
-}
+} // namespace Utf
