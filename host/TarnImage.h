@@ -28,6 +28,8 @@ public:
 class ThemeChangeNotificationProvider : public Provider<ThemeChangeNotificationProvider_Listener> {
 public:
     static ThemeChangeNotificationProvider &Instance();
+    // For the host: sends ThemeChanged to everybody.
+    void NotifyThemeChanged();
 };
 
 // A picture by resource number. Follows changes of the theme by itself.

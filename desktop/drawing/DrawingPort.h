@@ -1,7 +1,10 @@
 // The drawing port of a window.
 #pragma once
+#include <functional>
 #include <memory>
+#include <vector>
 #include "desktop/drawing/DeviceScale.h"
+#include "desktop/drawing/TouchedBoxes.h"
 #include "host/Geometry.h"
 #include "host/OSFont.h"
 #include "host/OSPort.h"
@@ -10,19 +13,34 @@
 #include "host/RGBColor.h"
 #include "host/VelaDrawing.h"
 
+class ClipPath;
 class Surface;
 typedef struct _cairo cairo_t;
 
 // What drawing depends on beside the pixels; the savers keep copies of parts of it.
 struct GraphicsState {
-    OS::RGBAColor fore;                                    // opaque black
-    OS::RGBAColor back{1.0, 1.0, 1.0, 1.0};                // opaque white
-    PenState pen{{0, 0}, {1, 1}, 0, 0};                    // location in local coordinates
-    double lineWidth = 1.0;                                // logical pixels, for StrokePath
+    OS::RGBAColor fore;                      // opaque black
+    OS::RGBAColor back{1.0, 1.0, 1.0, 1.0};  // opaque white
+    PenState pen{{0, 0}, {1, 1}, 0, 0};      // location in local coordinates
+    double lineWidth = 1.0;                  // logical pixels, for the outlines and paths of OSPort
     OS::Font::FamilyID textFamily;
     int textFace = 0;
-    short textSize = 12;                                   // points, which are logical pixels
-    int darken = 0;                                        // 0 draws plainly; else percent by which drawing darkens
+    short textSize = 12;                     // points, which are logical pixels
+    int darken = 0;                          // 0 draws plainly; else percent by which drawing darkens
+    bool fadedIcons = false;                 // GrayForeColor with a light gray, as for what is disabled
+
+    void SetFore(OS::RGBAColor const &color) {
+        fore = color;
+        fadedIcons = false;
+    }
+    // Makes the pen and the line 1 pixel wide; the pen stays where it is.
+    void PenNormal();
+};
+
+// A clip as it is kept and put back.
+struct ClipState {
+    OSRgn region;                            // window coordinates
+    std::shared_ptr<ClipPath const> path;    // narrows the region further; null for none
 };
 
 // The one OSPort there is. Logical pixels throughout; the surface is larger by the scale. Local coordinates are those of the
@@ -32,17 +50,24 @@ public:
     DrawingPort();
     virtual ~DrawingPort();
 
-    // The pixels and their scale; neither is owned. Drawing on a port without surface does nothing.
+    // The pixels and their scale; neither is owned. Drawing on a port without surface does nothing. Has to be called, if need be
+    // with null, before the surface dies.
     void SetSurface(Surface *, DeviceScale);
     Surface *GetSurface() const { return surface; }
     DeviceScale Scale() const { return scale; }
-    // The window's content in logical pixels, from (0, 0); cuts every clip and all damage.
+    // The window's content in logical pixels, from (0, 0); cuts every clip and all damage. Boundary and clip become all of it.
     void SetExtent(int width, int height);
     Rect Extent() const { return extent; }
+    // Asked for the place of the window's content on the screen, in logical pixels, whenever somebody wants to know. Without it the
+    // content is taken to lie in the corner of the screen.
+    void SetScreenPlace(std::function<Point()> place) { screenPlace = std::move(place); }
+    Point ScreenPlace() const { return screenPlace ? screenPlace() : Point{0, 0}; }
 
     // The port that the imperative calls use; null for none.
-    static void MakeCurrent(DrawingPort *);
-    static DrawingPort *CurrentPort();
+    static void MakeCurrent(DrawingPort *port) { current = port; }
+    static DrawingPort *CurrentPort() { return current; }
+    // The port, or null when it has died: windows close while a tracking loop further up keeps their port.
+    static DrawingPort *Alive(OSPort *);
 
     // Origin of local coordinates in the window.
     void SetOrigin(int h, int v);
@@ -52,20 +77,37 @@ public:
     // The widest clip that drawing may have, in window coordinates; makes it the clip as well.
     void SetBoundary(OSRgn const &);
     OSRgn const &Boundary() const { return boundary; }
-    // The clip proper, in window coordinates; what is set is cut to the boundary.
+    // The clip proper, in window coordinates; what is set is cut to the boundary. Forgets any path that narrowed the clip.
     void SetClip(OSRgn const &);
     OSRgn const &Clip() const { return clip; }
+    // The clip with its path, to be put back later.
+    ClipState GetClipState() const { return {clip, clipPath}; }
+    void SetClipState(ClipState const &);
+    // Leaves of the clip what lies in the rectangle or region too; window coordinates.
+    void NarrowClipTo(Rect const &);
+    void NarrowClipTo(OSRgn const &);
     // Whether drawing in the local rectangle could show.
     bool Visible(Rect const &local) const;
 
     GraphicsState &State() { return state; }
     GraphicsState const &State() const { return state; }
+    // What shapes are drawn in: the foreground, or the shade that darkens by as much as the state says.
+    OS::RGBAColor Ink() const;
+
+    // Covers all of the clip with the colour, whatever the state.
+    void FillClip(OS::RGBAColor const &);
 
     // What waits to be redrawn, in window coordinates. Damage takes a local rectangle.
     void Damage(Rect const &local);
     void DamageWindow(OSRgn const &);
     OSRgn const &GetDamage() const { return damage; }
     OSRgn TakeDamage();
+
+    // The device pixels that have been drawn on since the last call, and so have to be shown: a few boxes that cover them.
+    std::vector<DeviceRect> TakeTouched() { return touched.Take(); }
+
+    // Fills the whole clip with the colour; no call of the contract, so that no trace tells of it.
+    void FillClip(OS::RGBAColor const &);
 
     Rect LocalToWindow(Rect const &) const; // saturates at the ends of 16 bits
     Rect WindowToLocal(Rect const &) const;
@@ -87,18 +129,45 @@ public:
 private:
     friend class CairoScope;
     friend class PixelScope;
+    friend class PortRef;
+    struct Device; // clip in device pixels and the Cairo context, both made when first needed
+
+    void ClipChanged();
+    void CutClip(OSRgn const &);
+    void MoveDevicePixels(OSRgn const &destination, int dh, int dv);
+    static DrawingPort *current;
+
     Surface *surface;
     DeviceScale scale;
     Rect extent;
     int originH, originV;
     OSRgn boundary, clip, damage;
+    std::shared_ptr<ClipPath const> clipPath;
     GraphicsState state;
-    struct Device; // clip in device pixels and the Cairo context, both made when first needed
+    TouchedBoxes touched;
+    std::function<Point()> screenPlace;
     std::unique_ptr<Device> device;
+    unsigned long serial; // of all ports ever made
+};
+
+// A port that may die meanwhile.
+class PortRef {
+public:
+    explicit PortRef(DrawingPort *port_) : port(port_), serial(port_ ? port_->serial : 0) {}
+    // Null when there was none, or when it is gone.
+    DrawingPort *Get() const {
+        DrawingPort *alive = DrawingPort::Alive(port);
+        return alive && alive->serial == serial ? alive : nullptr; // another may stand at the same address
+    }
+
+private:
+    DrawingPort *port;
+    unsigned long serial;
 };
 
 // Cairo drawing on the current surface for the scope's lifetime: user space is local logical coordinates, the clip is the port's,
-// the source is the foreground colour. Null context when nothing of `bounds` (local) could show.
+// the source is the port's ink. Null context when nothing of `bounds` (local) could show. The context's state is put back at the
+// end. Scopes do not nest, and the port's clip stays as it is while one lives.
 class CairoScope {
 public:
     CairoScope(DrawingPort &, Rect const &bounds);

@@ -32,9 +32,13 @@ public:
     // Made at the first call: a window without text or curves needs none.
     cairo_surface_t *CairoSurface();
 
+    // Whether every pixel has full alpha; looks at all of them.
+    bool IsOpaque() const;
+
     // Writes a PNG file; false, with the reason in `error`, when it cannot be written.
     bool WritePng(std::string const &path, std::string &error) const;
-    // Reads a PNG file; null, with the reason in `error`, for a broken file or one of more than 8192 pixels a side.
+    // Reads a PNG file; null, with the reason in `error`, for a broken file or one of more than 8192 pixels a side. The size is
+    // checked before anything is decoded.
     static std::unique_ptr<Surface> ReadPng(std::string const &path, std::string &error);
 
 private:

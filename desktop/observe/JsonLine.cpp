@@ -62,18 +62,20 @@ JsonLine &JsonLine::Integer(char const *key, long long value) {
 
 JsonLine &JsonLine::Number(char const *key, double value) {
     Key(key);
-    if (!std::isfinite(value)) {
-        text += "null"; // JSON has no infinities
-        return *this;
-    }
+    text += Shortest(value);
+    return *this;
+}
+
+std::string JsonLine::Shortest(double value) {
+    if (!std::isfinite(value))
+        return "null"; // JSON has no infinities
     char digits[32];
     for (int precision = 1; precision <= 17; ++precision) {
         std::snprintf(digits, sizeof digits, "%.*g", precision, value);
         if (std::strtod(digits, nullptr) == value)
             break;
     }
-    text += digits;
-    return *this;
+    return digits;
 }
 
 JsonLine &JsonLine::Flag(char const *key, bool value) {

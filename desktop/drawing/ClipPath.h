@@ -1,0 +1,33 @@
+// A path that narrows a clip, at the resolution of the device.
+#pragma once
+#include <memory>
+#include <pixman.h>
+#include "desktop/drawing/DeviceScale.h"
+
+class OSPath;
+typedef struct _cairo cairo_t;
+struct cairo_path;
+
+// Does not change once it is made, so that saved clips can share it. A clip that has been narrowed by several paths is the meeting
+// of a chain of them.
+class ClipPath {
+public:
+    // The path is in local coordinates, of which (originH, originV) is added to get to the window's. What lies outside of the given
+    // number of device pixels is left out.
+    ClipPath(OSPath const &, int originH, int originV, DeviceScale, int deviceWidth, int deviceHeight,
+             std::shared_ptr<ClipPath const> outer);
+    ~ClipPath();
+    ClipPath(ClipPath const &) = delete;
+    ClipPath &operator=(ClipPath const &) = delete;
+
+    // The device pixels that belong to this path and all outer ones, for drawing in whole pixels: those whose centre is inside.
+    pixman_region32_t const *Pixels() const { return &pixels; }
+    // Narrows the clip of the context by this path and all outer ones, with smooth edges. The context's matrix has to be the
+    // identity.
+    void Narrow(cairo_t *) const;
+
+private:
+    cairo_path *path; // device coordinates
+    pixman_region32_t pixels;
+    std::shared_ptr<ClipPath const> outer;
+};

@@ -1,0 +1,174 @@
+#include "desktop/drawing/PixelScope.h"
+#include <algorithm>
+#include "desktop/drawing/Surface.h"
+
+namespace {
+
+constexpr std::uint32_t kFullAlpha = 0xFF;
+constexpr double kLargest8 = 255.0, kLargest16 = 65535.0;
+constexpr int kBitsPerPixel = 32;
+// Rows this short are filled faster here than by a call into the library.
+constexpr int kShortRow = 16;
+// What is left of an icon that is drawn as disabled.
+constexpr std::uint16_t kFadedAlpha = 0x6666;
+
+double Unit(double value) { return value > 0.0 ? std::min(value, 1.0) : 0.0; } // what is not a number gives 0
+
+std::uint32_t Component8(double value) { return static_cast<std::uint32_t>(Unit(value) * kLargest8 + 0.5); }
+
+std::uint16_t Component16(double value) {
+    return static_cast<std::uint16_t>(Unit(value) * kLargest16 + 0.5);
+}
+
+pixman_color_t PremultipliedColor(OS::RGBAColor const &color) {
+    double alpha = Unit(color.a);
+    return {Component16(Unit(color.r) * alpha), Component16(Unit(color.g) * alpha),
+            Component16(Unit(color.b) * alpha), Component16(alpha)};
+}
+
+bool Same(OS::RGBAColor const &a, OS::RGBAColor const &b) {
+    return a.r == b.r && a.g == b.g && a.b == b.b && a.a == b.a;
+}
+
+// One colour everywhere.
+class SolidImage {
+public:
+    explicit SolidImage(pixman_color_t const &color) : image(pixman_image_create_solid_fill(&color)) {}
+    ~SolidImage() {
+        if (image)
+            pixman_image_unref(image);
+    }
+    SolidImage(SolidImage const &) = delete;
+    SolidImage &operator=(SolidImage const &) = delete;
+    pixman_image_t *Get() const { return image; }
+
+private:
+    pixman_image_t *image;
+};
+
+pixman_image_t *FadingMask() {
+    static SolidImage const mask({0, 0, 0, kFadedAlpha});
+    return mask.Get();
+}
+
+// Makes an image repeat for the scope's lifetime. Images are shared, so that it must not stay that way.
+class WithRepeat {
+public:
+    WithRepeat(pixman_image_t *image_, bool repeats) : image(repeats ? image_ : nullptr) {
+        if (image)
+            pixman_image_set_repeat(image, PIXMAN_REPEAT_NORMAL);
+    }
+    ~WithRepeat() {
+        if (image)
+            pixman_image_set_repeat(image, PIXMAN_REPEAT_NONE);
+    }
+    WithRepeat(WithRepeat const &) = delete;
+    WithRepeat &operator=(WithRepeat const &) = delete;
+
+private:
+    pixman_image_t *image;
+};
+
+}
+
+PixelScope::PixelScope(DrawingPort &port_) : port(port_), device(nullptr) {
+    if (!port.surface)
+        return;
+    port.device->UpdateClip(port);
+    if (!port.device->clipBounds.Empty())
+        device = port.device.get();
+}
+
+template <class Draw> void PixelScope::ForEachVisible(DeviceRect const &r, Draw draw) {
+    DeviceRect box = r.Intersected(device->clipBounds);
+    if (box.Empty())
+        return;
+    port.touched.Add(box);
+    if (device->clipIsBox) {
+        draw(box);
+        return;
+    }
+    int count = 0;
+    pixman_box32_t const *clip = pixman_region32_rectangles(&device->clip, &count);
+    for (; count > 0 && clip->y1 < box.bottom; --count, ++clip) { // from top to bottom
+        DeviceRect part = box.Intersected({clip->x1, clip->y1, clip->x2, clip->y2});
+        if (!part.Empty())
+            draw(part);
+    }
+}
+
+std::uint32_t PixelScope::PixelOf(OS::RGBAColor const &color) {
+    if (!Same(color, device->color)) {
+        double alpha = Unit(color.a);
+        device->color = color;
+        device->pixel = Component8(alpha) << 24 | Component8(Unit(color.r) * alpha) << 16 |
+                        Component8(Unit(color.g) * alpha) << 8 | Component8(Unit(color.b) * alpha);
+    }
+    return device->pixel;
+}
+
+void PixelScope::FillPixels(DeviceRect const &r, std::uint32_t pixel) {
+    Surface &surface = *port.surface;
+    int const width = r.Width();
+    if (width > kShortRow) {
+        pixman_fill(surface.Pixels(), surface.Width(), kBitsPerPixel, r.left, r.top, width, r.Height(),
+                    pixel);
+        return;
+    }
+    std::uint32_t *row = surface.Row(r.top) + r.left;
+    for (int y = r.top; y < r.bottom; ++y, row += surface.Width())
+        for (int x = 0; x < width; ++x)
+            row[x] = pixel;
+}
+
+void PixelScope::Fill(DeviceRect const &r, OS::RGBAColor const &color) {
+    FillPlainly(r, port.state.darken != 0 ? port.Ink() : color);
+}
+
+void PixelScope::Cover(OS::RGBAColor const &color) { FillPlainly(device->clipBounds, color); }
+
+void PixelScope::FillPlainly(DeviceRect const &r, OS::RGBAColor const &color) {
+    std::uint32_t const pixel = PixelOf(color);
+    if (pixel >> 24 == kFullAlpha) {
+        ForEachVisible(r, [&](DeviceRect const &part) { FillPixels(part, pixel); });
+        return;
+    }
+    pixman_color_t const over = PremultipliedColor(color);
+    ForEachVisible(r, [&](DeviceRect const &part) {
+        pixman_box32_t box = {part.left, part.top, part.right, part.bottom};
+        pixman_image_fill_boxes(PIXMAN_OP_OVER, port.surface->PixmanImage(), &over, 1, &box);
+    });
+}
+
+void PixelScope::FillFrame(DeviceRect const &outer, DeviceRect const &inner, OS::RGBAColor const &color) {
+    if (inner.Empty()) {
+        Fill(outer, color);
+        return;
+    }
+    Fill({outer.left, outer.top, outer.right, inner.top}, color);
+    Fill({outer.left, inner.top, inner.left, inner.bottom}, color);
+    Fill({inner.right, inner.top, outer.right, inner.bottom}, color);
+    Fill({outer.left, inner.bottom, outer.right, outer.bottom}, color);
+}
+
+void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRect const &box, bool fades) {
+    if (image.empty)
+        return;
+    bool const repeats = left > box.left || top > box.top || left + image.width < box.right ||
+                         top + image.height < box.bottom;
+    WithRepeat repeating(image.pixels, repeats);
+    pixman_image_t *target = port.surface->PixmanImage();
+    auto compose = [&](pixman_op_t operation, pixman_image_t *source, pixman_image_t *mask) {
+        ForEachVisible(box, [&](DeviceRect const &part) {
+            int const fromH = part.left - left, fromV = part.top - top;
+            pixman_image_composite32(operation, source, mask, target, fromH, fromV, fromH, fromV, part.left,
+                                     part.top, part.Width(), part.Height());
+        });
+    };
+    if (port.state.darken != 0)
+        compose(PIXMAN_OP_OVER, SolidImage(PremultipliedColor(port.Ink())).Get(), image.pixels);
+    else if (fades && port.state.fadedIcons)
+        compose(PIXMAN_OP_OVER, image.pixels, FadingMask());
+    else
+        compose(image.opaque ? PIXMAN_OP_SRC : PIXMAN_OP_OVER, image.pixels, nullptr);
+}

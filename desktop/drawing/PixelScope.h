@@ -1,0 +1,52 @@
+// Drawing in whole device pixels.
+#pragma once
+#include <cstdint>
+#include <pixman.h>
+#include "desktop/drawing/DrawingPort.h"
+#include "desktop/drawing/PortDevice.h"
+
+// An image as it lies in memory, and what is known of it.
+struct PixelImage {
+    pixman_image_t *pixels = nullptr; // not owned
+    int width = 0, height = 0;        // device pixels
+    bool opaque = false;              // every pixel has full alpha
+    bool empty = true;                // no pixel has any: there is nothing to draw
+};
+
+// The way from local coordinates onto a port's surface, for the duration of one drawing call. Cuts to the clip, and notes what has
+// been drawn on. Nothing here is anti-aliased. The state's darkening applies to everything.
+class PixelScope {
+public:
+    explicit PixelScope(DrawingPort &);
+
+    // False when nothing at all can show; nothing else may be called then.
+    bool CanDraw() const { return device != nullptr; }
+    DeviceRect ToDevice(Rect const &local) const {
+        return ToDevice(local.left, local.top, local.right, local.bottom);
+    }
+    DeviceRect ToDevice(int left, int top, int right, int bottom) const {
+        return port.scale.ToDevice(left + port.originH, top + port.originV, right + port.originH,
+                                   bottom + port.originV);
+    }
+    // Whether any pixel of the box could show.
+    bool Meets(DeviceRect const &r) const { return !r.Intersected(device->clipBounds).Empty(); }
+
+    // In the given colour, over what is beneath if the colour is transparent.
+    void Fill(DeviceRect const &, OS::RGBAColor const &);
+    // All of the clip, without regard to darkening.
+    void Cover(OS::RGBAColor const &);
+    // The four bars between the outer and the inner box, which must not reach beyond the outer. An empty inner box fills all.
+    void FillFrame(DeviceRect const &outer, DeviceRect const &inner, OS::RGBAColor const &);
+    // The image with its top left corner at the given place, as far as it lies in the box; repeated without end when it is smaller
+    // than the box. Faded if the state says so and `fades` is true.
+    void DrawImage(PixelImage const &, int left, int top, DeviceRect const &box, bool fades);
+
+private:
+    void FillPlainly(DeviceRect const &, OS::RGBAColor const &);
+    std::uint32_t PixelOf(OS::RGBAColor const &);
+    void FillPixels(DeviceRect const &, std::uint32_t pixel);
+    template <class Draw> void ForEachVisible(DeviceRect const &, Draw);
+
+    DrawingPort &port;
+    DrawingPort::Device *device;
+};

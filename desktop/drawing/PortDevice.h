@@ -1,0 +1,32 @@
+// What a port keeps about its surface between drawing calls.
+#pragma once
+#include <cairo.h>
+#include <cstdint>
+#include <pixman.h>
+#include "desktop/drawing/DrawingPort.h"
+
+struct DrawingPort::Device {
+    Device();
+    ~Device();
+    Device(Device const &) = delete;
+    Device &operator=(Device const &) = delete;
+
+    void ForgetClip();
+    void ForgetSurface();
+    // The boxes of the port's clip in device pixels, and the smallest box around them. Cached until ForgetClip.
+    void UpdateClip(DrawingPort const &);
+    // A context with the port's clip, in device pixels, without any other state that matters.
+    cairo_t *UpdateContext(DrawingPort &);
+
+    bool clipKnown = false;
+    DeviceRect clipBounds{0, 0, 0, 0};
+    pixman_region32_t clip;
+    bool clipIsBox = false;
+
+    cairo_t *context = nullptr;
+    bool contextClipKnown = false;
+
+    // The last colour drawn in, as a pixel.
+    OS::RGBAColor color;
+    std::uint32_t pixel = 0xFF000000u;
+};

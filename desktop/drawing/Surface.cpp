@@ -1,0 +1,124 @@
+#include "desktop/drawing/Surface.h"
+#include <algorithm>
+#include <array>
+#include <cairo.h>
+#include <cstring>
+#include <fstream>
+#include <pixman.h>
+
+namespace {
+
+constexpr std::uint32_t kOpaqueBlack = 0xFF000000u;
+constexpr std::uint32_t kAlphaMask = 0xFF000000u;
+constexpr std::uint32_t kLongestPngSide = 8192;
+
+// The beginning of every PNG file: signature, length and name of the first chunk, then width and height.
+constexpr std::array<unsigned char, 16> kPngStart = {0x89, 'P', 'N', 'G', '\r', '\n', 0x1A, '\n',
+                                                     0,    0,   0,   13,  'I',  'H',  'D',  'R'};
+constexpr std::size_t kPngSizeBytes = 8;
+
+struct CairoSurfaceFree {
+    void operator()(cairo_surface_t *surface) const { cairo_surface_destroy(surface); }
+};
+typedef std::unique_ptr<cairo_surface_t, CairoSurfaceFree> CairoSurfaceHolder;
+
+std::uint32_t BigEndian(unsigned char const *bytes) {
+    return static_cast<std::uint32_t>(bytes[0]) << 24 | static_cast<std::uint32_t>(bytes[1]) << 16 |
+           static_cast<std::uint32_t>(bytes[2]) << 8 | bytes[3];
+}
+
+// Looks at the file's first bytes alone: a small file may claim a size that would take gigabytes to decode.
+bool PngSizeIsSane(std::string const &path, std::string &error) {
+    std::ifstream file(path, std::ios::binary);
+    if (!file) {
+        error = path + ": cannot be opened";
+        return false;
+    }
+    std::array<unsigned char, kPngStart.size() + kPngSizeBytes> start = {};
+    file.read(reinterpret_cast<char *>(start.data()), static_cast<std::streamsize>(start.size()));
+    if (!file || !std::equal(kPngStart.begin(), kPngStart.end(), start.begin())) {
+        error = path + ": not a PNG file";
+        return false;
+    }
+    std::uint32_t width = BigEndian(start.data() + kPngStart.size());
+    std::uint32_t height = BigEndian(start.data() + kPngStart.size() + 4);
+    if (width == 0 || height == 0 || width > kLongestPngSide || height > kLongestPngSide) {
+        error = path + ": a picture of " + std::to_string(width) + " x " + std::to_string(height) +
+                " pixels; each side may have 1 to " + std::to_string(kLongestPngSide);
+        return false;
+    }
+    return true;
+}
+
+}
+
+Surface::Surface(int width_, int height_)
+    : width(std::max(width_, 1)), height(std::max(height_, 1)),
+      pixels(static_cast<std::size_t>(width) * static_cast<std::size_t>(height), kOpaqueBlack),
+      image(pixman_image_create_bits_no_clear(PIXMAN_a8r8g8b8, width, height, pixels.data(),
+                                              width * static_cast<int>(sizeof(std::uint32_t)))),
+      cairo(nullptr) {
+    if (!image)
+        throw std::bad_alloc();
+}
+
+Surface::~Surface() {
+    if (cairo) {
+        cairo_surface_finish(cairo); // a context that outlives this object must not reach the pixels any more
+        cairo_surface_destroy(cairo);
+    }
+    pixman_image_unref(image);
+}
+
+cairo_surface_t *Surface::CairoSurface() {
+    if (!cairo)
+        cairo = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(pixels.data()),
+                                                    CAIRO_FORMAT_ARGB32, width, height,
+                                                    width * static_cast<int>(sizeof(std::uint32_t)));
+    return cairo;
+}
+
+bool Surface::IsOpaque() const {
+    return std::all_of(pixels.begin(), pixels.end(),
+                       [](std::uint32_t pixel) { return (pixel & kAlphaMask) == kAlphaMask; });
+}
+
+bool Surface::WritePng(std::string const &path, std::string &error) const {
+    // Cairo only reads from the surface while it writes the file.
+    unsigned char *data = reinterpret_cast<unsigned char *>(const_cast<std::uint32_t *>(pixels.data()));
+    CairoSurfaceHolder view(cairo_image_surface_create_for_data(
+        data, IsOpaque() ? CAIRO_FORMAT_RGB24 : CAIRO_FORMAT_ARGB32, width, height,
+        width * static_cast<int>(sizeof(std::uint32_t))));
+    cairo_status_t status = cairo_surface_write_to_png(view.get(), path.c_str());
+    if (status != CAIRO_STATUS_SUCCESS)
+        error = path + ": " + cairo_status_to_string(status);
+    return status == CAIRO_STATUS_SUCCESS;
+}
+
+std::unique_ptr<Surface> Surface::ReadPng(std::string const &path, std::string &error) {
+    if (!PngSizeIsSane(path, error))
+        return nullptr;
+    CairoSurfaceHolder read(cairo_image_surface_create_from_png(path.c_str()));
+    cairo_status_t status = cairo_surface_status(read.get());
+    if (status != CAIRO_STATUS_SUCCESS) {
+        error = path + ": " + cairo_status_to_string(status);
+        return nullptr;
+    }
+    cairo_format_t format = cairo_image_surface_get_format(read.get());
+    if (format != CAIRO_FORMAT_ARGB32 && format != CAIRO_FORMAT_RGB24) {
+        error = path + ": a kind of PNG file that is not supported";
+        return nullptr;
+    }
+    cairo_surface_flush(read.get());
+    std::unique_ptr<Surface> surface(new Surface(cairo_image_surface_get_width(read.get()),
+                                                 cairo_image_surface_get_height(read.get())));
+    unsigned char const *from = cairo_image_surface_get_data(read.get());
+    std::uint32_t const missingAlpha = format == CAIRO_FORMAT_RGB24 ? kAlphaMask : 0;
+    for (int y = 0; y < surface->Height(); ++y, from += cairo_image_surface_get_stride(read.get())) {
+        std::uint32_t *row = surface->Row(y);
+        std::memcpy(row, from, static_cast<std::size_t>(surface->Width()) * sizeof *row);
+        for (int x = 0; x < surface->Width(); ++x)
+            row[x] |= missingAlpha;
+    }
+    return surface;
+}
