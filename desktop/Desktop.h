@@ -5,6 +5,7 @@
 #include <string>
 #include <vector>
 
+class DesktopRep;
 class GlogStyleSheet;
 class WindowSystem;
 struct glogRec;
@@ -81,8 +82,6 @@ protected:
     Desktop(DesktopOptions const &, std::unique_ptr<WindowSystem>);
 
 private:
-    struct Rep;
-    std::unique_ptr<Rep> rep;
-    friend struct Rep;
-    friend class EventLoop;
+    friend class DesktopRep;
+    std::unique_ptr<DesktopRep> rep;
 };

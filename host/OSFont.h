@@ -1,6 +1,8 @@
 // Fonts: families, the application's font table, and the measures of the port's font.
 #pragma once
 
+class FontFamilies;
+
 namespace OS {
 namespace Font {
 
@@ -22,13 +24,15 @@ public:
     unsigned int GetOrderedFontID() const;
 
 private:
+    friend class ::FontFamilies;
     struct Rep;
     Rep *rep;
 };
 } // namespace Font
 } // namespace OS
 
-// One font: family, face (0 plain, 1 bold, 32 condensed; the values add up) and size in logical pixels.
+// One font: family, face (0 plain, 1 bold, 2 italic, 4 underlined, 32
+// condensed; the values add up) and size in logical pixels.
 struct fontSaveRec {
     OS::Font::FamilyID family;
     short face;

@@ -152,12 +152,6 @@ OS::RGBAColor DrawingPort::Ink() const {
     return state.darken != 0 ? OS::RGBAColor(0, 0, 0, state.darken / kPercent) : state.fore;
 }
 
-void DrawingPort::FillClip(OS::RGBAColor const &color) {
-    PixelScope pixels(*this);
-    if (pixels.CanDraw())
-        pixels.Cover(color);
-}
-
 void DrawingPort::Damage(Rect const &local) {
     Rect window = LocalToWindow(local);
     if (VelaDrawing::SectRect(&window, &extent, &window))

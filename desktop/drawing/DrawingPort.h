@@ -106,9 +106,6 @@ public:
     // The device pixels that have been drawn on since the last call, and so have to be shown: a few boxes that cover them.
     std::vector<DeviceRect> TakeTouched() { return touched.Take(); }
 
-    // Fills the whole clip with the colour; no call of the contract, so that no trace tells of it.
-    void FillClip(OS::RGBAColor const &);
-
     Rect LocalToWindow(Rect const &) const; // saturates at the ends of 16 bits
     Rect WindowToLocal(Rect const &) const;
 

@@ -5,6 +5,7 @@
 #include "desktop/drawing/DeviceScale.h"
 #include "host/Geometry.h"
 
+class PlatformWindow;
 class Surface;
 
 struct WindowSpec {

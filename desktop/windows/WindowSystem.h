@@ -25,6 +25,9 @@ public:
     // simulated system throws ScriptError, naming `what`, when a modal wait could never end.
     virtual bool WaitEvent(InputEvent &, double timeout, Waiter, char const *what) = 0;
 
+    // No event will ever come; a real window system never knows that.
+    virtual bool AtEnd() const { return false; }
+
     virtual double Now() const = 0; // seconds, never backwards
     virtual bool IsMouseDown() const = 0;            // primary button, as of the last event taken
     virtual bool IsKeyPressed(int keyCode) const = 0; // as of the last event taken
@@ -33,6 +36,8 @@ public:
     virtual Point MousePlace(PlatformWindow const &) const = 0;
     virtual void CaptureMouse(PlatformWindow *) = 0; // null ends the capture
 
+    // The scale of all windows from now on, instead of their displays'.
+    virtual void ForceScale(double factor) = 0;
     virtual void SetCursor(int cursor) = 0; // resource number, or one of Cursors
     virtual std::string GetClipboardText() = 0; // UTF-8
     virtual void SetClipboardText(std::string const &utf8) = 0;

@@ -1,0 +1,211 @@
+#include "host/GlogLayout.h"
+#include <algorithm>
+#include "desktop/layout/LayoutEngine.h"
+#include "desktop/resources/Utf.h"
+#include "host/GlogPane.h"
+#include "host/GlogStyleSheet.h"
+
+namespace {
+
+// The keys of an item's "Layout" container, and the attribute that each sets.
+struct LayoutKey {
+    char const *key;
+    GlogLayoutItem::Attribute attribute;
+};
+LayoutKey const kLayoutKeys[] = {
+    {"InsetTop", GlogLayoutItem::kInsetTop},       {"InsetLeft", GlogLayoutItem::kInsetLeft},
+    {"InsetBottom", GlogLayoutItem::kInsetBottom}, {"InsetRight", GlogLayoutItem::kInsetRight},
+    {"Width", GlogLayoutItem::kWidth},             {"Height", GlogLayoutItem::kHeight},
+    {"GrowWidth", GlogLayoutItem::kGrowWidth},     {"GrowHeight", GlogLayoutItem::kGrowHeight},
+    {"Alignment", GlogLayoutItem::kAlignment},     {"MinWidth", GlogLayoutItem::kMinWidth},
+    {"MinHeight", GlogLayoutItem::kMinHeight},
+};
+
+UString Key(char const *ascii) { return UString(ascii, UString::ByteEncoding(1)); }
+
+Rect MovedTo(Rect const &inner, Rect const &outer) {
+    return {static_cast<short>(outer.top + inner.top), static_cast<short>(outer.left + inner.left),
+            static_cast<short>(outer.top + inner.bottom), static_cast<short>(outer.left + inner.right)};
+}
+
+int *FieldOf(GlogLayoutItem::Attribute attribute, GlogLayoutItem::Rep &rep) {
+    switch (attribute) {
+    case GlogLayoutItem::kInsetTop:
+        return &rep.insetTop;
+    case GlogLayoutItem::kInsetLeft:
+        return &rep.insetLeft;
+    case GlogLayoutItem::kInsetBottom:
+        return &rep.insetBottom;
+    case GlogLayoutItem::kInsetRight:
+        return &rep.insetRight;
+    case GlogLayoutItem::kWidth:
+        return &rep.width;
+    case GlogLayoutItem::kHeight:
+        return &rep.height;
+    case GlogLayoutItem::kGrowWidth:
+        return &rep.growWidth;
+    case GlogLayoutItem::kGrowHeight:
+        return &rep.growHeight;
+    case GlogLayoutItem::kAlignment:
+        return &rep.alignment;
+    case GlogLayoutItem::kMinWidth:
+        return &rep.minWidth;
+    case GlogLayoutItem::kMinHeight:
+        return &rep.minHeight;
+    case GlogLayoutItem::kSpacing:
+        return &rep.spacing;
+    case GlogLayoutItem::kDirection:
+        break; // a word, see SetAttributeFromString
+    }
+    return nullptr;
+}
+
+}
+
+GlogLayoutItem::GlogLayoutItem() : rep(new Rep) {}
+
+GlogLayoutItem::~GlogLayoutItem() {
+    for (RCPtr<GlogLayoutItem> const &child : rep->children)
+        child->rep->parent = nullptr;
+    delete rep;
+}
+
+void GlogLayoutItem::SetAttribute(Attribute attribute, int value, CoordinateType, UString const &) {
+    int *field = FieldOf(attribute, *rep);
+    int bounded = std::clamp(value, -32768, 32767);
+    if (!field || *field == bounded)
+        return;
+    if ((attribute == kGrowWidth || attribute == kGrowHeight) && bounded < 0)
+        bounded = 0;
+    *field = bounded;
+    LayoutEngine::Invalidate(*this);
+}
+
+void GlogLayoutItem::SetAttributeFromString(Attribute attribute, UString const &word) {
+    if (attribute != kDirection)
+        return;
+    bool vertical = !(word == Key("horiz"));
+    if (vertical == rep->vertical)
+        return;
+    rep->vertical = vertical;
+    LayoutEngine::Invalidate(*this);
+}
+
+Rect GlogLayoutItem::GetBorderRect() {
+    LayoutEngine::SettleFor(*this);
+    if (rep->isPart && rep->pane && rep->pane->IsInLayout()) {
+        // A part keeps its place in its pane: it moves with the pane's rectangle.
+        Rect const pane = rep->pane->GetLayoutRect()->GetBorderRect();
+        Rect const made = LayoutEngine::Rep(*rep->pane->GetLayoutRect()).made;
+        return {static_cast<short>(rep->made.top + pane.top - made.top),
+                static_cast<short>(rep->made.left + pane.left - made.left),
+                static_cast<short>(rep->made.bottom + pane.top - made.top),
+                static_cast<short>(rep->made.right + pane.left - made.left)};
+    }
+    return rep->hasPlace ? rep->place : rep->made;
+}
+
+char const *GlogLayoutItem::GetName() const { return rep->name.c_str(); }
+
+Rect GlogLayoutRectItem::GetItemRect() {
+    Rect border = GetBorderRect();
+    GlogLayoutItem::Rep const &own = LayoutEngine::Rep(*this);
+    return own.hasInner ? MovedTo(own.inner, border) : border;
+}
+
+void GlogLayoutRectItem::ReadLayoutProperties(int, GlogStyleSheet *sheet) {
+    if (!sheet || !sheet->GetItemRes())
+        return;
+    boost::shared_ptr<XMLLib::ContainerItem> layout = sheet->GetContainerItem(Key("Layout"));
+    if (!layout)
+        return;
+    for (LayoutKey const &known : kLayoutKeys)
+        if (layout->GetSInt32Item(Key(known.key)))
+            SetAttribute(known.attribute,
+                         static_cast<int>(std::clamp(layout->GetSIntItemValue(Key(known.key)), -32768LL, 32767LL)),
+                         kPixels, UString());
+}
+
+GlogLayoutGroup::GlogLayoutGroup(bool vertical) {
+    LayoutEngine::Rep(*this).isGroup = true;
+    LayoutEngine::Rep(*this).vertical = vertical;
+}
+
+void GlogLayoutGroup::MoveItem(RCPtr<GlogLayoutItem> const &item, int index) {
+    if (item.get() && item.get() != this)
+        LayoutEngine::Append(*this, item, index);
+}
+
+void GlogLayoutGroup::ReplaceItem(RCPtr<GlogLayoutItem> const &old, RCPtr<GlogLayoutItem> const &item) {
+    auto &children = LayoutEngine::Rep(*this).children;
+    for (std::size_t i = 0; i < children.size(); ++i) {
+        if (children[i].get() != old.get())
+            continue;
+        RCPtr<GlogLayoutItem> replaced = children[i]; // the parameter may be the very entry
+        RCPtr<GlogLayoutItem> added = item;
+        LayoutEngine::TakeOut(*replaced);
+        if (added.get())
+            LayoutEngine::Append(*this, added, static_cast<int>(i));
+        return;
+    }
+}
+
+RCPtr<GlogLayoutItem> GlogLayoutGroup::FindItemByID(int id) {
+    for (RCPtr<GlogLayoutItem> const &child : LayoutEngine::Rep(*this).children) {
+        GlogLayoutItem::Rep const &rep = LayoutEngine::Rep(*child);
+        if (rep.id == id || (rep.pane && !rep.isPart && rep.pane->GetID() == id))
+            return child;
+        if (GlogLayoutGroup *group = dynamic_cast<GlogLayoutGroup *>(child.get())) {
+            RCPtr<GlogLayoutItem> found = group->FindItemByID(id);
+            if (found.get())
+                return found;
+        }
+    }
+    return RCPtr<GlogLayoutItem>();
+}
+
+RCPtr<GlogLayoutItem> GlogLayoutGroup::FindItemByName(char const *name) {
+    for (RCPtr<GlogLayoutItem> const &child : LayoutEngine::Rep(*this).children) {
+        if (LayoutEngine::Rep(*child).name == name)
+            return child;
+        if (GlogLayoutGroup *group = dynamic_cast<GlogLayoutGroup *>(child.get())) {
+            RCPtr<GlogLayoutItem> found = group->FindItemByName(name);
+            if (found.get())
+                return found;
+        }
+    }
+    return RCPtr<GlogLayoutItem>();
+}
+
+GlogStyleSheet *GlogLayoutGroup::GetStyleSheet() const {
+    return LayoutEngine::Rep(const_cast<GlogLayoutGroup &>(*this)).styleSheet;
+}
+
+void GlogLayoutGroup::SetStyleSheet(GlogStyleSheet *sheet) { LayoutEngine::Rep(*this).styleSheet = sheet; }
+
+RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect place, int id, int index, char const *name) {
+    RCPtr<GlogLayoutRectItem> item(new GlogLayoutRectItem);
+    GlogLayoutItem::Rep &rep = LayoutEngine::Rep(*item);
+    rep.made = place;
+    rep.id = id;
+    rep.index = index;
+    rep.name = name ? name : "";
+    return item;
+}
+
+RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect inner, Rect outer, int id, int index, char const *name) {
+    RCPtr<GlogLayoutRectItem> item = MakeRectItem(outer, id, index, name);
+    LayoutEngine::Rep(*item).inner = inner;
+    LayoutEngine::Rep(*item).hasInner = true;
+    return item;
+}
+
+WithPerformLayoutRectUpdate::WithPerformLayoutRectUpdate(GlogPane *pane_) : pane(pane_) {
+    if (pane->GetGlog())
+        LayoutEngine::Settle(pane->GetGlog());
+}
+
+WithPerformLayoutRectUpdate::~WithPerformLayoutRectUpdate() {
+    if (pane->GetGlog())
+        LayoutEngine::Settle(pane->GetGlog());
+}

@@ -1,0 +1,38 @@
+// Settles the places of all panes that are in a layout.
+#pragma once
+#include "desktop/layout/LayoutItemRep.h"
+#include "host/Geometry.h"
+
+class CompoundPane;
+class GlogPane;
+struct glogRec;
+
+// Sizes are settled bottom up, places top down. Lazy: a change only marks the glog; Settle does the work, before the next drawing or
+// the next question for a place.
+class LayoutEngine {
+public:
+    static GlogLayoutItem::Rep &Rep(GlogLayoutItem &item) { return *item.rep; }
+    static void Settle(glogRec *);
+    static void Invalidate(GlogLayoutItem &); // what the item lies in must be settled anew
+    static void SettleFor(GlogLayoutItem &);  // before its place is told
+
+    static RCPtr<GlogLayoutRectItem> MakeForPane(GlogPane *);
+    static RCPtr<GlogLayoutGroup> MakeForContainer(CompoundPane *);
+    static void Append(GlogLayoutGroup &, RCPtr<GlogLayoutItem> const &, int index);
+    static void TakeOut(GlogLayoutItem &);
+    static void PaneGone(GlogLayoutItem &); // also for the parts of the pane
+
+    // Natural size without insets, width and height.
+    struct Extent {
+        int width, height;
+    };
+    static Extent Measure(GlogLayoutItem &);
+    static void Place(GlogLayoutItem &, Rect const &);
+
+private:
+    static Extent MeasureGroup(GlogLayoutItem::Rep &);
+    static Extent MeasurePane(GlogLayoutItem::Rep &);
+    static void PlaceGroup(GlogLayoutItem::Rep &);
+    static void SettleContainer(CompoundPane &);
+    static void SettleInside(GlogPane &);
+};

@@ -1,0 +1,42 @@
+#include "desktop/observe/MessageTrace.h"
+#include <cstdlib>
+#include <cxxabi.h>
+#include <utility>
+#include "host/GlogPane.h"
+#include "host/Services.h"
+
+namespace {
+MessageTrace::Sink theSink;
+}
+
+bool MessageTrace::on = false;
+
+void MessageTrace::SetSink(Sink sink) {
+    theSink = std::move(sink);
+    on = static_cast<bool>(theSink);
+}
+
+JsonLine MessageTrace::Begin() {
+    JsonLine line;
+    line.Number("time", TarnSystemTime::GetCurrentEventTime());
+    return line;
+}
+
+JsonLine MessageTrace::Begin(GlogPane &pane) {
+    JsonLine line = Begin();
+    line.Text("pane", ClassName(pane)).Integer("id", pane.GetID());
+    return line;
+}
+
+void MessageTrace::Write(JsonLine const &line) {
+    if (theSink)
+        theSink(line.Finish());
+}
+
+std::string MessageTrace::ClassName(GlogPane &pane) {
+    int status = 0;
+    char *name = abi::__cxa_demangle(typeid(pane).name(), nullptr, nullptr, &status);
+    std::string result = status == 0 ? name : typeid(pane).name();
+    std::free(name);
+    return result;
+}

@@ -1,0 +1,23 @@
+// Every message between panes and the rest, as it happens.
+#pragma once
+#include <functional>
+#include <string>
+#include "desktop/observe/JsonLine.h"
+
+class GlogPane;
+
+// While a sink stands, each message hands it one line such as
+// {"time":0.125,"pane":"CheckBoxPane","id":3,"message":"ButtonValueChanged","index":1,"value":true}.
+class MessageTrace {
+public:
+    typedef std::function<void(std::string const &line)> Sink;
+    static void SetSink(Sink); // an empty function ends the trace
+    static bool On() { return on; }
+    static JsonLine Begin();           // with the time
+    static JsonLine Begin(GlogPane &); // with time, class and number of the pane
+    static void Write(JsonLine const &);
+    static std::string ClassName(GlogPane &);
+
+private:
+    static bool on;
+};

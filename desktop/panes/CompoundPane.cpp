@@ -1,0 +1,287 @@
+#include "host/CompoundPane.h"
+#include <algorithm>
+#include "desktop/drawing/Region.h"
+#include "desktop/layout/LayoutEngine.h"
+#include "desktop/panes/Glog.h"
+#include "desktop/panes/PaneAccess.h"
+#include "desktop/panes/PaneEvents.h"
+#include "host/VelaDrawing.h"
+
+namespace {
+
+// The content's coordinates of a point in the container's own.
+Point ToContent(CompoundPane &pane, Point p) {
+    pane.LocalOffset(&p);
+    return p;
+}
+
+// Calls an operation on every subpane. The list may change meanwhile: what was removed is not called, what was added may be.
+template <class Operation> void ForEach(std::vector<GlogPane *> const &subpanes, Operation operation) {
+    std::vector<GlogPane *> const snapshot = subpanes;
+    for (GlogPane *pane : snapshot)
+        if (std::find(subpanes.begin(), subpanes.end(), pane) != subpanes.end())
+            operation(*pane);
+}
+
+GlogPane *TopmostAt(std::vector<GlogPane *> const &subpanes, Point p) {
+    for (auto i = subpanes.rbegin(); i != subpanes.rend(); ++i)
+        if (PaneAccess::OwnVisibility(**i) && (*i)->Contains(p))
+            return *i;
+    return nullptr;
+}
+
+}
+
+CompoundPane::CompoundPane() : usesLayout(false), compoundRep(new CompoundRep) {}
+
+CompoundPane::~CompoundPane() {
+    // A subpane's destructor takes it out of the list.
+    while (!compoundRep->subpanes.empty())
+        delete compoundRep->subpanes.back();
+    if (compoundRep->layout.get())
+        LayoutEngine::PaneGone(*compoundRep->layout);
+    delete compoundRep;
+}
+
+CompoundPane *CompoundPane::CompoundPaneInit(glogRec *glog_, short id) {
+    if (!GlogPaneInit(glog_, id))
+        return nullptr;
+    compoundRep->layout = LayoutEngine::MakeForContainer(this);
+    return this;
+}
+
+// Subpanes
+
+GlogPane *CompoundPane::Get(short index) const {
+    return index >= 0 && index < NumSubpanes() ? compoundRep->subpanes[static_cast<std::size_t>(index)] : nullptr;
+}
+
+short CompoundPane::Find(GlogPane *pane) {
+    auto found = std::find(compoundRep->subpanes.begin(), compoundRep->subpanes.end(), pane);
+    return found == compoundRep->subpanes.end() ? short(-1) : static_cast<short>(found - compoundRep->subpanes.begin());
+}
+
+short CompoundPane::NumSubpanes() const { return static_cast<short>(compoundRep->subpanes.size()); }
+
+short CompoundPane::Add(GlogPane *pane, short position) {
+    short const index = AddGuts(pane, position);
+    if (index < 0)
+        return index;
+    pane->SetContainer(this);
+    if (GetLayout().get() && pane->GetLayoutRect().get())
+        LayoutEngine::Append(*GetLayout(), pane->GetLayoutRect(), index);
+    pane->ContainmentChanged();
+    pane->PanePositionChanged();
+    pane->SetActive();
+    pane->Inval();
+    return index;
+}
+
+short CompoundPane::AddGuts(GlogPane *pane, short position) {
+    if (!pane || pane == this || NumSubpanes() == 32767)
+        return -1;
+    if (PaneAccess::Container(*pane))
+        PaneAccess::TakeOut(*pane);
+    else if (pane->GetGlog())
+        Glog::From(pane->GetGlog()).RemoveItem(pane);
+    // Set before the pane is one of the list, so that its destructor would find it.
+    PaneAccess::SetContainerField(*pane, this);
+    if (pane->GetGlog() != glog)
+        PaneAccess::Adopt(*pane, glog);
+    auto &list = compoundRep->subpanes;
+    auto place = position < 0 || position > NumSubpanes() ? list.end() : list.begin() + position;
+    return static_cast<short>(list.insert(place, pane) - list.begin());
+}
+
+void CompoundPane::Del(short index) {
+    if (GlogPane *pane = Get(index))
+        pane->Inval();
+    DelGuts(index, false);
+}
+
+void CompoundPane::DelGuts(short index, bool keep) {
+    GlogPane *pane = Get(index);
+    if (!pane)
+        return;
+    if (!keep) {
+        delete pane;
+        return;
+    }
+    compoundRep->subpanes.erase(compoundRep->subpanes.begin() + index);
+    if (pane->GetLayoutRect().get())
+        LayoutEngine::TakeOut(*pane->GetLayoutRect());
+    PaneAccess::SetContainerField(*pane, nullptr);
+}
+
+GlogPane *CompoundPane::FindByID(int id) {
+    if (GetID() == id)
+        return this;
+    for (GlogPane *pane : compoundRep->subpanes)
+        if (GlogPane *found = pane->FindByID(id))
+            return found;
+    return nullptr;
+}
+
+bool CompoundPane::FindGophers(GopherInfo &info) {
+    for (GlogPane *pane : compoundRep->subpanes)
+        if (pane->FindGophers(info))
+            return true;
+    return false;
+}
+
+// State that the subpanes share
+
+void CompoundPane::Activate() {
+    GlogPane::Activate();
+    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.Activate(); });
+}
+
+void CompoundPane::Deactivate() {
+    GlogPane::Deactivate();
+    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.Deactivate(); });
+}
+
+void CompoundPane::SetActive() {
+    GlogPane::SetActive();
+    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.SetActive(); });
+}
+
+void CompoundPane::ContainmentChanged() {
+    GlogPane::ContainmentChanged();
+    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.ContainmentChanged(); });
+}
+
+void CompoundPane::PanePositionChanged() {
+    GlogPane::PanePositionChanged();
+    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.PanePositionChanged(); });
+}
+
+void CompoundPane::SetVisibility(unsigned char visible) {
+    bool const before = PaneAccess::OwnVisibility(*this);
+    GlogPane::SetVisibility(visible);
+    if (before != PaneAccess::OwnVisibility(*this))
+        ContainerChangedVisibility();
+}
+
+void CompoundPane::ContainerChangedVisibility() {
+    GlogPane::ContainerChangedVisibility();
+    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.ContainerChangedVisibility(); });
+}
+
+void CompoundPane::SelectSubpanes(char select) {
+    ForEach(compoundRep->subpanes, [=](GlogPane &pane) { pane.Select(select != 0); });
+}
+
+// Bounds and layout
+
+char CompoundPane::Contains(Point p) { return GlogPane::Contains(p); }
+
+void CompoundPane::GetBox(Rect *out) { GlogPane::GetBox(out); }
+
+char CompoundPane::Intersects(Rect *r, char mode) { return GlogPane::Intersects(r, mode); }
+
+void CompoundPane::AutoResize(short dh, short dv) {
+    GlogPane::AutoResize(dh, dv);
+    ForEach(compoundRep->subpanes, [=](GlogPane &pane) { pane.AutoResize(dh, dv); });
+}
+
+RCPtr<GlogLayoutGroup> CompoundPane::GetLayout() { return compoundRep->layout; }
+
+void CompoundPane::SetUseLayout(bool use) {
+    if (use == usesLayout)
+        return;
+    usesLayout = use;
+    LayoutIsNowInvalid();
+}
+
+void CompoundPane::SetSizeToLayout(bool on) {
+    if (on == compoundRep->sizesToLayout)
+        return;
+    compoundRep->sizesToLayout = on;
+    LayoutIsNowInvalid();
+}
+
+bool CompoundPane::HasFrame() const { return compoundRep->hasFrame; }
+
+void CompoundPane::UpdateLayoutRect() { GlogPane::UpdateLayoutRect(); }
+
+// The places of the subpanes follow the box.
+bool CompoundPane::CanUpdateLayoutRect() const { return usesLayout; }
+
+bool CompoundPane::DoesLayoutNeedToBeUpdated() const { return usesLayout && GlogPane::DoesLayoutNeedToBeUpdated(); }
+
+void CompoundPane::LayoutIsNowInvalid() { GlogPane::LayoutIsNowInvalid(); }
+
+void CompoundPane::SetLayoutRectHook() { GlogPane::SetLayoutRectHook(); }
+
+// Drawing
+
+void CompoundPane::SetNoErase(char on) { compoundRep->noErase = on != 0; }
+
+void CompoundPane::Erase() { GlogPane::Erase(); }
+
+void CompoundPane::DrawBackgroundGuts(OSRgn *) {}
+
+void CompoundPane::DrawFrame(Rect *r) { VelaDrawing::FrameRect(r); }
+
+void CompoundPane::Flush() {
+    if (glog)
+        UpdateGlog(glog);
+}
+
+void CompoundPane::DrawGuts(OSRgn *region) {
+    if (!compoundRep->noErase) {
+        Rect const box = GetDrawRectangle();
+        VelaDrawing::EraseRect(&box);
+    }
+    DrawBackgroundGuts(region);
+    if (compoundRep->subpanes.empty())
+        return;
+    Point const shift = ToContent(*this, {0, 0});
+    OSRgn content;
+    if (region) {
+        content = *region;
+        Region::Translate(content, shift.h, shift.v);
+    }
+    ForEach(compoundRep->subpanes, [&](GlogPane &pane) { PaneAccess::Draw(pane, region ? &content : nullptr); });
+}
+
+// Input
+
+int CompoundPane::HandleClick(EventRecordAdapter *event) {
+    EventRecordAdapter inside = *event;
+    inside.where = ToContent(*this, event->where);
+    GlogPane *pane = TopmostAt(compoundRep->subpanes, inside.where);
+    return pane ? PaneEvents::Click(*pane, inside) : 0;
+}
+
+int CompoundPane::HandleSecondaryButtonClick(EventRecordAdapter *event) {
+    EventRecordAdapter inside = *event;
+    inside.where = ToContent(*this, event->where);
+    GlogPane *pane = TopmostAt(compoundRep->subpanes, inside.where);
+    return pane ? PaneEvents::SecondaryClick(*pane, inside) : 0;
+}
+
+bool CompoundPane::DispatchCustomEvent(UIEvent *event) {
+    PointedEvent *pointed = dynamic_cast<PointedEvent *>(event);
+    std::vector<GlogPane *> const snapshot = compoundRep->subpanes;
+    for (auto i = snapshot.rbegin(); i != snapshot.rend(); ++i) {
+        if (std::find(compoundRep->subpanes.begin(), compoundRep->subpanes.end(), *i) == compoundRep->subpanes.end())
+            continue;
+        if (!PaneAccess::OwnVisibility(**i) || (pointed && !pointed->LiesIn(**i)))
+            continue;
+        if ((*i)->DispatchCustomEvent(event))
+            return true;
+    }
+    return GlogPane::DispatchCustomEvent(event);
+}
+
+char CompoundPane::DispatchCursor(Point p) {
+    if (!Contains(p))
+        return 0;
+    Point const inside = ToContent(*this, p);
+    if (GlogPane *pane = TopmostAt(compoundRep->subpanes, inside))
+        if (pane->DispatchCursor(inside))
+            return 1;
+    return GlogPane::DispatchCursor(p);
+}

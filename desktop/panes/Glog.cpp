@@ -1,0 +1,410 @@
+#include "desktop/panes/Glog.h"
+#include <algorithm>
+#include "desktop/drawing/Region.h"
+#include "desktop/drawing/ThemeColors.h"
+#include "desktop/layout/LayoutEngine.h"
+#include "desktop/panes/DesktopRep.h"
+#include "desktop/panes/PaneAccess.h"
+#include "desktop/panes/PaneEvents.h"
+#include "desktop/resources/Utf.h"
+#include "desktop/windows/HelpTagWindow.h"
+#include "host/CompoundPane.h"
+#include "host/NamedColors.h"
+
+namespace {
+
+int const kMaxSide = 16000;
+
+// Kinds of a classic event record.
+unsigned short const kMouseDownEvent = 1;
+unsigned short const kKeyDownEvent = 3;
+unsigned short const kAutoKeyEvent = 5;
+double const kTicksPerSecond = 60.0;
+
+unsigned int Ticks(double seconds) { return static_cast<unsigned int>(seconds * kTicksPerSecond + 0.5); }
+
+OS::RGBAColor ToRGBA(RGBColor const &c) {
+    return OS::RGBAColor(c.red / 65535.0, c.green / 65535.0, c.blue / 65535.0, 1.0);
+}
+
+short Coordinate16(int value) { return static_cast<short>(std::clamp(value, -32768, 32767)); }
+
+Point InWindow(InputEvent const &event) { return {Coordinate16(event.v), Coordinate16(event.h)}; }
+
+EventRecordAdapter RecordOf(InputEvent const &event, unsigned short what) {
+    EventRecordAdapter record;
+    record.what = what;
+    record.when = Ticks(event.time);
+    record.where = InWindow(event);
+    record.modifiers = event.modifiers;
+    return record;
+}
+
+// The low byte is the character where there is one, else the key; the next sixteen bits are the key's code.
+unsigned long long KeyMessage(InputEvent const &event) {
+    std::u16string_view const units = Utf::View(event.text);
+    unsigned long long character = static_cast<unsigned long long>(event.key) & 0xFF;
+    if (units.size() == 1 && units[0] < 0x80)
+        character = units[0];
+    return character | static_cast<unsigned long long>(event.key) << 8;
+}
+
+}
+
+Glog::Glog(Desktop &desktop_, GlogOptions const &options_)
+    : desktop(desktop_), options(options_), width(std::clamp(options_.width, 1, kMaxSide)),
+      height(std::clamp(options_.height, 1, kMaxSide)) {
+    port.SetExtent(width, height);
+    port.SetScreenPlace([this] { return window ? window->ScreenPlace() : Point{0, 0}; });
+    DamageAll();
+}
+
+Glog::~Glog() {
+    current = nullptr;
+    while (!items.empty())
+        delete items.back();
+    if (DrawingPort::CurrentPort() == &port)
+        DrawingPort::MakeCurrent(nullptr);
+    if (EventLoop *loop = EventLoop::Open())
+        loop->WindowGone(window.get());
+}
+
+RGBColor Glog::GetContentColor() { return kWindowBackgroundColor; }
+
+// Panes
+
+void Glog::AddItem(GlogPane *pane) { items.push_back(pane); }
+
+void Glog::RemoveItem(GlogPane *pane) { items.erase(std::remove(items.begin(), items.end(), pane), items.end()); }
+
+void Glog::PaneGone(GlogPane *pane) {
+    if (current == pane)
+        current = nullptr;
+    if (EventLoop *loop = EventLoop::Open())
+        loop->HelpTags().Hide();
+}
+
+bool Glog::DescribedBox(int id, Rect &box) const {
+    auto found = described.find(id);
+    if (found == described.end())
+        return false;
+    box = found->second;
+    return true;
+}
+
+void Glog::StartPanes() {
+    started = true;
+    LayoutEngine::Settle(this);
+    for (std::size_t i = 0; i < items.size(); ++i)
+        PaneAccess::Start(*items[i]);
+}
+
+void Glog::SetCurItem(GlogPane *pane) {
+    GlogPane *const former = current;
+    if (former && former != pane && former->IsSelected())
+        former->Select(false);
+    current = pane;
+    if (pane && !pane->IsSelected())
+        pane->Select(true);
+}
+
+void Glog::NoteHit(int item) {
+    if (hitNoted)
+        return;
+    hitNoted = true;
+    hitItem = item;
+}
+
+// Window
+
+void Glog::SetMinSize(int w, int h) {
+    minWidth = std::clamp(w, 0, kMaxSide);
+    minHeight = std::clamp(h, 0, kMaxSide);
+    if (window)
+        window->SetSizeLimits(minWidth, minHeight, maxWidth, maxHeight);
+}
+
+void Glog::SetMaxSize(int w, int h) {
+    maxWidth = std::clamp(w, 0, kMaxSide);
+    maxHeight = std::clamp(h, 0, kMaxSide);
+    if (window)
+        window->SetSizeLimits(minWidth, minHeight, maxWidth, maxHeight);
+}
+
+void Glog::MakeSurface() {
+    port.SetSurface(nullptr, scale);
+    surface.reset(new Surface(scale.Edge(width), scale.Edge(height)));
+    port.SetSurface(surface.get(), scale);
+    port.SetExtent(width, height);
+    DamageAll();
+}
+
+void Glog::Show() {
+    if (shown || disposed)
+        return;
+    if (!started)
+        StartPanes();
+    DesktopRep &rep = DesktopRep::Of(desktop);
+    if (!window) {
+        WindowSpec spec;
+        spec.title = options.title;
+        spec.width = width;
+        spec.height = height;
+        spec.resizable = options.growable;
+        spec.placed = placed;
+        spec.h = screenPlace.left;
+        spec.v = screenPlace.top;
+        window = rep.windows->CreateWindow(spec);
+        window->SetSizeLimits(minWidth, minHeight, maxWidth, maxHeight);
+        scale = DeviceScale(window->Scale());
+        MakeSurface();
+    }
+    shown = true;
+    rep.CameToFront(this);
+    Update();
+    window->Show();
+}
+
+void Glog::Hide() {
+    if (!shown)
+        return;
+    shown = false;
+    if (EventLoop *loop = EventLoop::Open())
+        loop->HelpTags().OwnerGone(window.get());
+    window->Hide();
+    if (active)
+        Activation(false);
+}
+
+void Glog::Place(Rect const &screen) {
+    screenPlace = screen;
+    placed = true;
+    int const w = std::clamp(screen.right - screen.left, 1, kMaxSide);
+    int const h = std::clamp(screen.bottom - screen.top, 1, kMaxSide);
+    if (window) {
+        window->SetPlace(screen.left, screen.top);
+        if (w != width || h != height)
+            window->SetContentSize(w, h);
+    }
+    Resized(w, h);
+}
+
+void Glog::Resized(int w, int h) {
+    w = std::clamp(w, 1, kMaxSide);
+    h = std::clamp(h, 1, kMaxSide);
+    if (w == width && h == height)
+        return;
+    Point const delta{Coordinate16(h - height), Coordinate16(w - width)};
+    width = w;
+    height = h;
+    if (surface)
+        MakeSurface();
+    port.SetExtent(width, height);
+    std::vector<GlogPane *> const snapshot = items;
+    for (GlogPane *pane : snapshot)
+        if (std::find(items.begin(), items.end(), pane) != items.end())
+            pane->Resize(delta);
+    DamageAll();
+}
+
+void Glog::SetScale(DeviceScale scale_) {
+    if (scale_.Factor() == scale.Factor())
+        return;
+    scale = scale_;
+    if (surface)
+        MakeSurface();
+}
+
+// Drawing
+
+void Glog::DamageAll() {
+    DamageWindowRect({0, 0, Coordinate16(height), Coordinate16(width)});
+}
+
+void Glog::DamageWindowRect(Rect const &r) {
+    OSRgn region(r);
+    port.DamageWindow(region);
+}
+
+void Glog::Update() {
+    if (!shown || !surface || updateRegion)
+        return;
+    LayoutEngine::Settle(this);
+    std::vector<DeviceRect> shownBoxes = port.TakeTouched();
+    OSRgn region = port.TakeDamage();
+    Region::IntersectRect(region, port.Extent());
+    if (!Region::IsEmpty(region)) {
+        DrawDamage(region);
+        port.TakeTouched(); // lies within the region
+        for (Rect const &r : Region::Rects(region))
+            shownBoxes.push_back(scale.ToDevice(r.left, r.top, r.right, r.bottom));
+    }
+    if (!shownBoxes.empty())
+        Present(shownBoxes);
+}
+
+void Glog::DrawDamage(OSRgn const &region) {
+    // The region is the glog's for the time of the update, also when a pane throws.
+    struct Updating {
+        Updating(Glog &glog_, OSRgn const &region_) : glog(glog_), current(DrawingPort::CurrentPort()) {
+            glog.updateRegion = &region_;
+        }
+        ~Updating() {
+            glog.updateRegion = nullptr;
+            DrawingPort::MakeCurrent(current);
+        }
+        Glog &glog;
+        DrawingPort *current;
+    };
+    int const originH = port.OriginH(), originV = port.OriginV();
+    OSRgn const boundary = port.Boundary();
+    ClipState const clip = port.GetClipState();
+    GraphicsState const state = port.State();
+    {
+        Updating updating(*this, region);
+        port.SetOrigin(0, 0);
+        port.SetBoundary(region);
+        port.FillClip(ToRGBA(GetContentColor()));
+        OSRgn local(region);
+        std::vector<GlogPane *> const snapshot = items;
+        for (GlogPane *pane : snapshot)
+            if (std::find(items.begin(), items.end(), pane) != items.end())
+                PaneAccess::Draw(*pane, &local);
+    }
+    port.SetOrigin(originH, originV);
+    port.SetBoundary(boundary);
+    port.SetClipState(clip);
+    port.State() = state;
+}
+
+void Glog::Present(std::vector<DeviceRect> const &rects) { window->Present(*surface, rects.data(), rects.size()); }
+
+void Glog::PresentAll() {
+    if (shown && surface)
+        Present({{0, 0, surface->Width(), surface->Height()}});
+}
+
+// Events
+
+GlogPane *Glog::TopmostAt(Point p) const {
+    for (auto i = items.rbegin(); i != items.rend(); ++i)
+        if (PaneAccess::OwnVisibility(**i) && (*i)->Contains(p))
+            return *i;
+    return nullptr;
+}
+
+void Glog::ReportHit(int value) {
+    Desktop::HitHandler const handler = DesktopRep::Of(desktop).hitHandler;
+    if (handler)
+        handler(this, hitItem, value);
+}
+
+void Glog::Click(InputEvent const &event) {
+    EventRecordAdapter record = RecordOf(event, kMouseDownEvent);
+    GlogPane *const pane = TopmostAt(record.where);
+    if (current && current != pane && current->GetVisibility()) {
+        Point const origin = PaneAccess::Origin(*current);
+        Point const inside{Coordinate16(record.where.v - origin.v), Coordinate16(record.where.h - origin.h)};
+        if (!current->Contains(inside))
+            PaneAccess::ConfirmChanges(*current);
+    }
+    // The confirmation can have changed everything.
+    if (!pane || std::find(items.begin(), items.end(), pane) == items.end())
+        return;
+    hitNoted = false;
+    int const value = event.button == 1   ? PaneEvents::Click(*pane, record)
+                      : event.button == 2 ? PaneEvents::SecondaryClick(*pane, record)
+                                          : 0;
+    if (disposed)
+        return;
+    if (value == 0 && event.button == 1 && std::find(items.begin(), items.end(), pane) != items.end())
+        pane->TryMouseControl(record.where);
+    if (value > 0)
+        ReportHit(value);
+}
+
+bool Glog::DispatchKey(EventRecordAdapter &record, InputEvent const &event) {
+    if (event.key == KeyCodes::kTab && !(event.modifiers & (Modifiers::kCommand | Modifiers::kControl | Modifiers::kOption)))
+        return OfferTab(event.modifiers & Modifiers::kShift ? -1 : 1);
+    if (!current)
+        return false;
+    GlogPane *const pane = current;
+    int const id = pane->GetID();
+    int const value = PaneEvents::Key(*pane, record);
+    if (value == 2 && !disposed) {
+        hitItem = id;
+        ReportHit(value);
+    }
+    return value != 0;
+}
+
+void Glog::KeyDown(InputEvent const &event) {
+    EventRecordAdapter record = RecordOf(event, event.repeat ? kAutoKeyEvent : kKeyDownEvent);
+    record.message = KeyMessage(event);
+    DispatchKey(record, event);
+}
+
+void Glog::TabOrder(GlogPane &pane, std::vector<GlogPane *> &order) const {
+    if (!PaneAccess::OwnVisibility(pane))
+        return;
+    order.push_back(&pane);
+    if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
+        for (short i = 0; i < container->NumSubpanes(); ++i)
+            TabOrder(*container->Get(i), order);
+}
+
+bool Glog::OfferTab(char direction) {
+    std::vector<GlogPane *> order;
+    for (GlogPane *pane : items)
+        TabOrder(*pane, order);
+    if (direction < 0)
+        std::reverse(order.begin(), order.end());
+    std::size_t first = 0;
+    if (current) {
+        if (PaneEvents::Tab(*current, direction) != 1)
+            return true;
+        auto found = std::find(order.begin(), order.end(), current);
+        first = found == order.end() ? 0 : static_cast<std::size_t>(found - order.begin()) + 1;
+    }
+    for (std::size_t i = 0; i < order.size(); ++i) {
+        GlogPane *const pane = order[(first + i) % order.size()];
+        if (PaneEvents::Tab(*pane, direction) == 0)
+            return true;
+    }
+    return false;
+}
+
+void Glog::Wheel(InputEvent const &event) {
+    struct Axis {
+        double delta;
+        int number;
+    };
+    for (Axis axis : {Axis{event.wheelH, 0}, Axis{event.wheelV, 1}}) {
+        if (axis.delta == 0)
+            continue;
+        WheelEvent wheel(InWindow(event), static_cast<float>(axis.delta), axis.number);
+        if (GlogPane *pane = TopmostAt(InWindow(event)))
+            pane->DispatchCustomEvent(&wheel);
+    }
+}
+
+void Glog::PointerMoved(Point p) {
+    GlogPane *const pane = TopmostAt(p);
+    if (!pane || !pane->DispatchCursor(p))
+        DesktopRep::Of(desktop).windows->SetCursor(Cursors::kArrow);
+    EventLoop::Instance().HelpTags().PointerAt(*this, p);
+}
+
+void Glog::PointerLeft() { EventLoop::Instance().HelpTags().Hide(); }
+
+void Glog::Activation(bool on) {
+    if (on == active)
+        return;
+    active = on;
+    if (on)
+        DesktopRep::Of(desktop).CameToFront(this);
+    std::vector<GlogPane *> const snapshot = items;
+    for (GlogPane *pane : snapshot)
+        if (std::find(items.begin(), items.end(), pane) != items.end())
+            pane->SetActive();
+}

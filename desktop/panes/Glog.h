@@ -1,0 +1,115 @@
+// A window with panes in it.
+#pragma once
+#include <map>
+#include <memory>
+#include <string>
+#include <vector>
+#include "desktop/Desktop.h"
+#include "desktop/drawing/DrawingPort.h"
+#include "desktop/drawing/Surface.h"
+#include "desktop/windows/InputEvent.h"
+#include "desktop/windows/PlatformWindow.h"
+#include "host/GlogStyleSheet.h"
+#include "host/glogRec.h"
+
+class EventRecordAdapter;
+class UIEvent;
+
+// The host's glogRec: owns its panes, its pixels and its window. Made by Desktop::NewGlog.
+class Glog : public glogRec {
+public:
+    Glog(Desktop &, GlogOptions const &);
+    virtual ~Glog();
+    static Glog &From(glogRec *record) { return *static_cast<Glog *>(record); }
+
+    // OSWindow and glogRec
+    OSPort *GetPort() override { return &port; }
+    bool IsVisible() override { return shown; }
+    RGBColor GetContentColor() override;
+    GlogStyleSheet *GetStyleSheet() const override { return options.styleSheet.get(); }
+    void SetCurItem(GlogPane *) override;
+    GlogPane *GetCurItem() const override { return current; }
+    void SetMinSize(int width, int height) override;
+    void SetMaxSize(int width, int height) override;
+    bool IsContained() override { return false; }
+    bool DidActivateWithCurrentMouseDown() const override { return activatedByMouseDown; }
+
+    // Panes
+    std::vector<GlogPane *> const &Items() const { return items; }
+    void AddItem(GlogPane *);          // at the top level; the glog owns it
+    void RemoveItem(GlogPane *);       // the caller owns it
+    void PaneGone(GlogPane *);         // forgets every mention of the pane
+    void MakeCurrent(GlogPane *pane) { current = pane; } // without messages
+    // Gives the place of an item that is still to be made.
+    void DescribeItem(int id, Rect const &box) { described[id] = box; }
+    bool DescribedBox(int id, Rect &box) const;
+    void StartPanes();
+    // A pane of that number answered a click with something; the innermost one comes first and counts.
+    void NoteHit(int item);
+
+    // Window
+    void Show();
+    void Hide();
+    void Place(Rect const &screen);
+    PlatformWindow *Window() const { return window.get(); }
+    Surface *Pixels() const { return surface.get(); }
+    DrawingPort &Port() { return port; }
+    int Width() const { return width; }
+    int Height() const { return height; }
+    bool IsActive() const { return active; }
+    GlogOptions const &Options() const { return options; }
+
+    // Drawing
+    // Redraws what is damaged and presents it, and what was drawn outside an update too.
+    void Update();
+    void DamageAll();
+    void DamageWindowRect(Rect const &);
+    OSRgn const *UpdateRegion() const { return updateRegion; } // in window coordinates; null outside an update
+    void PresentAll();
+    void SetScale(DeviceScale);
+
+    // Events; positions in window coordinates
+    void Click(InputEvent const &);
+    void KeyDown(InputEvent const &);
+    void Wheel(InputEvent const &);
+    void PointerMoved(Point);
+    void PointerLeft();
+    void Activation(bool on);
+    void Resized(int width, int height);
+    void SetActivatedByMouseDown(bool on) { activatedByMouseDown = on; }
+    GlogPane *TopmostAt(Point) const;
+
+    bool layoutInvalid = false;
+    bool settlingLayout = false;
+    bool disposed = false; // waits to be deleted when nothing runs in it any more
+
+private:
+    void DrawDamage(OSRgn const &);
+    void Present(std::vector<DeviceRect> const &);
+    void MakeSurface();
+    void ReportHit(int value);
+    bool OfferTab(char direction);
+    void TabOrder(GlogPane &, std::vector<GlogPane *> &) const;
+    bool DispatchKey(EventRecordAdapter &, InputEvent const &);
+
+    Desktop &desktop;
+    GlogOptions options;
+    int width, height;
+    int minWidth = 0, minHeight = 0, maxWidth = 0, maxHeight = 0;
+    std::vector<GlogPane *> items;
+    std::map<int, Rect> described;
+    GlogPane *current = nullptr;
+    int hitItem = 0;
+    bool hitNoted = false;
+    std::unique_ptr<PlatformWindow> window;
+    std::unique_ptr<Surface> surface;
+    DeviceScale scale;
+    DrawingPort port;
+    OSRgn const *updateRegion = nullptr;
+    bool started = false;
+    bool shown = false;
+    bool active = false;
+    bool activatedByMouseDown = false;
+    bool placed = false;
+    Rect screenPlace{0, 0, 0, 0};
+};

@@ -1,0 +1,117 @@
+#include "desktop/panes/PaneAccess.h"
+#include <algorithm>
+#include "desktop/drawing/Region.h"
+#include "desktop/layout/LayoutEngine.h"
+#include "desktop/panes/Glog.h"
+
+namespace {
+
+Rect Moved(Rect const &r, Point by) {
+    auto add = [](short a, short b) { return static_cast<short>(std::clamp(a + b, -32768, 32767)); };
+    return {add(r.top, by.v), add(r.left, by.h), add(r.bottom, by.v), add(r.right, by.h)};
+}
+
+Rect Common(Rect const &a, Rect const &b) {
+    Rect const r{std::max(a.top, b.top), std::max(a.left, b.left), std::min(a.bottom, b.bottom),
+                 std::min(a.right, b.right)};
+    return r.bottom <= r.top || r.right <= r.left ? Rect{0, 0, 0, 0} : r;
+}
+
+// Puts back what a pane's drawing may leave changed, also when it throws.
+class PortKeeper {
+public:
+    explicit PortKeeper(DrawingPort &port_)
+        : port(port_), current(DrawingPort::CurrentPort()), h(port.OriginH()), v(port.OriginV()),
+          boundary(port.Boundary()), clip(port.GetClipState()), state(port.State()) {}
+    ~PortKeeper() {
+        DrawingPort::MakeCurrent(current);
+        port.SetOrigin(h, v);
+        port.SetBoundary(boundary);
+        port.SetClipState(clip);
+        port.State() = state;
+    }
+    PortKeeper(PortKeeper const &) = delete;
+    PortKeeper &operator=(PortKeeper const &) = delete;
+
+private:
+    DrawingPort &port;
+    DrawingPort *current;
+    int h, v;
+    OSRgn boundary;
+    ClipState clip;
+    GraphicsState state;
+};
+
+}
+
+Point PaneAccess::Origin(GlogPane &pane) {
+    Point origin{0, 0};
+    pane.GlogOffset(&origin);
+    return origin;
+}
+
+Rect PaneAccess::VisiblePart(GlogPane &pane) {
+    Rect part = Moved(pane.GetDrawRectangle(), Origin(pane));
+    for (CompoundPane *c = pane.container; c && part.right > part.left; c = c->container)
+        part = Common(part, Moved(c->GetDrawRectangle(), Origin(*c)));
+    return Common(part, Glog::From(pane.glog).Port().Extent());
+}
+
+void PaneAccess::Draw(GlogPane &pane, OSRgn *region) {
+    if (!pane.rep->visible || !pane.glog)
+        return;
+    Rect const reach = pane.GetDrawRectangle();
+    if (region && !Region::Touches(*region, reach))
+        return;
+    Glog &glog = Glog::From(pane.glog);
+    PortKeeper keeper(glog.Port());
+    GraphicsState plain;
+    RGBColor const ground = glog.GetContentColor();
+    plain.back = OS::RGBAColor(ground.red / 65535.0, ground.green / 65535.0, ground.blue / 65535.0, 1.0);
+    glog.Port().State() = plain;
+    pane.Prepare();
+    pane.DrawGuts(region);
+}
+
+void PaneAccess::MoveTo(GlogPane &pane, Rect const &box) {
+    pane.Inval();
+    Rect target = box;
+    pane.SetBox(&target);
+    pane.Inval();
+}
+
+void PaneAccess::PlacedByLayout(GlogPane &pane) {
+    Rect const place = LayoutEngine::Rep(*pane.rep->layoutItem).place;
+    Rect const &old = pane.rep->box;
+    if (old.top == place.top && old.left == place.left && old.bottom == place.bottom && old.right == place.right)
+        return;
+    Glog &glog = Glog::From(pane.glog);
+    // While the engine works the layout's rectangle is new already; the box still tells where the pane was drawn.
+    if (pane.GetVisibility())
+        glog.DamageWindowRect(Moved(old, Origin(pane)));
+    pane.UpdateLayoutRect();
+    pane.Inval();
+}
+
+void PaneAccess::TakeOut(GlogPane &pane) {
+    auto &siblings = pane.container->compoundRep->subpanes;
+    siblings.erase(std::remove(siblings.begin(), siblings.end(), &pane), siblings.end());
+}
+
+void PaneAccess::Adopt(GlogPane &pane, glogRec *glog) {
+    pane.glog = glog;
+    if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
+        for (GlogPane *inside : container->compoundRep->subpanes)
+            Adopt(*inside, glog);
+}
+
+void PaneAccess::Start(GlogPane &pane) {
+    if (!pane.rep->started) {
+        pane.rep->started = true;
+        pane.PanePositionChanged();
+        pane.GlogItemInit();
+    }
+    if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
+        for (short i = 0; i < container->NumSubpanes(); ++i)
+            Start(*container->Get(i));
+}

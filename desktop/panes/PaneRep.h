@@ -1,0 +1,27 @@
+// The host's own fields of a pane.
+#pragma once
+#include <memory>
+#include <vector>
+#include "host/CompoundPane.h"
+#include "host/GlogPane.h"
+
+struct GlogPane::Rep {
+    int id = 0;
+    Rect box{0, 0, 0, 0};
+    bool visible = true; // the pane's own flag
+    bool active = false;
+    bool selected = false;
+    bool started = false; // GlogItemInit was called
+    RCPtr<GlogLayoutRectItem> layoutItem;
+    bool subItemMode = false;
+    std::vector<RCPtr<GlogLayoutRectItem>> subItems;
+    std::unique_ptr<HelpTagHelper> help;
+};
+
+struct CompoundPane::CompoundRep {
+    std::vector<GlogPane *> subpanes; // owned, from the bottom to the top
+    RCPtr<GlogLayoutGroup> layout;
+    bool sizesToLayout = false;
+    bool noErase = false;
+    bool hasFrame = false;
+};

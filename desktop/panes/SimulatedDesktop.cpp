@@ -1,0 +1,102 @@
+#include "desktop/SimulatedDesktop.h"
+#include <cmath>
+#include <fstream>
+#include "desktop/panes/DesktopRep.h"
+#include "desktop/panes/Glog.h"
+#include "desktop/windows/SimulatedWindowSystem.h"
+
+namespace {
+
+SimulatedWindowSystem &SystemOf(Desktop const &desktop) {
+    return static_cast<SimulatedWindowSystem &>(const_cast<Desktop &>(desktop).Windows());
+}
+
+SimulatedWindow *WindowOf(glogRec *glog) { return static_cast<SimulatedWindow *>(Glog::From(glog).Window()); }
+
+void WriteDump(Desktop &desktop, glogRec *glog, ScriptStep const &step) {
+    std::ofstream file(step.text, std::ios::binary);
+    file << desktop.DumpTree(glog);
+    if (!file.flush())
+        throw ScriptError(step.source + ": cannot write " + step.text);
+}
+
+void CarryOut(Desktop &desktop, ScriptStep const &step, PlatformWindow *window) {
+    glogRec *const glog = DesktopRep::Of(desktop).GlogOf(window);
+    if (!glog)
+        throw ScriptError(step.source + ": there is no window");
+    switch (step.kind) {
+    case ScriptStep::kSnapshot:
+        try {
+            desktop.Snapshot(glog, step.text);
+        } catch (std::runtime_error const &error) {
+            throw ScriptError(step.source + ": " + error.what());
+        }
+        break;
+    case ScriptStep::kDump:
+        WriteDump(desktop, glog, step);
+        break;
+    case ScriptStep::kMenu:
+        throw ScriptError(step.source + ": no menu is open that could be answered");
+    case ScriptStep::kPrint:
+        throw ScriptError(step.source + ": nothing in the window prints");
+    default:
+        break;
+    }
+}
+
+}
+
+SimulatedDesktop::SimulatedDesktop(DesktopOptions const &options)
+    : Desktop(options, std::unique_ptr<WindowSystem>(new SimulatedWindowSystem(options.scale))) {
+    SystemOf(*this).SetCommandHandler(
+        [this](ScriptStep const &step, PlatformWindow *window) { CarryOut(*this, step, window); });
+}
+
+SimulatedDesktop::~SimulatedDesktop() {}
+
+void SimulatedDesktop::Script(std::string const &steps, std::string const &name) {
+    SystemOf(*this).Append(EventScript::Parse(steps, name));
+}
+
+void SimulatedDesktop::Play(std::string const &steps) {
+    Script(steps);
+    Run();
+}
+
+double SimulatedDesktop::Now() const { return SystemOf(*this).Now(); }
+
+std::vector<std::string> SimulatedDesktop::TakeMessages() {
+    if (!recordsMessages)
+        WatchMessages([this](std::string const &line) { messages.push_back(line); });
+    recordsMessages = true;
+    std::vector<std::string> taken;
+    taken.swap(messages);
+    return taken;
+}
+
+std::vector<std::string> SimulatedDesktop::TakeDrawing() {
+    if (!recordsDrawing)
+        WatchDrawing([this](std::string const &line) { drawing.push_back(line); });
+    recordsDrawing = true;
+    std::vector<std::string> taken;
+    taken.swap(drawing);
+    return taken;
+}
+
+Surface const *SimulatedDesktop::Picture(glogRec *glog) const {
+    SimulatedWindow *window = WindowOf(glog);
+    return window ? window->Picture() : nullptr;
+}
+
+std::vector<Rect> SimulatedDesktop::TakePresented(glogRec *glog) {
+    std::vector<Rect> taken;
+    SimulatedWindow *window = WindowOf(glog);
+    if (!window)
+        return taken;
+    double const scale = window->Scale();
+    auto floor = [=](int device) { return static_cast<short>(std::floor(device / scale)); };
+    auto ceil = [=](int device) { return static_cast<short>(std::ceil(device / scale)); };
+    for (DeviceRect const &r : window->TakePresented())
+        taken.push_back({floor(r.top), floor(r.left), ceil(r.bottom), ceil(r.right)});
+    return taken;
+}

@@ -1,0 +1,67 @@
+// The fonts that text is shaped with.
+#pragma once
+#include <string>
+#include <unordered_map>
+#include <vector>
+#include "desktop/type/FontSpec.h"
+#include "desktop/type/FontTable.h"
+
+typedef struct _FcConfig FcConfig;
+typedef struct _PangoContext PangoContext;
+typedef struct _PangoFontDescription PangoFontDescription;
+typedef struct _PangoFontMap PangoFontMap;
+
+// Whole logical pixels, the same at every scale.
+struct FontMetrics {
+    int ascent;   // above the baseline
+    int descent;  // below it
+    int maxWidth; // of the widest character
+    int LineHeight() const { return ascent + descent; }
+};
+
+// One for the process. It knows the font files of the font table alone, so that text looks the same on every machine and is there
+// at once; a face's files are opened when the face is first used. When a text has characters that they lack, the system's fonts are
+// added behind them.
+class FontLibrary {
+public:
+    static FontLibrary &Instance();
+
+    // Shapes text; grayscale, glyphs on whole logical pixels.
+    PangoContext *Context();
+    // Valid until Generation changes.
+    PangoFontDescription const *Description(FontSpec const &);
+    FontMetrics const &Metrics(FontSpec const &);
+
+    // Adds the system's fonts; false when they had been added before.
+    bool AddSystemFonts();
+    // Grows whenever text that was shaped before may look different if shaped again. Call it before using what was kept.
+    unsigned int Generation();
+
+private:
+    struct Font;
+
+    FontLibrary();
+    ~FontLibrary();
+    FontLibrary(FontLibrary const &) = delete;
+    FontLibrary &operator=(FontLibrary const &) = delete;
+
+    void Refresh();
+    void Open();
+    void Close();
+    void LoadFace(int faceBits);
+    Font &Find(FontSpec const &);
+
+    std::vector<FontFile> files;
+    unsigned int loadedFaces = 0; // bit n: the files of face n are loaded
+    bool anyFile = false;
+    bool systemFonts = false;
+    FcConfig *config = nullptr;
+    PangoFontMap *map = nullptr;
+    PangoContext *context = nullptr;
+    unsigned int resourceGeneration = 0;
+    unsigned int generation = 0;
+    struct SpecHash {
+        std::size_t operator()(FontSpec const &) const;
+    };
+    std::unordered_map<FontSpec, Font, SpecHash> fonts;
+};

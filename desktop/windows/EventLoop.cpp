@@ -1,0 +1,300 @@
+#include "desktop/windows/EventLoop.h"
+#include <algorithm>
+#include "desktop/Desktop.h"
+#include "desktop/panes/DesktopRep.h"
+#include "desktop/panes/Glog.h"
+#include "desktop/windows/HelpTagWindow.h"
+
+namespace {
+
+EventLoop *theLoop = nullptr;
+
+// An activation so soon before a press came from that press.
+double const kActivatingPressWindow = 0.25;
+
+// Counts the loops and handlers on the stack, also when they are left by an exception.
+class Nesting {
+public:
+    explicit Nesting(int &depth_) : depth(depth_) { ++depth; }
+    ~Nesting() { --depth; }
+    Nesting(Nesting const &) = delete;
+    Nesting &operator=(Nesting const &) = delete;
+
+private:
+    int &depth;
+};
+
+}
+
+EventLoop::EventLoop(Desktop &desktop_, WindowSystem &windows_)
+    : desktop(desktop_), windows(windows_), helpTags(new HelpTagWindow(windows_)) {
+    theLoop = this;
+}
+
+EventLoop::~EventLoop() { theLoop = nullptr; }
+
+EventLoop &EventLoop::Instance() { return *theLoop; }
+
+EventLoop *EventLoop::Open() { return theLoop; }
+
+void EventLoop::Quit(int status_) {
+    quitting = true;
+    status = status_;
+}
+
+double EventLoop::LastEventTime() const { return windows.Now(); }
+
+bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter waiter, char const *what) {
+    for (;;) {
+        double const now = windows.Now();
+        chores.Run(now);
+        helpTags->Tick(now);
+        DesktopRep::Of(desktop).UpdateAll();
+        if (waiter == WindowSystem::Waiter::kMainLoop && deadline < 0 && windows.AtEnd())
+            return false;
+        double limit = deadline < 0 ? -1 : std::max(0.0, deadline - now);
+        for (double next : {chores.UntilNext(now), helpTags->UntilNext(now)})
+            if (next >= 0 && (limit < 0 || next < limit))
+                limit = next;
+        if (windows.WaitEvent(event, limit, waiter, what))
+            return true;
+        if (quitting || (deadline >= 0 && windows.Now() >= deadline))
+            return false;
+    }
+}
+
+bool EventLoop::Run(double seconds) {
+    double const deadline = seconds < 0 ? -1 : windows.Now() + seconds;
+    while (!quitting) {
+        InputEvent event;
+        if (!deferred.empty()) {
+            event = deferred.front();
+            deferred.pop_front();
+        } else if (!Take(event, deadline, WindowSystem::Waiter::kMainLoop, "the main loop")) {
+            break;
+        }
+        {
+            Nesting nesting(depth);
+            Handle(event);
+        }
+        if (depth == 0) {
+            DesktopRep::Of(desktop).DeleteDisposed();
+            if (!DesktopRep::Of(desktop).AnyVisible())
+                break;
+        }
+        if (deadline >= 0 && deferred.empty() && windows.Now() > deadline)
+            break;
+    }
+    return !quitting && DesktopRep::Of(desktop).AnyVisible();
+}
+
+void EventLoop::Handle(InputEvent const &event) {
+    if (HandleWindowEvent(event))
+        return;
+    Glog *glog = DesktopRep::Of(desktop).GlogOf(event.window);
+    switch (event.kind) {
+    case InputEvent::kMouseUp:
+        if (event.button == 1)
+            ReleasePointer();
+        break;
+    case InputEvent::kQuit:
+        Quit(0);
+        break;
+    default:
+        break;
+    }
+    if (!glog || glog->disposed)
+        return;
+    switch (event.kind) {
+    case InputEvent::kMouseDown:
+        HandlePress(*glog, event);
+        break;
+    case InputEvent::kMouseMove:
+        glog->PointerMoved({static_cast<short>(event.v), static_cast<short>(event.h)});
+        break;
+    case InputEvent::kMouseLeave:
+        glog->PointerLeft();
+        break;
+    case InputEvent::kWheel:
+        helpTags->Hide();
+        glog->Wheel(event);
+        break;
+    case InputEvent::kKeyDown:
+    case InputEvent::kTextInput:
+        helpTags->Hide();
+        glog->KeyDown(event);
+        break;
+    case InputEvent::kCloseRequested:
+        DisposeGlog(glog);
+        break;
+    default:
+        break;
+    }
+}
+
+// What concerns the window itself is handled at once, in nested loops too.
+bool EventLoop::HandleWindowEvent(InputEvent const &event) {
+    Glog *glog = DesktopRep::Of(desktop).GlogOf(event.window);
+    switch (event.kind) {
+    case InputEvent::kResized:
+        if (glog)
+            glog->Resized(event.width, event.height);
+        return true;
+    case InputEvent::kExposed:
+        if (glog)
+            glog->PresentAll();
+        else
+            helpTags->Exposed(event.window);
+        return true;
+    case InputEvent::kActivated:
+        activatedAt = event.time;
+        activatedWindow = event.window;
+        if (glog)
+            glog->Activation(true);
+        return true;
+    case InputEvent::kDeactivated:
+        helpTags->Hide();
+        if (glog)
+            glog->Activation(false);
+        if (event.window == heldWindow) {
+            InputEvent release = event;
+            release.kind = InputEvent::kMouseUp;
+            release.button = 1;
+            release.h = lastPoint.h;
+            release.v = lastPoint.v;
+            pointer.push_back(release);
+        }
+        return true;
+    case InputEvent::kScaleChanged:
+        if (glog)
+            glog->SetScale(DeviceScale(event.scale));
+        return true;
+    case InputEvent::kMoved:
+        helpTags->Hide();
+        return true;
+    default:
+        return false;
+    }
+}
+
+void EventLoop::HandlePress(Glog &glog, InputEvent const &event) {
+    helpTags->Hide();
+    glog.SetActivatedByMouseDown(event.window == activatedWindow && event.time - activatedAt < kActivatingPressWindow);
+    activatedAt = -1000;
+    lastPressClicks = event.clicks;
+    if (event.button == 1) {
+        heldWindow = event.window;
+        lastPoint = {static_cast<short>(event.v), static_cast<short>(event.h)};
+        pointer.clear();
+        windows.CaptureMouse(event.window);
+    }
+    glog.Click(event);
+    glog.SetActivatedByMouseDown(false);
+    // What a pane left of the drag, the release before all, is the main loop's.
+    deferred.insert(deferred.begin(), pointer.begin(), pointer.end());
+    pointer.clear();
+}
+
+void EventLoop::ReleasePointer() {
+    if (!heldWindow)
+        return;
+    heldWindow = nullptr;
+    windows.CaptureMouse(nullptr);
+}
+
+void EventLoop::WindowGone(PlatformWindow *window) {
+    auto isGone = [=](InputEvent const &event) { return event.window == window; };
+    deferred.erase(std::remove_if(deferred.begin(), deferred.end(), isGone), deferred.end());
+    pointer.erase(std::remove_if(pointer.begin(), pointer.end(), isGone), pointer.end());
+    if (heldWindow == window)
+        ReleasePointer();
+    if (activatedWindow == window)
+        activatedWindow = nullptr;
+    helpTags->OwnerGone(window);
+}
+
+PlatformWindow *EventLoop::WindowOf(DrawingPort &port) const {
+    for (Glog *glog : DesktopRep::Of(desktop).Glogs())
+        if (&glog->Port() == &port)
+            return glog->Window();
+    return nullptr;
+}
+
+// Nested loops
+
+void EventLoop::Sort(InputEvent const &event) {
+    if (HandleWindowEvent(event))
+        return;
+    bool const drags = event.kind == InputEvent::kMouseMove || (event.kind == InputEvent::kMouseUp && event.button == 1);
+    if (heldWindow && drags)
+        pointer.push_back(event);
+    else if (event.kind != InputEvent::kMouseMove && event.kind != InputEvent::kMouseLeave)
+        deferred.push_back(event);
+}
+
+bool EventLoop::NextDragPoint(double limit, Point &where, double &when, bool &timedOut) {
+    timedOut = false;
+    double const deadline = limit < 0 ? -1 : windows.Now() + limit;
+    Nesting nesting(depth);
+    while (heldWindow) {
+        if (pointer.empty()) {
+            InputEvent event;
+            if (Take(event, deadline, WindowSystem::Waiter::kTracking, "a drag with the mouse")) {
+                Sort(event);
+                continue;
+            }
+            if (quitting)
+                break;
+            timedOut = true;
+            where = lastPoint;
+            when = windows.Now();
+            return true;
+        }
+        InputEvent const event = pointer.front();
+        Point const place{static_cast<short>(event.v), static_cast<short>(event.h)};
+        bool const moved = place.v != lastPoint.v || place.h != lastPoint.h;
+        // A release elsewhere than the last point tells of a movement first.
+        if (event.kind == InputEvent::kMouseMove || !moved)
+            pointer.pop_front();
+        when = event.time;
+        lastPoint = place;
+        if (moved) {
+            where = place;
+            return true;
+        }
+        if (event.kind == InputEvent::kMouseUp) {
+            ReleasePointer();
+            return false;
+        }
+    }
+    ReleasePointer();
+    return false;
+}
+
+bool EventLoop::ButtonStillDown() {
+    if (!heldWindow)
+        return false;
+    Nesting nesting(depth);
+    InputEvent event;
+    while (Take(event, windows.Now(), WindowSystem::Waiter::kPause, "the state of the mouse button"))
+        Sort(event);
+    return heldWindow && std::none_of(pointer.begin(), pointer.end(),
+                                      [](InputEvent const &e) { return e.kind == InputEvent::kMouseUp; });
+}
+
+void EventLoop::Pause(double seconds) {
+    double const deadline = windows.Now() + std::max(0.0, seconds);
+    Nesting nesting(depth);
+    InputEvent event;
+    while (!quitting && Take(event, deadline, WindowSystem::Waiter::kPause, "a pause"))
+        Sort(event);
+}
+
+void EventLoop::PauseUntilKeyUp(int key) {
+    Nesting nesting(depth);
+    InputEvent event;
+    while (!quitting && windows.IsKeyPressed(key) &&
+           Take(event, -1, WindowSystem::Waiter::kTracking, "the release of a key"))
+        if (event.kind != InputEvent::kKeyUp)
+            Sort(event);
+}

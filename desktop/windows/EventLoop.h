@@ -1,0 +1,75 @@
+// Takes events from the window system and gives them to glogs.
+#pragma once
+#include <deque>
+#include <memory>
+#include <vector>
+#include "desktop/windows/IdleChores.h"
+#include "desktop/windows/InputEvent.h"
+#include "desktop/windows/WindowSystem.h"
+#include "host/MouseTask.h"
+
+class Desktop;
+class DrawingPort;
+class Glog;
+class HelpTagWindow;
+
+// One for the life of the desktop. The main loop and every nested one wait here: a wait blocks on the window system's queue, keeps
+// all windows drawn, and runs the chores that come due. Events that a nested loop has no use for wait for the main loop.
+class EventLoop {
+public:
+    EventLoop(Desktop &, WindowSystem &);
+    ~EventLoop();
+    static EventLoop &Instance(); // of the open desktop
+    static EventLoop *Open();     // null without one
+
+    // Handles events until `seconds` have passed (negative: until the loop is told to quit). False once it was.
+    bool Run(double seconds);
+    void Quit(int status);
+    void Restart() { quitting = false; }
+    bool IsQuitting() const { return quitting; }
+    int Status() const { return status; }
+
+    // Tracking. Points are in the window of the press, in window coordinates.
+    bool IsTracking() const { return heldWindow != nullptr; }
+    // Blocks until the pointer has moved or the button is up; true while it is down. A negative limit is none.
+    bool NextDragPoint(double limit, Point &where, double &when, bool &timedOut);
+    bool ButtonStillDown();
+    PlatformWindow *WindowOf(DrawingPort &) const; // null for a port without window
+
+    void Pause(double seconds);
+    void PauseUntilKeyUp(int key);
+
+    double LastEventTime() const;
+    bool LastPressWasDouble() const { return lastPressClicks == 2; }
+    bool HandlingEvents() const { return depth > 0; }
+    void WindowGone(PlatformWindow *);
+
+    WindowSystem &Windows() { return windows; }
+    IdleChores &Chores() { return chores; }
+    HelpTagWindow &HelpTags() { return *helpTags; }
+
+private:
+    // Takes one event, or none when the time is over. Draws what is damaged before it blocks.
+    bool Take(InputEvent &, double deadline, WindowSystem::Waiter, char const *what);
+    // In a nested loop: window events are handled, pointer events go to `pointer`, everything else waits for the main loop.
+    void Sort(InputEvent const &);
+    bool HandleWindowEvent(InputEvent const &);
+    void Handle(InputEvent const &);
+    void HandlePress(Glog &, InputEvent const &);
+    void ReleasePointer();
+
+    Desktop &desktop;
+    WindowSystem &windows;
+    IdleChores chores;
+    std::unique_ptr<HelpTagWindow> helpTags;
+    std::deque<InputEvent> deferred; // for the main loop
+    std::deque<InputEvent> pointer;  // for tracking
+    PlatformWindow *heldWindow = nullptr;
+    Point lastPoint{0, 0};
+    double activatedAt = -1000;
+    PlatformWindow *activatedWindow = nullptr;
+    int lastPressClicks = 0;
+    int depth = 0;
+    bool quitting = false;
+    int status = 0;
+};

@@ -1,0 +1,25 @@
+// The chores that run when nothing else does.
+#pragma once
+#include <vector>
+
+class CIdleChore;
+
+// All assigned chores and when they are due.
+class IdleChores {
+public:
+    void Assign(CIdleChore *, double now);
+    void Cancel(CIdleChore *);
+    // Runs what is due: chores without interval at each call, the others when their time has come. A chore may cancel itself or others.
+    void Run(double now);
+    // Seconds until the next chore with an interval; negative when there is none.
+    double UntilNext(double now) const;
+    bool Empty() const { return entries.empty(); }
+
+private:
+    struct Entry {
+        CIdleChore *chore;
+        double interval; // seconds
+        double due;
+    };
+    std::vector<Entry> entries;
+};

@@ -1,0 +1,4 @@
+#include "desktop/windows/PlatformConventions.h"
+
+bool PlatformConventions::scrollArrowsTogetherAtEnd = false;
+bool PlatformConventions::showsGrowBoxes = true;

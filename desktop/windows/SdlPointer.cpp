@@ -1,0 +1,175 @@
+#include "desktop/windows/SdlPointer.h"
+#include <SDL.h>
+#include "desktop/windows/SdlWindow.h"
+
+static int const kNoButton = 0, kFirstButton = 1, kLastButton = 3;
+
+static int ButtonOf(int sdlButton) {
+    switch (sdlButton) {
+    case SDL_BUTTON_LEFT:
+        return 1;
+    case SDL_BUTTON_RIGHT:
+        return 2;
+    case SDL_BUTTON_MIDDLE:
+        return 3;
+    default:
+        return kNoButton;
+    }
+}
+
+static unsigned int Bit(int button) { return 1U << button; }
+
+SdlPointer::SdlPointer(InputQueue &queue_) : queue(queue_) {}
+
+SdlWindow *SdlPointer::Target(SdlWindow *window) const {
+    if (capture != nullptr)
+        return capture;
+    return held != 0 ? pressWindow : window;
+}
+
+// Of a release outside of all windows SDL does not tell where it was.
+void SdlPointer::SetScreenPlace(SdlWindow *window, int x, int y) {
+    if (window == nullptr) {
+        SDL_GetGlobalMouseState(&screenX, &screenY);
+        return;
+    }
+    screenX = window->ScreenX() + x;
+    screenY = window->ScreenY() + y;
+}
+
+void SdlPointer::Send(InputEvent &event, InputEvent::Kind kind, SdlWindow *window) {
+    event.kind = kind;
+    event.window = window;
+    event.h = window->ContentH(screenX);
+    event.v = window->ContentV(screenY);
+    queue.Push(event);
+}
+
+void SdlPointer::Enter(InputEvent event, SdlWindow *window) {
+    if (hover != nullptr && hover != window)
+        Send(event, InputEvent::kMouseLeave, hover);
+    hover = window;
+}
+
+void SdlPointer::LeaveIfOutside(InputEvent event) {
+    if (hover == nullptr || hover->Contains(hover->ContentH(screenX), hover->ContentV(screenY)))
+        return;
+    Send(event, InputEvent::kMouseLeave, hover);
+    hover = nullptr;
+}
+
+void SdlPointer::Move(InputEvent event, SdlWindow *window, SDL_MouseMotionEvent const &motion) {
+    SdlWindow *target = Target(window);
+    if (target == nullptr)
+        return;
+    SetScreenPlace(window, motion.x, motion.y);
+    Enter(event, target);
+    Send(event, InputEvent::kMouseMove, target);
+}
+
+// SDL counts the clicks at one place of any window. Those before the pointer came to this one do not count.
+int SdlPointer::CountClicks(SdlWindow *window, int sdlClicks) {
+    if (sdlClicks <= clickBase)
+        clickBase = 0;
+    if (window != clickWindow)
+        clickBase = sdlClicks - 1;
+    clickWindow = window;
+    return sdlClicks - clickBase;
+}
+
+void SdlPointer::Press(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent const &press) {
+    int button = ButtonOf(press.button);
+    SdlWindow *target = Target(window);
+    if (button == kNoButton || target == nullptr)
+        return;
+    SetScreenPlace(window, press.x, press.y);
+    Enter(event, target);
+    pressWindow = target;
+    held |= Bit(button);
+    clicks = CountClicks(target, press.clicks);
+    event.button = button;
+    event.clicks = clicks;
+    Send(event, InputEvent::kMouseDown, target);
+}
+
+void SdlPointer::Release(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent const &release) {
+    int button = ButtonOf(release.button);
+    if ((held & Bit(button)) == 0)
+        return; // it was pressed elsewhere, or has been released for it
+    SetScreenPlace(window, release.x, release.y);
+    ReleaseButton(event, button);
+    if (held != 0 || capture != nullptr)
+        return;
+    EndCapture();
+    LeaveIfOutside(event);
+}
+
+void SdlPointer::ReleaseButton(InputEvent event, int button) {
+    SdlWindow *target = Target(nullptr);
+    held &= ~Bit(button);
+    event.button = button;
+    event.clicks = clicks;
+    Send(event, InputEvent::kMouseUp, target);
+}
+
+void SdlPointer::ReleaseAll(InputEvent event) {
+    for (int button = kFirstButton; button <= kLastButton; ++button)
+        if ((held & Bit(button)) != 0)
+            ReleaseButton(event, button);
+    EndCapture();
+}
+
+void SdlPointer::EndCapture() {
+    if (held == 0 && capture == nullptr)
+        SDL_CaptureMouse(SDL_FALSE);
+}
+
+// Up is positive for SDL and for us, right is positive for SDL and left for us.
+void SdlPointer::Turn(InputEvent event, SdlWindow *window, SDL_MouseWheelEvent const &wheel) {
+    SdlWindow *target = Target(window);
+    if (target == nullptr)
+        return;
+    SetScreenPlace(window, wheel.mouseX, wheel.mouseY);
+    event.wheelH = -static_cast<double>(wheel.preciseX);
+    event.wheelV = static_cast<double>(wheel.preciseY);
+    Send(event, InputEvent::kWheel, target);
+}
+
+void SdlPointer::Leave(InputEvent event, SdlWindow *window) {
+    if (held != 0 || capture != nullptr || window == nullptr || window != hover)
+        return;
+    Send(event, InputEvent::kMouseLeave, hover);
+    hover = nullptr;
+}
+
+// SDL refuses while none of our windows is active. A held button then keeps the X server's own capture, and Recapture follows.
+void SdlPointer::Recapture() {
+    if (held != 0 || capture != nullptr)
+        SDL_CaptureMouse(SDL_TRUE);
+}
+
+void SdlPointer::Capture(InputEvent event, SdlWindow *window) {
+    capture = window;
+    if (window != nullptr) {
+        SDL_CaptureMouse(SDL_TRUE);
+        return;
+    }
+    if (held != 0)
+        return;
+    EndCapture();
+    LeaveIfOutside(event);
+}
+
+void SdlPointer::Forget(SdlWindow const *window) {
+    if (hover == window)
+        hover = nullptr;
+    if (clickWindow == window)
+        clickWindow = nullptr;
+    if (pressWindow == window) {
+        pressWindow = nullptr;
+        held = 0;
+    }
+    if (capture == window)
+        capture = nullptr;
+    EndCapture();
+}

@@ -1,0 +1,55 @@
+#include "desktop/windows/SdlSession.h"
+#include <SDL.h>
+#include <cstring>
+#include <stdexcept>
+#include <string>
+
+static char const *const kVideoDriver = "x11";
+
+namespace {
+struct Hint {
+    char const *name, *value;
+};
+} // namespace
+
+static Hint const kHints[] = {
+    // The Wayland driver loses the places of pop-ups and the capture of the mouse; the X server of a Wayland session has both.
+    {SDL_HINT_VIDEODRIVER, kVideoDriver},
+    // Pixels go to the window straight from memory: through a texture the first one takes half a second and 90 MB.
+    {SDL_HINT_FRAMEBUFFER_ACCELERATION, "0"},
+    {SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0"},
+    {SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1"},
+    // Long compositions of an input method arrive whole.
+    {SDL_HINT_IME_SUPPORT_EXTENDED_TEXT, "1"},
+    // A click that brings the window to the front works on the control under it too: mixers stand beside other windows.
+    {SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1"},
+    // A drag that leaves the window goes on.
+    {SDL_HINT_MOUSE_AUTO_CAPTURE, "1"},
+    // Two quick clicks on small controls side by side are not a double-click on the second.
+    {SDL_HINT_MOUSE_DOUBLE_CLICK_RADIUS, "5"},
+    // The desktop decides when the program ends.
+    {SDL_HINT_QUIT_ON_LAST_WINDOW_CLOSE, "0"},
+    // SIGINT and SIGTERM end the program as the session's end does.
+    {SDL_HINT_NO_SIGNAL_HANDLERS, "0"},
+};
+
+static std::runtime_error NoDisplay(std::string const &reason) {
+    return std::runtime_error("no display: " + reason);
+}
+
+SdlSession::SdlSession() {
+    for (Hint const &hint : kHints)
+        SDL_SetHintWithPriority(hint.name, hint.value, SDL_HINT_OVERRIDE);
+    if (SDL_InitSubSystem(SDL_INIT_VIDEO) != 0)
+        throw NoDisplay(SDL_GetError());
+    // Without a display SDL may settle for a driver that shows nothing and polls for its events.
+    char const *driver = SDL_GetCurrentVideoDriver();
+    if (driver == nullptr || std::strcmp(driver, kVideoDriver) != 0) {
+        SDL_QuitSubSystem(SDL_INIT_VIDEO);
+        throw NoDisplay("the X server cannot be reached");
+    }
+    // Text input is on at first, and an input method would take the keys of shortcuts.
+    SDL_StopTextInput();
+}
+
+SdlSession::~SdlSession() { SDL_QuitSubSystem(SDL_INIT_VIDEO); }

@@ -1,0 +1,265 @@
+#include "desktop/windows/SimulatedWindowSystem.h"
+#include <algorithm>
+#include "desktop/SimulatedDesktop.h"
+#include "desktop/resources/Utf.h"
+
+namespace {
+Rect const kScreen{0, 0, 1200, 1920};
+Point const kFirstPlace{80, 100}; // of windows that name no place
+}
+
+SimulatedWindowSystem::SimulatedWindowSystem(double scale_) : scale(scale_ > 0 ? scale_ : 1.0) {}
+
+SimulatedWindowSystem::~SimulatedWindowSystem() {}
+
+void SimulatedWindowSystem::Append(std::vector<ScriptStep> const &more) {
+    steps.insert(steps.end(), more.begin(), more.end());
+}
+
+std::unique_ptr<PlatformWindow> SimulatedWindowSystem::CreateWindow(WindowSpec const &spec) {
+    WindowSpec placed = spec;
+    if (!spec.placed) {
+        placed.h = kFirstPlace.h;
+        placed.v = kFirstPlace.v;
+    }
+    return std::unique_ptr<PlatformWindow>(new SimulatedWindow(*this, placed, scale));
+}
+
+void SimulatedWindowSystem::WindowShown(SimulatedWindow *window) {
+    windows.push_back(window);
+    if (!window->IsPopup())
+        Activate(window, true);
+}
+
+void SimulatedWindowSystem::WindowHidden(SimulatedWindow *window) {
+    windows.erase(std::remove(windows.begin(), windows.end(), window), windows.end());
+    if (active == window)
+        active = nullptr;
+    if (captured == window)
+        captured = nullptr;
+    queue.erase(std::remove_if(queue.begin(), queue.end(), [=](InputEvent const &e) { return e.window == window; }),
+                queue.end());
+    state.Forget(window);
+    if (!window->IsPopup() && !active)
+        Activate(Target(), true);
+}
+
+void SimulatedWindowSystem::WindowGone(SimulatedWindow *window) {
+    if (std::find(windows.begin(), windows.end(), window) != windows.end())
+        WindowHidden(window);
+}
+
+SimulatedWindow *SimulatedWindowSystem::Target() const {
+    for (auto i = windows.rbegin(); i != windows.rend(); ++i)
+        if (!(*i)->IsPopup())
+            return *i;
+    return nullptr;
+}
+
+void SimulatedWindowSystem::Activate(SimulatedWindow *window, bool on) {
+    InputEvent event;
+    event.time = now;
+    if (active && (active == window) != on) {
+        event.kind = InputEvent::kDeactivated;
+        event.window = active;
+        queue.push_back(event);
+        active = nullptr;
+    }
+    if (!on || !window || active == window)
+        return;
+    active = window;
+    event.kind = InputEvent::kActivated;
+    event.window = window;
+    queue.push_back(event);
+}
+
+// Waiting
+
+bool SimulatedWindowSystem::Deliver(InputEvent &event) {
+    if (queue.empty())
+        return false;
+    event = queue.front();
+    queue.pop_front();
+    state.Take(event);
+    return true;
+}
+
+bool SimulatedWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter waiter, char const *what) {
+    double const deadline = timeout < 0 ? -1 : now + timeout;
+    for (;;) {
+        if (Deliver(event))
+            return true;
+        if (steps.empty()) {
+            if (waiter == Waiter::kTracking && captured) {
+                ScriptStep release;
+                release.kind = ScriptStep::kRelease;
+                Perform(release);
+                continue;
+            }
+            if (deadline < 0 && waiter != Waiter::kMainLoop)
+                throw ScriptError(std::string("the script has ended, and nothing can end ") + what);
+            if (deadline > now)
+                now = deadline;
+            return false;
+        }
+        ScriptStep const step = steps.front();
+        // A pause in the script begins when its turn comes.
+        if (!stepTimed) {
+            stepTimed = true;
+            nextStepAt = now + (step.kind == ScriptStep::kWait ? step.seconds : 0);
+        }
+        if (deadline >= 0 && nextStepAt > deadline) {
+            now = std::max(now, deadline);
+            return false;
+        }
+        now = std::max(now, nextStepAt);
+        steps.pop_front();
+        stepTimed = false;
+        Perform(step);
+        // A step without events gives a wait that has a limit the chance to see it pass.
+        if (queue.empty() && deadline >= 0 && now >= deadline)
+            return false;
+    }
+}
+
+// Steps
+
+void SimulatedWindowSystem::Push(InputEvent event, ScriptStep const &step) {
+    event.window = captured ? captured : Target();
+    event.time = now;
+    event.modifiers = step.modifiers;
+    queue.push_back(event);
+}
+
+void SimulatedWindowSystem::PushButton(InputEvent::Kind kind, int button, int clicks, ScriptStep const &step) {
+    InputEvent event;
+    event.kind = kind;
+    event.h = lastH;
+    event.v = lastV;
+    event.button = button;
+    event.clicks = clicks;
+    Push(event, step);
+}
+
+void SimulatedWindowSystem::PushKey(int key, std::string const &text, ScriptStep const &step) {
+    InputEvent event;
+    event.kind = InputEvent::kKeyDown;
+    event.key = key;
+    event.text = Utf::FromUtf8(text);
+    event.h = lastH;
+    event.v = lastV;
+    Push(event, step);
+    event.kind = InputEvent::kKeyUp;
+    event.text = UString();
+    Push(event, step);
+}
+
+// What a key types comes with the key; what no key types comes by itself, as from an input method.
+void SimulatedWindowSystem::Type(ScriptStep const &step) {
+    for (std::size_t i = 0; i < step.text.size();) {
+        unsigned char const lead = static_cast<unsigned char>(step.text[i]);
+        std::size_t const length = lead < 0x80 ? 1 : lead < 0xE0 ? 2 : lead < 0xF0 ? 3 : 4;
+        std::string const character = step.text.substr(i, length);
+        i += length;
+        if (length == 1) {
+            bool const capital = lead >= 'A' && lead <= 'Z';
+            ScriptStep keyStep = step;
+            keyStep.modifiers = static_cast<unsigned short>(capital ? Modifiers::kShift : 0);
+            PushKey(capital ? lead - 'A' + 'a' : lead, character, keyStep);
+        } else {
+            InputEvent event;
+            event.kind = InputEvent::kTextInput;
+            event.text = Utf::FromUtf8(character);
+            Push(event, step);
+        }
+    }
+}
+
+void SimulatedWindowSystem::Perform(ScriptStep const &step) {
+    bool const hasPlace = step.kind <= ScriptStep::kWheel && step.kind != ScriptStep::kRelease;
+    if (hasPlace) {
+        lastH = step.h;
+        lastV = step.v;
+    }
+    switch (step.kind) {
+    case ScriptStep::kPress:
+        PushButton(InputEvent::kMouseDown, 1, 1, step);
+        break;
+    case ScriptStep::kMove:
+        PushButton(InputEvent::kMouseMove, 0, 0, step);
+        break;
+    case ScriptStep::kRelease:
+        PushButton(InputEvent::kMouseUp, 1, 1, step);
+        break;
+    case ScriptStep::kDoubleClick:
+        PushButton(InputEvent::kMouseDown, 1, 1, step);
+        PushButton(InputEvent::kMouseUp, 1, 1, step);
+        PushButton(InputEvent::kMouseDown, 1, 2, step);
+        PushButton(InputEvent::kMouseUp, 1, 2, step);
+        break;
+    case ScriptStep::kClick:
+        PushButton(InputEvent::kMouseDown, 1, 1, step);
+        PushButton(InputEvent::kMouseUp, 1, 1, step);
+        break;
+    case ScriptStep::kRightClick:
+        PushButton(InputEvent::kMouseDown, 2, 1, step);
+        PushButton(InputEvent::kMouseUp, 2, 1, step);
+        break;
+    case ScriptStep::kWheel: {
+        InputEvent event;
+        event.kind = InputEvent::kWheel;
+        event.h = step.h;
+        event.v = step.v;
+        event.wheelH = step.wheelH;
+        event.wheelV = step.wheelV;
+        Push(event, step);
+        break;
+    }
+    case ScriptStep::kKey: {
+        bool const types = step.key >= ' ' && step.key < KeyCodes::kDelete &&
+                           !(step.modifiers & (Modifiers::kCommand | Modifiers::kControl));
+        PushKey(step.key, types ? std::string(1, static_cast<char>(step.key)) : std::string(), step);
+        break;
+    }
+    case ScriptStep::kType:
+        Type(step);
+        break;
+    case ScriptStep::kWait:
+        break;
+    case ScriptStep::kResize: {
+        SimulatedWindow *window = Target();
+        if (!window)
+            break;
+        window->Resize(step.h, step.v);
+        InputEvent event;
+        event.kind = InputEvent::kResized;
+        event.width = window->Width();
+        event.height = window->Height();
+        Push(event, step);
+        queue.back().window = window;
+        break;
+    }
+    case ScriptStep::kActivate:
+        Activate(Target(), step.on);
+        break;
+    case ScriptStep::kMenu:
+    case ScriptStep::kPrint:
+    case ScriptStep::kSnapshot:
+    case ScriptStep::kDump:
+        if (commandHandler)
+            commandHandler(step, Target());
+        break;
+    }
+}
+
+Point SimulatedWindowSystem::MousePlace(PlatformWindow const &) const {
+    return {static_cast<short>(state.PointerV()), static_cast<short>(state.PointerH())};
+}
+
+void SimulatedWindowSystem::ForceScale(double factor) {
+    scale = factor;
+    for (SimulatedWindow *window : windows)
+        window->SetScaleFactor(scale);
+}
+
+Rect SimulatedWindowSystem::ScreenBounds() const { return kScreen; }
