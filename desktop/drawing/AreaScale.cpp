@@ -14,8 +14,8 @@ struct Line {
     int count;
 };
 
-// Lengths are counted so that the line is from.count * to.count long: every pixel of `from` is to.count long then, and every pixel
-// of `to` from.count, in whole numbers.
+// Lengths are counted so that the line is from.count * to.count long: every pixel of `from` is to.count long
+// then, and every pixel of `to` from.count, in whole numbers.
 void ScaleLine(Line const &from, Line const &to) {
     std::size_t source = 0;
     int sourceLeft = to.count; // of the current source pixel
@@ -42,7 +42,7 @@ void ScaleLine(Line const &from, Line const &to) {
     }
 }
 
-}
+} // namespace
 
 void ScalePixels(std::uint32_t const *from, int fromWidth, int fromHeight, std::uint32_t *to, int toWidth,
                  int toHeight) {
@@ -53,7 +53,8 @@ void ScalePixels(std::uint32_t const *from, int fromWidth, int fromHeight, std::
     for (int y = 0; y < fromHeight; ++y) {
         row.assign(from, from + oldPitch);
         from += oldPitch;
-        ScaleLine({row.data(), 1, fromWidth}, {wide.data() + static_cast<std::size_t>(y) * newPitch, 1, toWidth});
+        ScaleLine({row.data(), 1, fromWidth},
+                  {wide.data() + static_cast<std::size_t>(y) * newPitch, 1, toWidth});
     }
     for (std::size_t x = 0; x < newPitch; ++x)
         ScaleLine({wide.data() + x, newPitch, fromHeight}, {to + x, newPitch, toHeight});

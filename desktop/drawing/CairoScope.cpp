@@ -1,9 +1,11 @@
-#include <cairo.h>
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/PortDevice.h"
 #include "desktop/drawing/Surface.h"
+#include <cairo.h>
 
-CairoScope::CairoScope(DrawingPort &port_, Rect const &bounds) : port(port_), context(nullptr) {
+CairoScope::CairoScope(DrawingPort &port_, Rect const &bounds)
+    : port(port_)
+    , context(nullptr) {
     if (!port.surface || !port.Visible(bounds))
         return;
     port.device->UpdateClip(port);

@@ -1,10 +1,10 @@
 #include "desktop/drawing/ClipPath.h"
+#include "desktop/drawing/PathDrawing.h"
 #include <algorithm>
 #include <cairo.h>
 #include <cmath>
 #include <utility>
 #include <vector>
-#include "desktop/drawing/PathDrawing.h"
 
 namespace {
 
@@ -12,7 +12,8 @@ namespace {
 class Mask {
 public:
     explicit Mask(DeviceRect const &area_)
-        : area(area_), surface(cairo_image_surface_create(CAIRO_FORMAT_A8, area.Width(), area.Height())) {}
+        : area(area_)
+        , surface(cairo_image_surface_create(CAIRO_FORMAT_A8, area.Width(), area.Height())) {}
     ~Mask() { cairo_surface_destroy(surface); }
     Mask(Mask const &) = delete;
     Mask &operator=(Mask const &) = delete;
@@ -69,11 +70,12 @@ cairo_path_t *DevicePath(OSPath const &path, int originH, int originV, double fa
     return copy;
 }
 
-}
+} // namespace
 
 ClipPath::ClipPath(OSPath const &local, int originH, int originV, DeviceScale scale, int deviceWidth,
                    int deviceHeight, std::shared_ptr<ClipPath const> outer_)
-    : path(nullptr), outer(std::move(outer_)) {
+    : path(nullptr)
+    , outer(std::move(outer_)) {
     DeviceRect bounds = {0, 0, 0, 0};
     path = DevicePath(local, originH, originV, scale.Factor(), bounds);
     bounds = bounds.Intersected({0, 0, deviceWidth, deviceHeight});

@@ -13,7 +13,7 @@ unsigned short Component(double share) {
     return static_cast<unsigned short>(within * kWhole + 0.5);
 }
 
-}
+} // namespace
 
 OS::RGBAColor ToRGBA(RGBColor const &color) {
     return {Share(color.red), Share(color.green), Share(color.blue), 1.0};

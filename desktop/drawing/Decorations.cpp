@@ -1,13 +1,13 @@
 // Frames and shadows: shades laid over what is beneath, so that they look right in every theme.
-#include <algorithm>
-#include <cstdlib>
-#include <utility>
 #include "desktop/drawing/Colors.h"
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/PixelScope.h"
 #include "desktop/drawing/ThemeColors.h"
 #include "desktop/observe/DrawingTrace.h"
 #include "host/VelaDrawing.h"
+#include <algorithm>
+#include <cstdlib>
+#include <utility>
 
 namespace {
 
@@ -31,15 +31,17 @@ OS::RGBAColor Outline(double alpha) {
     return {ink, ink, ink, alpha};
 }
 
-// One ring of a bevel. The lighter colour is at the bottom right when sunken; each corner belongs to the darker sides.
-void DrawBevelRing(PixelScope &pixels, Rect const &r, OS::RGBAColor const &topLeft, OS::RGBAColor const &bottomRight) {
+// One ring of a bevel. The lighter colour is at the bottom right when sunken; each corner belongs to the
+// darker sides.
+void DrawBevelRing(PixelScope &pixels, Rect const &r, OS::RGBAColor const &topLeft,
+                   OS::RGBAColor const &bottomRight) {
     pixels.Fill(pixels.ToDevice(r.left, r.top, r.right - 1, r.top + 1), topLeft);
     pixels.Fill(pixels.ToDevice(r.left, r.top + 1, r.left + 1, r.bottom - 1), topLeft);
     pixels.Fill(pixels.ToDevice(r.right - 1, r.top, r.right, r.bottom - 1), bottomRight);
     pixels.Fill(pixels.ToDevice(r.left, r.bottom - 1, r.right, r.bottom), bottomRight);
 }
 
-}
+} // namespace
 
 void Frame3DRect(Rect const *r, short depth, short gray) {
     if (DrawingTrace::On())

@@ -1,7 +1,7 @@
 // How logical pixels become device pixels.
 #pragma once
-#include <cstdint>
 #include "host/Geometry.h"
+#include <cstdint>
 
 // A rectangle in device pixels; right and bottom edges are outside it.
 struct DeviceRect {
@@ -22,14 +22,15 @@ struct DeviceRect {
     }
 };
 
-// The factor between logical and device pixels: 1, 1.25, 1.5, 2 or any other from 0.5 to 4, kept in thousandths so that all
-// rounding is exact. Every edge is rounded to the nearest device pixel by itself, so that rectangles that adjoin in logical pixels
-// adjoin in device pixels too.
+// The factor between logical and device pixels: 1, 1.25, 1.5, 2 or any other from 0.5 to 4, kept in
+// thousandths so that all rounding is exact. Every edge is rounded to the nearest device pixel by itself, so
+// that rectangles that adjoin in logical pixels adjoin in device pixels too.
 class DeviceScale {
 public:
     // Factors beyond the range are cut to it; what is not a number counts as 1.
     explicit DeviceScale(double factor = 1.0)
-        : thousandths(Thousandths(factor)), whole(thousandths % kOne == 0 ? thousandths / kOne : 0) {}
+        : thousandths(Thousandths(factor))
+        , whole(thousandths % kOne == 0 ? thousandths / kOne : 0) {}
     double Factor() const { return thousandths / static_cast<double>(kOne); }
     int Thousandths() const { return thousandths; }
     bool IsWhole() const { return whole != 0; }

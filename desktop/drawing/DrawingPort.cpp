@@ -1,8 +1,4 @@
 #include "desktop/drawing/DrawingPort.h"
-#include <algorithm>
-#include <boost/assert.hpp>
-#include <cairo.h>
-#include <cmath>
 #include "desktop/drawing/ClipPath.h"
 #include "desktop/drawing/Colors.h"
 #include "desktop/drawing/PathDrawing.h"
@@ -13,12 +9,17 @@
 #include "desktop/drawing/Surface.h"
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/observe/DrawingTrace.h"
+#include <algorithm>
+#include <boost/assert.hpp>
+#include <cairo.h>
+#include <cmath>
 
 namespace {
 
 constexpr double kPercent = 100.0;
 constexpr double kWidestLine = 1000.0;
-// How many line widths a sharp bend may reach beyond its corner: half of Cairo's limit, which counts from side to side.
+// How many line widths a sharp bend may reach beyond its corner: half of Cairo's limit, which counts from
+// side to side.
 constexpr double kFarthestMiter = 5.0;
 constexpr PenState kNormalPen = {{0, 0}, {1, 1}, 0, 0};
 
@@ -62,12 +63,17 @@ double Radius(double diameter, DeviceScale scale) {
     return std::max(0.0, FiniteCoordinate(diameter) / 2 * scale.Factor());
 }
 
-}
+} // namespace
 
 DrawingPort *DrawingPort::current = nullptr;
 
 DrawingPort::DrawingPort()
-    : surface(nullptr), extent{0, 0, 0, 0}, originH(0), originV(0), device(new Device), serial(NextSerial()) {
+    : surface(nullptr)
+    , extent{0, 0, 0, 0}
+    , originH(0)
+    , originV(0)
+    , device(new Device)
+    , serial(NextSerial()) {
     LivePorts().push_back(this);
 }
 
@@ -293,9 +299,7 @@ void GraphicsState::PenNormal() {
 void DrawingPort::ScrollRect(OS::RectBase<OS::RectTag> const &r, OS::Size const &distance) {
     int const dh = WholePixel(distance.width), dv = WholePixel(distance.height);
     if (DrawingTrace::On())
-        DrawingTrace::Write(Call("ScrollRect", r)
-                                .Number("dh", distance.width)
-                                .Number("dv", distance.height));
+        DrawingTrace::Write(Call("ScrollRect", r).Number("dh", distance.width).Number("dv", distance.height));
     if (dh == 0 && dv == 0)
         return;
     OSRgn area(clip);
@@ -324,12 +328,12 @@ void DrawingPort::ScrollRect(OS::RectBase<OS::RectTag> const &r, OS::Size const 
 void DrawingPort::MoveDevicePixels(OSRgn const &destination, int dh, int dv) {
     int const dx = scale.Edge(dh), dy = scale.Edge(dv);
     DeviceRect const whole = {0, 0, surface->Width(), surface->Height()};
-    DeviceRect const source = {dx, dy, whole.right + dx, whole.bottom + dy}; // where there is something to copy
+    DeviceRect const source = {dx, dy, whole.right + dx,
+                               whole.bottom + dy}; // where there is something to copy
     std::vector<pixman_box32_t> boxes;
     for (Rect const &r : Region::Rects(destination)) {
-        DeviceRect box = scale.ToDevice(r.left, r.top, r.right, r.bottom)
-                             .Intersected(whole)
-                             .Intersected(source);
+        DeviceRect box =
+            scale.ToDevice(r.left, r.top, r.right, r.bottom).Intersected(whole).Intersected(source);
         if (!box.Empty())
             boxes.push_back({box.left, box.top, box.right, box.bottom});
         touched.Add(box);

@@ -1,8 +1,5 @@
 // The drawing port of a window.
 #pragma once
-#include <functional>
-#include <memory>
-#include <vector>
 #include "desktop/drawing/DeviceScale.h"
 #include "desktop/drawing/TouchedBoxes.h"
 #include "host/Geometry.h"
@@ -12,6 +9,9 @@
 #include "host/PortSavers.h"
 #include "host/RGBColor.h"
 #include "host/VelaDrawing.h"
+#include <functional>
+#include <memory>
+#include <vector>
 
 class ClipPath;
 class Surface;
@@ -19,15 +19,15 @@ typedef struct _cairo cairo_t;
 
 // What drawing depends on beside the pixels; the savers keep copies of parts of it.
 struct GraphicsState {
-    OS::RGBAColor fore;                      // opaque black
-    OS::RGBAColor back{1.0, 1.0, 1.0, 1.0};  // opaque white
-    PenState pen{{0, 0}, {1, 1}, 0, 0};      // location in local coordinates
-    double lineWidth = 1.0;                  // logical pixels, for the outlines and paths of OSPort
+    OS::RGBAColor fore;                     // opaque black
+    OS::RGBAColor back{1.0, 1.0, 1.0, 1.0}; // opaque white
+    PenState pen{{0, 0}, {1, 1}, 0, 0};     // location in local coordinates
+    double lineWidth = 1.0;                 // logical pixels, for the outlines and paths of OSPort
     OS::Font::FamilyID textFamily;
     int textFace = 0;
-    short textSize = 12;                     // points, which are logical pixels
-    int darken = 0;                          // 0 draws plainly; else percent by which drawing darkens
-    bool fadedIcons = false;                 // GrayForeColor with a light gray, as for what is disabled
+    short textSize = 12;     // points, which are logical pixels
+    int darken = 0;          // 0 draws plainly; else percent by which drawing darkens
+    bool fadedIcons = false; // GrayForeColor with a light gray, as for what is disabled
 
     void SetFore(OS::RGBAColor const &color) {
         fore = color;
@@ -39,27 +39,28 @@ struct GraphicsState {
 
 // A clip as it is kept and put back.
 struct ClipState {
-    OSRgn region;                            // window coordinates
-    std::shared_ptr<ClipPath const> path;    // narrows the region further; null for none
+    OSRgn region;                         // window coordinates
+    std::shared_ptr<ClipPath const> path; // narrows the region further; null for none
 };
 
-// The one OSPort there is. Logical pixels throughout; the surface is larger by the scale. Local coordinates are those of the
-// window less the origin. Drawing outside the clip has no effect.
+// The one OSPort there is. Logical pixels throughout; the surface is larger by the scale. Local coordinates
+// are those of the window less the origin. Drawing outside the clip has no effect.
 class DrawingPort : public OSPort {
 public:
     DrawingPort();
     virtual ~DrawingPort();
 
-    // The pixels and their scale; neither is owned. Drawing on a port without surface does nothing. Has to be called, if need be
-    // with null, before the surface dies.
+    // The pixels and their scale; neither is owned. Drawing on a port without surface does nothing. Has to be
+    // called, if need be with null, before the surface dies.
     void SetSurface(Surface *, DeviceScale);
     Surface *GetSurface() const { return surface; }
     DeviceScale Scale() const { return scale; }
-    // The window's content in logical pixels, from (0, 0); cuts every clip and all damage. Boundary and clip become all of it.
+    // The window's content in logical pixels, from (0, 0); cuts every clip and all damage. Boundary and clip
+    // become all of it.
     void SetExtent(int width, int height);
     Rect Extent() const { return extent; }
-    // Asked for the place of the window's content on the screen, in logical pixels, whenever somebody wants to know. Without it the
-    // content is taken to lie in the corner of the screen.
+    // Asked for the place of the window's content on the screen, in logical pixels, whenever somebody wants
+    // to know. Without it the content is taken to lie in the corner of the screen.
     void SetScreenPlace(std::function<Point()> place) { screenPlace = std::move(place); }
     Point ScreenPlace() const { return screenPlace ? screenPlace() : Point{0, 0}; }
 
@@ -77,7 +78,8 @@ public:
     // The widest clip that drawing may have, in window coordinates; makes it the clip as well.
     void SetBoundary(OSRgn const &);
     OSRgn const &Boundary() const { return boundary; }
-    // The clip proper, in window coordinates; what is set is cut to the boundary. Forgets any path that narrowed the clip.
+    // The clip proper, in window coordinates; what is set is cut to the boundary. Forgets any path that
+    // narrowed the clip.
     void SetClip(OSRgn const &);
     OSRgn const &Clip() const { return clip; }
     // The clip with its path, to be put back later.
@@ -103,7 +105,8 @@ public:
     OSRgn const &GetDamage() const { return damage; }
     OSRgn TakeDamage();
 
-    // The device pixels that have been drawn on since the last call, and so have to be shown: a few boxes that cover them.
+    // The device pixels that have been drawn on since the last call, and so have to be shown: a few boxes
+    // that cover them.
     std::vector<DeviceRect> TakeTouched() { return touched.Take(); }
 
     Rect LocalToWindow(Rect const &) const; // saturates at the ends of 16 bits
@@ -150,7 +153,9 @@ private:
 // A port that may die meanwhile.
 class PortRef {
 public:
-    explicit PortRef(DrawingPort *port_) : port(port_), serial(port_ ? port_->serial : 0) {}
+    explicit PortRef(DrawingPort *port_)
+        : port(port_)
+        , serial(port_ ? port_->serial : 0) {}
     // Null when there was none, or when it is gone.
     DrawingPort *Get() const {
         DrawingPort *alive = DrawingPort::Alive(port);
@@ -162,9 +167,10 @@ private:
     unsigned long serial;
 };
 
-// Cairo drawing on the current surface for the scope's lifetime: user space is local logical coordinates, the clip is the port's,
-// the source is the port's ink. Null context when nothing of `bounds` (local) could show. The context's state is put back at the
-// end. Scopes do not nest, and the port's clip stays as it is while one lives.
+// Cairo drawing on the current surface for the scope's lifetime: user space is local logical coordinates, the
+// clip is the port's, the source is the port's ink. Null context when nothing of `bounds` (local) could show.
+// The context's state is put back at the end. Scopes do not nest, and the port's clip stays as it is while
+// one lives.
 class CairoScope {
 public:
     CairoScope(DrawingPort &, Rect const &bounds);

@@ -1,7 +1,7 @@
 #include "desktop/drawing/IconSet.h"
-#include <algorithm>
 #include "desktop/drawing/AreaScale.h"
 #include "desktop/drawing/Surface.h"
+#include <algorithm>
 
 using namespace AtlasFormat;
 
@@ -18,11 +18,12 @@ pixman_image_t *ViewOf(std::uint32_t const *pixels, int width, int height) {
                                              const_cast<std::uint32_t *>(pixels), width * kBytesPerPixel);
 }
 
-}
+} // namespace
 
 struct IconSet::Layer {
     explicit Layer(std::string const &path)
-        : atlas(path), images(static_cast<std::size_t>(atlas.IconCount()) * kImageChoices) {}
+        : atlas(path)
+        , images(static_cast<std::size_t>(atlas.IconCount()) * kImageChoices) {}
     ~Layer() {
         for (pixman_image_t *image : images)
             if (image)
@@ -118,8 +119,8 @@ PixelImage IconSet::ScaledImage(Icon const &icon, int deviceWidth, int deviceHei
 void DrawMissingIcon(PixelScope &pixels, DeviceRect const &r) {
     static OS::RGBAColor const kMark(0.85, 0.2, 0.45, 1.0);
     constexpr int kThickness = 1;
-    pixels.FillFrame(r, {r.left + kThickness, r.top + kThickness, r.right - kThickness, r.bottom - kThickness},
-                     kMark);
+    pixels.FillFrame(
+        r, {r.left + kThickness, r.top + kThickness, r.right - kThickness, r.bottom - kThickness}, kMark);
     // One diagonal, stretched to the shape of the box.
     int const width = r.Width(), height = r.Height();
     for (int y = 1; y < height - 1; ++y) {

@@ -1,18 +1,18 @@
 // The icons of a theme at one scale.
 #pragma once
+#include "desktop/drawing/DeviceScale.h"
+#include "desktop/drawing/PixelScope.h"
+#include "desktop/resources/Atlas.h"
 #include <cstdint>
 #include <memory>
 #include <string>
 #include <unordered_map>
 #include <vector>
-#include "desktop/drawing/DeviceScale.h"
-#include "desktop/drawing/PixelScope.h"
-#include "desktop/resources/Atlas.h"
 
 class Surface;
 
-// Icons come from one or more atlases, of which a later one goes before an earlier one: the library's, then those of the
-// application. An atlas of another scale than the port's does, too: its icons are scaled.
+// Icons come from one or more atlases, of which a later one goes before an earlier one: the library's, then
+// those of the application. An atlas of another scale than the port's does, too: its icons are scaled.
 class IconSet {
 public:
     // Paths of the atlases; one that is broken throws std::runtime_error.
@@ -23,7 +23,8 @@ public:
 
     // An icon, or the place where one is missing.
     struct Icon {
-        int width, height; // logical pixels: the icon's own size, or its family's, or that of the mark for a missing one
+        int width, height; // logical pixels: the icon's own size, or its family's, or that of the mark for a
+                           // missing one
         int layer = -1;    // -1: there is no artwork, not even the mark
         AtlasFormat::IconRecord const *record = nullptr;
     };
@@ -32,8 +33,8 @@ public:
     // The size of a family's icons, in logical pixels; the mark's size for an unknown family.
     Icon FindFamily(short family) const;
 
-    // The icon at that size in device pixels: straight from the atlas where that has it, else scaled and kept. Only for icons with
-    // artwork; each side at least 1. Valid until the next call.
+    // The icon at that size in device pixels: straight from the atlas where that has it, else scaled and
+    // kept. Only for icons with artwork; each side at least 1. Valid until the next call.
     PixelImage Image(Icon const &, int deviceWidth, int deviceHeight);
 
 private:

@@ -1,12 +1,12 @@
 #include "desktop/drawing/IconStore.h"
+#include "desktop/drawing/AreaScale.h"
+#include "desktop/drawing/Region.h"
+#include "desktop/resources/Resources.h"
 #include <algorithm>
 #include <filesystem>
 #include <pixman.h>
 #include <stdexcept>
 #include <system_error>
-#include "desktop/drawing/AreaScale.h"
-#include "desktop/drawing/Region.h"
-#include "desktop/resources/Resources.h"
 
 namespace {
 
@@ -22,8 +22,9 @@ int ScaleInName(std::string const &file, std::string const &theme) {
         file.compare(file.size() - end.size(), end.size(), end) != 0)
         return 0;
     std::string const digits = file.substr(start.size(), file.size() - start.size() - end.size());
-    bool const number = digits.size() <= kMostDigits &&
-                        std::all_of(digits.begin(), digits.end(), [](char c) { return c >= '0' && c <= '9'; });
+    bool const number = digits.size() <= kMostDigits && std::all_of(digits.begin(), digits.end(), [](char c) {
+                            return c >= '0' && c <= '9';
+                        });
     return number ? std::stoi(digits) : 0;
 }
 
@@ -52,7 +53,7 @@ void AddRuns(OSRgn &region, std::uint32_t const *pixels, int width, int height) 
     }
 }
 
-}
+} // namespace
 
 IconStore &IconStore::Instance() {
     static IconStore store;
@@ -93,10 +94,7 @@ std::vector<std::string> IconStore::AtlasesFor(DeviceScale scale) const {
     return chosen;
 }
 
-IconSet &IconStore::ForScale(DeviceScale scale) {
-    FollowResources();
-    if (latestScale == scale.Thousandths())
-        return *latest;
+IconSet &IconStore::Demand(DeviceScale scale) {
     std::unique_ptr<IconSet> &set = sets[scale.Thousandths()];
     if (!set) {
         try {
@@ -106,9 +104,16 @@ IconSet &IconStore::ForScale(DeviceScale scale) {
             set.reset(new IconSet({}));
         }
     }
-    latestScale = scale.Thousandths();
-    latest = set.get();
     return *set;
+}
+
+IconSet &IconStore::ForScale(DeviceScale scale) {
+    FollowResources();
+    if (latestScale != scale.Thousandths()) {
+        latest = &Demand(scale);
+        latestScale = scale.Thousandths();
+    }
+    return *latest;
 }
 
 IconSet &IconStore::AnyScale() {
@@ -121,7 +126,7 @@ OSRgn const &IconStore::Outline(short family, short index) {
     auto found = outlines.find({family, index});
     if (found != outlines.end())
         return found->second;
-    IconSet &set = AnyScale();
+    IconSet &set = Demand(DeviceScale()); // the one scale at which an icon has a pixel for each of the region
     IconSet::Icon const icon = set.Find(family, index);
     OSRgn outline;
     if (icon.layer < 0) { // the mark that lines make

@@ -1,10 +1,10 @@
 #include "host/Icons.h"
-#include <algorithm>
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/IconStore.h"
 #include "desktop/drawing/PixelScope.h"
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/observe/DrawingTrace.h"
+#include <algorithm>
 
 namespace {
 
@@ -23,7 +23,8 @@ void DrawIcon(PixelScope &pixels, IconSet &set, IconSet::Icon const &icon, Devic
         pixels.DrawImage(set.Image(icon, whole.Width(), whole.Height()), whole.left, whole.top, box, true);
 }
 
-// Tiles of the given size over a rectangle in local coordinates, from its top left corner on, cut at its right and bottom edges.
+// Tiles of the given size over a rectangle in local coordinates, from its top left corner on, cut at its
+// right and bottom edges.
 void DrawTiles(PixelScope &pixels, DeviceScale scale, IconSet &set, IconSet::Icon const &icon, Rect const &r,
                int tileWidth, int tileHeight) {
     DeviceRect const box = pixels.ToDevice(r);
@@ -48,7 +49,8 @@ void DrawTiles(PixelScope &pixels, DeviceScale scale, IconSet &set, IconSet::Ico
 // What the calls below have in common: where to draw, and what from.
 class IconDrawing {
 public:
-    IconDrawing() : port(DrawingPort::CurrentPort()) {}
+    IconDrawing()
+        : port(DrawingPort::CurrentPort()) {}
     template <class Draw> void Run(Draw draw) {
         if (!port)
             return;
@@ -62,7 +64,7 @@ private:
     DrawingPort *port;
 };
 
-}
+} // namespace
 
 void Draw1Icon(short family, short index, short h, short v) {
     if (DrawingTrace::On())
@@ -102,8 +104,8 @@ void TileIcon(Rect const *r, short family, short index, short tileWidth, short t
     });
 }
 
-// All three pieces get the rectangle's height. The right cap keeps its right end where the rectangle is narrower than both caps: each
-// then has half of the width.
+// All three pieces get the rectangle's height. The right cap keeps its right end where the rectangle is
+// narrower than both caps: each then has half of the width.
 void TileIconInRectWithEndCaps(OS::RectBase<OS::RectTag> const &rect, short family, short firstIndex) {
     Rect const r = WholeRect(rect);
     if (DrawingTrace::On())

@@ -1,15 +1,15 @@
 #include "desktop/drawing/LineDrawing.h"
-#include <algorithm>
-#include <cstdlib>
-#include <utility>
 #include "desktop/drawing/PixelScope.h"
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/WholePixels.h"
+#include <algorithm>
+#include <cstdlib>
+#include <utility>
 
 namespace {
 
-// Calls draw(left, top, right, bottom) for each run of pixels that share a row or a column, `from` to `to` along the longer
-// direction.
+// Calls draw(left, top, right, bottom) for each run of pixels that share a row or a column, `from` to `to`
+// along the longer direction.
 template <class Draw> void ForEachRun(Point from, Point to, Draw draw) {
     int const dh = std::abs(to.h - from.h), dv = std::abs(to.v - from.v);
     bool const flat = dh >= dv;
@@ -40,7 +40,7 @@ template <class Draw> void ForEachRun(Point from, Point to, Draw draw) {
     drawRun(runStart, start + length + 1);
 }
 
-}
+} // namespace
 
 void DrawLine(PixelScope &pixels, Point from, Point to, Point penSize, OS::RGBAColor const &color) {
     int const penH = penSize.h, penV = penSize.v;
@@ -56,7 +56,8 @@ void DrawLine(PixelScope &pixels, Point from, Point to, Point penSize, OS::RGBAC
         return;
     }
     if (penH == 1 && penV == 1) {
-        ForEachRun(from, to, [&](int l, int t, int r, int b) { pixels.Fill(pixels.ToDevice(l, t, r, b), color); });
+        ForEachRun(from, to,
+                   [&](int l, int t, int r, int b) { pixels.Fill(pixels.ToDevice(l, t, r, b), color); });
         return;
     }
     OSRgn covered; // the places of a wide pen overlap

@@ -1,6 +1,6 @@
-// The named colours are constant to all who use them, and change with the theme. So they are defined here as the variables that they
-// are: this file must not include host/NamedColors.h, whose declarations are the constant view of the same objects. The values
-// are those of the light theme, until a theme is loaded.
+// The named colours are constant to all who use them, and change with the theme. So they are defined here as
+// the variables that they are: this file must not include host/NamedColors.h, whose declarations are the
+// constant view of the same objects. The values are those of the light theme, until a theme is loaded.
 #include "desktop/drawing/NamedColorTable.h"
 
 namespace {
@@ -12,7 +12,7 @@ constexpr RGBColor Rgb(unsigned rgb) {
             static_cast<unsigned short>((rgb & 0xFF) * kRepeat)};
 }
 
-}
+} // namespace
 
 RGBColor kDialogActiveTextColor = Rgb(0x1D1F23);
 RGBColor kDialogInactiveTextColor = Rgb(0x6A707B);
@@ -38,7 +38,7 @@ RGBColor kTooltipBackgroundColor = Rgb(0x2B2E34);
 RGBColor kTooltipTextColor = Rgb(0xF5F6F8);
 RGBColor kTooltipBorderColor = Rgb(0x17191C);
 RGBColor kFocusRingColor = Rgb(0x4D8EF0);
-}
+} // namespace ThemeColors
 
 NamedColorEntry const kNamedColorTable[kNamedColorCount] = {
     {"kDialogActiveTextColor", &kDialogActiveTextColor},

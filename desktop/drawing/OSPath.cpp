@@ -1,9 +1,10 @@
 #include "host/OSPath.h"
-#include <cstddef>
 #include "desktop/drawing/OSPathRep.h"
 #include "desktop/drawing/WholePixels.h"
+#include <cstddef>
 
-OSPath::OSPath() : rep(new Rep) {}
+OSPath::OSPath()
+    : rep(new Rep) {}
 
 OSPath::~OSPath() { delete rep; }
 

@@ -1,7 +1,7 @@
 // What stands behind an OSPath.
 #pragma once
-#include <vector>
 #include "host/OSPath.h"
+#include <vector>
 
 struct OSPath::Rep {
     enum class Verb { kBegin, kLine, kClose };

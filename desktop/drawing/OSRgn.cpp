@@ -1,15 +1,24 @@
 #include "host/OSRgn.h"
-#include <limits>
-#include <utility>
 #include "desktop/drawing/OSRgnRep.h"
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/WholePixels.h"
+#include <limits>
+#include <utility>
 
-OSRgn::OSRgn() : rep(new Rep) { pixman_region32_init(&rep->region); }
+OSRgn::OSRgn()
+    : rep(new Rep) {
+    pixman_region32_init(&rep->region);
+}
 
-OSRgn::OSRgn(Rect const &r) : OSRgn() { Region::SetRect(*this, r); }
+OSRgn::OSRgn(Rect const &r)
+    : OSRgn() {
+    Region::SetRect(*this, r);
+}
 
-OSRgn::OSRgn(OSRgn const &other) : OSRgn() { pixman_region32_copy(&rep->region, &other.rep->region); }
+OSRgn::OSRgn(OSRgn const &other)
+    : OSRgn() {
+    pixman_region32_copy(&rep->region, &other.rep->region);
+}
 
 OSRgn::~OSRgn() {
     pixman_region32_fini(&rep->region);
@@ -27,7 +36,8 @@ bool OSRgn::Contains(Point const &p) const {
 
 void OSRgn::Offset(double dh, double dv) { Region::Translate(*this, WholePixel(dh), WholePixel(dv)); }
 
-TempRgn::TempRgn() : region(new OSRgn) {}
+TempRgn::TempRgn()
+    : region(new OSRgn) {}
 
 TempRgn::~TempRgn() { delete region; }
 

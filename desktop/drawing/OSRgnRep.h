@@ -1,7 +1,7 @@
 // What stands behind an OSRgn.
 #pragma once
-#include <pixman.h>
 #include "host/OSRgn.h"
+#include <pixman.h>
 
 struct OSRgn::Rep {
     pixman_region32_t region; // logical pixels

@@ -1,11 +1,11 @@
 #include "desktop/drawing/PathDrawing.h"
+#include "desktop/drawing/OSPathRep.h"
+#include "desktop/drawing/WholePixels.h"
+#include "desktop/observe/DrawingTrace.h"
 #include <algorithm>
 #include <cairo.h>
 #include <limits>
 #include <string>
-#include "desktop/drawing/OSPathRep.h"
-#include "desktop/drawing/WholePixels.h"
-#include "desktop/observe/DrawingTrace.h"
 
 namespace {
 
@@ -23,7 +23,7 @@ void AppendArc(cairo_t *context, double centreH, double centreV, double radiusH,
     cairo_set_matrix(context, &before);
 }
 
-}
+} // namespace
 
 void PathDrawing::Append(cairo_t *context, OSPath const &path) {
     for (PathAccess::Rep::Step const &step : PathAccess::Of(path).steps) {

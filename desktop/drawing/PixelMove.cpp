@@ -1,6 +1,6 @@
 #include "desktop/drawing/PixelMove.h"
-#include <cstring>
 #include "desktop/drawing/Surface.h"
+#include <cstring>
 
 namespace {
 
@@ -14,15 +14,15 @@ void MoveBox(Surface &surface, pixman_box32_t const &box, int dx, int dy) {
     }
 }
 
-}
+} // namespace
 
 void MovePixels(Surface &surface, pixman_region32_t const &destination, int dx, int dy) {
     int count = 0;
     pixman_box32_t const *boxes =
         pixman_region32_rectangles(const_cast<pixman_region32_t *>(&destination), &count);
-    // A region's boxes lie in bands of equal top and bottom, from top to bottom, and in a band from left to right. The bands are
-    // taken against the vertical direction of the move and the boxes of a band against the horizontal one, for the same reason as
-    // the rows of a box.
+    // A region's boxes lie in bands of equal top and bottom, from top to bottom, and in a band from left to
+    // right. The bands are taken against the vertical direction of the move and the boxes of a band against
+    // the horizontal one, for the same reason as the rows of a box.
     int first = dy > 0 ? count : 0;
     while (dy > 0 ? first > 0 : first < count) {
         int begin = first, end = first;

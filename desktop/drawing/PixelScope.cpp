@@ -1,6 +1,6 @@
 #include "desktop/drawing/PixelScope.h"
-#include <algorithm>
 #include "desktop/drawing/Surface.h"
+#include <algorithm>
 
 namespace {
 
@@ -16,9 +16,7 @@ double Unit(double value) { return value > 0.0 ? std::min(value, 1.0) : 0.0; } /
 
 std::uint32_t Component8(double value) { return static_cast<std::uint32_t>(Unit(value) * kLargest8 + 0.5); }
 
-std::uint16_t Component16(double value) {
-    return static_cast<std::uint16_t>(Unit(value) * kLargest16 + 0.5);
-}
+std::uint16_t Component16(double value) { return static_cast<std::uint16_t>(Unit(value) * kLargest16 + 0.5); }
 
 pixman_color_t PremultipliedColor(OS::RGBAColor const &color) {
     double alpha = Unit(color.a);
@@ -33,7 +31,8 @@ bool Same(OS::RGBAColor const &a, OS::RGBAColor const &b) {
 // One colour everywhere.
 class SolidImage {
 public:
-    explicit SolidImage(pixman_color_t const &color) : image(pixman_image_create_solid_fill(&color)) {}
+    explicit SolidImage(pixman_color_t const &color)
+        : image(pixman_image_create_solid_fill(&color)) {}
     ~SolidImage() {
         if (image)
             pixman_image_unref(image);
@@ -54,7 +53,8 @@ pixman_image_t *FadingMask() {
 // Makes an image repeat for the scope's lifetime. Images are shared, so that it must not stay that way.
 class WithRepeat {
 public:
-    WithRepeat(pixman_image_t *image_, bool repeats) : image(repeats ? image_ : nullptr) {
+    WithRepeat(pixman_image_t *image_, bool repeats)
+        : image(repeats ? image_ : nullptr) {
         if (image)
             pixman_image_set_repeat(image, PIXMAN_REPEAT_NORMAL);
     }
@@ -69,9 +69,11 @@ private:
     pixman_image_t *image;
 };
 
-}
+} // namespace
 
-PixelScope::PixelScope(DrawingPort &port_) : port(port_), device(nullptr) {
+PixelScope::PixelScope(DrawingPort &port_)
+    : port(port_)
+    , device(nullptr) {
     if (!port.surface)
         return;
     port.device->UpdateClip(port);
@@ -154,8 +156,8 @@ void PixelScope::FillFrame(DeviceRect const &outer, DeviceRect const &inner, OS:
 void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRect const &box, bool fades) {
     if (image.empty)
         return;
-    bool const repeats = left > box.left || top > box.top || left + image.width < box.right ||
-                         top + image.height < box.bottom;
+    bool const repeats =
+        left > box.left || top > box.top || left + image.width < box.right || top + image.height < box.bottom;
     WithRepeat repeating(image.pixels, repeats);
     pixman_image_t *target = port.surface->PixmanImage();
     auto compose = [&](pixman_op_t operation, pixman_image_t *source, pixman_image_t *mask) {

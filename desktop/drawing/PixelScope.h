@@ -1,9 +1,9 @@
 // Drawing in whole device pixels.
 #pragma once
-#include <cstdint>
-#include <pixman.h>
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/PortDevice.h"
+#include <cstdint>
+#include <pixman.h>
 
 // An image as it lies in memory, and what is known of it.
 struct PixelImage {
@@ -13,8 +13,9 @@ struct PixelImage {
     bool empty = true;                // no pixel has any: there is nothing to draw
 };
 
-// The way from local coordinates onto a port's surface, for the duration of one drawing call. Cuts to the clip, and notes what has
-// been drawn on. Nothing here is anti-aliased. The state's darkening applies to everything.
+// The way from local coordinates onto a port's surface, for the duration of one drawing call. Cuts to the
+// clip, and notes what has been drawn on. Nothing here is anti-aliased. The state's darkening applies to
+// everything.
 class PixelScope {
 public:
     explicit PixelScope(DrawingPort &);
@@ -35,10 +36,11 @@ public:
     void Fill(DeviceRect const &, OS::RGBAColor const &);
     // All of the clip, without regard to darkening.
     void Cover(OS::RGBAColor const &);
-    // The four bars between the outer and the inner box, which must not reach beyond the outer. An empty inner box fills all.
+    // The four bars between the outer and the inner box, which must not reach beyond the outer. An empty
+    // inner box fills all.
     void FillFrame(DeviceRect const &outer, DeviceRect const &inner, OS::RGBAColor const &);
-    // The image with its top left corner at the given place, as far as it lies in the box; repeated without end when it is smaller
-    // than the box. Faded if the state says so and `fades` is true.
+    // The image with its top left corner at the given place, as far as it lies in the box; repeated without
+    // end when it is smaller than the box. Faded if the state says so and `fades` is true.
     void DrawImage(PixelImage const &, int left, int top, DeviceRect const &box, bool fades);
 
 private:

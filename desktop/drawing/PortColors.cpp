@@ -44,13 +44,13 @@ void SetBack(OS::RGBAColor const &color) {
         port->State().back = color;
 }
 
-// Panes choose grays for a light window: 0 for what must be read best, 100 for the paper. On a dark one the scale runs the other way
-// round, so that it stays so.
+// Panes choose grays for a light window: 0 for what must be read best, 100 for the paper. On a dark one the
+// scale runs the other way round, so that it stays so.
 OS::RGBAColor ThemeGray(int percent) {
     return ToRGBA(GrayOf(ThemeColors::IsDark() ? kWhitePercent - percent : percent));
 }
 
-}
+} // namespace
 
 void SetForegroundColor(RGBColor const &color) {
     Trace("SetForegroundColor", color);

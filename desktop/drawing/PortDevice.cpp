@@ -1,8 +1,8 @@
 #include "desktop/drawing/PortDevice.h"
-#include <vector>
 #include "desktop/drawing/ClipPath.h"
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/Surface.h"
+#include <vector>
 
 DrawingPort::Device::Device() { pixman_region32_init(&clip); }
 

@@ -1,9 +1,9 @@
 // What a port keeps about its surface between drawing calls.
 #pragma once
+#include "desktop/drawing/DrawingPort.h"
 #include <cairo.h>
 #include <cstdint>
 #include <pixman.h>
-#include "desktop/drawing/DrawingPort.h"
 
 struct DrawingPort::Device {
     Device();
@@ -13,7 +13,8 @@ struct DrawingPort::Device {
 
     void ForgetClip();
     void ForgetSurface();
-    // The boxes of the port's clip in device pixels, and the smallest box around them. Cached until ForgetClip.
+    // The boxes of the port's clip in device pixels, and the smallest box around them. Cached until
+    // ForgetClip.
     void UpdateClip(DrawingPort const &);
     // A context with the port's clip, in device pixels, without any other state that matters.
     cairo_t *UpdateContext(DrawingPort &);

@@ -1,9 +1,9 @@
 #include "host/PortSavers.h"
-#include <algorithm>
 #include "desktop/drawing/Colors.h"
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/observe/DrawingTrace.h"
+#include <algorithm>
 
 namespace {
 
@@ -12,7 +12,8 @@ constexpr int kMostDarkening = 100;
 // A port and the clip that it had.
 class KeptClip {
 public:
-    explicit KeptClip(DrawingPort *port_) : port(port_) {
+    explicit KeptClip(DrawingPort *port_)
+        : port(port_) {
         if (port_)
             clip = port_->GetClipState();
     }
@@ -27,17 +28,23 @@ private:
     ClipState clip;
 };
 
+} // namespace
+
+WithPort::WithPort()
+    : saved(OSPort::GetCurrent()) {}
+
+WithPort::WithPort(OSPort &port)
+    : WithPort() {
+    DrawingPort::MakeCurrent(static_cast<DrawingPort *>(&port));
 }
-
-WithPort::WithPort() : saved(OSPort::GetCurrent()) {}
-
-WithPort::WithPort(OSPort &port) : WithPort() { DrawingPort::MakeCurrent(static_cast<DrawingPort *>(&port)); }
 
 WithPort::~WithPort() { DrawingPort::MakeCurrent(DrawingPort::Alive(saved)); }
 
 struct SavePortAndClip::Rep {
     explicit Rep(DrawingPort *port)
-        : clip(port), originH(port ? port->OriginH() : 0), originV(port ? port->OriginV() : 0) {
+        : clip(port)
+        , originH(port ? port->OriginH() : 0)
+        , originV(port ? port->OriginV() : 0) {
         if (port)
             boundary = port->Boundary();
     }
@@ -46,7 +53,8 @@ struct SavePortAndClip::Rep {
     int originH, originV;
 };
 
-SavePortAndClip::SavePortAndClip() : rep(new Rep(DrawingPort::CurrentPort())) {}
+SavePortAndClip::SavePortAndClip()
+    : rep(new Rep(DrawingPort::CurrentPort())) {}
 
 SavePortAndClip::~SavePortAndClip() {
     DrawingPort *port = rep->clip.Port();
@@ -69,7 +77,8 @@ SaveColors::~SaveColors() {
 }
 
 struct SaveTextState::Rep {
-    explicit Rep(DrawingPort *port_) : port(port_) {
+    explicit Rep(DrawingPort *port_)
+        : port(port_) {
         if (port_) {
             family = port_->State().textFamily;
             face = port_->State().textFace;
@@ -82,7 +91,8 @@ struct SaveTextState::Rep {
     short size = 0;
 };
 
-SaveTextState::SaveTextState() : rep(new Rep(DrawingPort::CurrentPort())) {}
+SaveTextState::SaveTextState()
+    : rep(new Rep(DrawingPort::CurrentPort())) {}
 
 SaveTextState::~SaveTextState() {
     if (DrawingPort *port = rep->port.Get()) {
@@ -94,7 +104,9 @@ SaveTextState::~SaveTextState() {
 }
 
 struct WithSaveGraphicsState::Rep {
-    explicit Rep(DrawingPort &port) : clip(&port), state(port.State()) {}
+    explicit Rep(DrawingPort &port)
+        : clip(&port)
+        , state(port.State()) {}
     KeptClip clip;
     GraphicsState state;
 };
@@ -133,7 +145,8 @@ struct WithDarkenDrawMode::Rep {
     int darken;
 };
 
-// Whatever is drawn multiplies what is beneath by what the strength leaves of 100 percent; the colour of the drawing does not count.
+// Whatever is drawn multiplies what is beneath by what the strength leaves of 100 percent; the colour of the
+// drawing does not count.
 WithDarkenDrawMode::WithDarkenDrawMode(int strength, GlogStyleSheet *, Mode mode)
     : rep(new Rep{PortRef(DrawingPort::CurrentPort()), 0}) {
     if (DrawingTrace::On())

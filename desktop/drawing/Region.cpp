@@ -19,7 +19,7 @@ pixman_region32_t *Queried(OSRgn const &region) {
     return const_cast<pixman_region32_t *>(RegionAccess::Raw(region));
 }
 
-}
+} // namespace
 
 pixman_region32 *Region::Raw(OSRgn &region) { return RegionAccess::Raw(region); }
 

@@ -1,8 +1,8 @@
 // Set operations on regions, for the desktop's own use.
 #pragma once
-#include <vector>
 #include "host/Geometry.h"
 #include "host/OSRgn.h"
+#include <vector>
 
 struct pixman_region32;
 
@@ -28,4 +28,4 @@ void Translate(OSRgn &, int dh, int dv);
 bool Touches(OSRgn const &, Rect const &); // false for an empty rectangle
 bool Equal(OSRgn const &, OSRgn const &);
 
-}
+} // namespace Region

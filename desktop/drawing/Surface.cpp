@@ -50,14 +50,15 @@ bool PngSizeIsSane(std::string const &path, std::string &error) {
     return true;
 }
 
-}
+} // namespace
 
 Surface::Surface(int width_, int height_)
-    : width(std::max(width_, 1)), height(std::max(height_, 1)),
-      pixels(static_cast<std::size_t>(width) * static_cast<std::size_t>(height), kOpaqueBlack),
-      image(pixman_image_create_bits_no_clear(PIXMAN_a8r8g8b8, width, height, pixels.data(),
-                                              width * static_cast<int>(sizeof(std::uint32_t)))),
-      cairo(nullptr) {
+    : width(std::max(width_, 1))
+    , height(std::max(height_, 1))
+    , pixels(static_cast<std::size_t>(width) * static_cast<std::size_t>(height), kOpaqueBlack)
+    , image(pixman_image_create_bits_no_clear(PIXMAN_a8r8g8b8, width, height, pixels.data(),
+                                              width * static_cast<int>(sizeof(std::uint32_t))))
+    , cairo(nullptr) {
     if (!image)
         throw std::bad_alloc();
 }
@@ -86,9 +87,9 @@ bool Surface::IsOpaque() const {
 bool Surface::WritePng(std::string const &path, std::string &error) const {
     // Cairo only reads from the surface while it writes the file.
     unsigned char *data = reinterpret_cast<unsigned char *>(const_cast<std::uint32_t *>(pixels.data()));
-    CairoSurfaceHolder view(cairo_image_surface_create_for_data(
-        data, IsOpaque() ? CAIRO_FORMAT_RGB24 : CAIRO_FORMAT_ARGB32, width, height,
-        width * static_cast<int>(sizeof(std::uint32_t))));
+    CairoSurfaceHolder view(
+        cairo_image_surface_create_for_data(data, IsOpaque() ? CAIRO_FORMAT_RGB24 : CAIRO_FORMAT_ARGB32,
+                                            width, height, width * static_cast<int>(sizeof(std::uint32_t))));
     cairo_status_t status = cairo_surface_write_to_png(view.get(), path.c_str());
     if (status != CAIRO_STATUS_SUCCESS)
         error = path + ": " + cairo_status_to_string(status);
@@ -110,8 +111,8 @@ std::unique_ptr<Surface> Surface::ReadPng(std::string const &path, std::string &
         return nullptr;
     }
     cairo_surface_flush(read.get());
-    std::unique_ptr<Surface> surface(new Surface(cairo_image_surface_get_width(read.get()),
-                                                 cairo_image_surface_get_height(read.get())));
+    std::unique_ptr<Surface> surface(
+        new Surface(cairo_image_surface_get_width(read.get()), cairo_image_surface_get_height(read.get())));
     unsigned char const *from = cairo_image_surface_get_data(read.get());
     std::uint32_t const missingAlpha = format == CAIRO_FORMAT_RGB24 ? kAlphaMask : 0;
     for (int y = 0; y < surface->Height(); ++y, from += cairo_image_surface_get_stride(read.get())) {

@@ -1,16 +1,17 @@
 // A window's pixels, on which integer drawing and curves both work.
 #pragma once
+#include "desktop/drawing/DeviceScale.h"
 #include <cstddef>
 #include <cstdint>
 #include <memory>
 #include <string>
 #include <vector>
-#include "desktop/drawing/DeviceScale.h"
 
 typedef union pixman_image pixman_image_t;
 typedef struct _cairo_surface cairo_surface_t;
 
-// Device pixels, 0xAARRGGBB premultiplied, rows from top to bottom without gaps. One block of memory that pixman and Cairo share.
+// Device pixels, 0xAARRGGBB premultiplied, rows from top to bottom without gaps. One block of memory that
+// pixman and Cairo share.
 class Surface {
 public:
     // Sizes below 1 are taken as 1. The pixels start opaque black.
@@ -23,7 +24,9 @@ public:
     int Height() const { return height; }
     std::uint32_t *Pixels() { return pixels.data(); }
     std::uint32_t const *Pixels() const { return pixels.data(); }
-    std::uint32_t *Row(int y) { return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width); }
+    std::uint32_t *Row(int y) {
+        return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
+    }
     std::uint32_t const *Row(int y) const {
         return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
     }
@@ -37,8 +40,8 @@ public:
 
     // Writes a PNG file; false, with the reason in `error`, when it cannot be written.
     bool WritePng(std::string const &path, std::string &error) const;
-    // Reads a PNG file; null, with the reason in `error`, for a broken file or one of more than 8192 pixels a side. The size is
-    // checked before anything is decoded.
+    // Reads a PNG file; null, with the reason in `error`, for a broken file or one of more than 8192 pixels a
+    // side. The size is checked before anything is decoded.
     static std::unique_ptr<Surface> ReadPng(std::string const &path, std::string &error);
 
 private:

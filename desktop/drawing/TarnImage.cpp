@@ -1,8 +1,4 @@
 #include "host/TarnImage.h"
-#include <algorithm>
-#include <cstdio>
-#include <memory>
-#include <string>
 #include "desktop/drawing/AreaScale.h"
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/PixelScope.h"
@@ -10,6 +6,10 @@
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/observe/DrawingTrace.h"
 #include "desktop/resources/Resources.h"
+#include <algorithm>
+#include <cstdio>
+#include <memory>
+#include <string>
 
 namespace {
 
@@ -19,7 +19,7 @@ constexpr int kLongestScaledSide = 8192;
 
 class ThemeChangedMsg : public DependentCastMessenger<ThemeChangeNotificationProvider_Listener> {
 public:
-    void BroadcastChange(ThemeChangeNotificationProvider_Listener *listener) const override {
+    void BroadcastChange(ThemeChangeNotificationProvider_Listener *listener) override {
         listener->ThemeChanged();
     }
 };
@@ -36,7 +36,7 @@ std::string PicturePath(short id) {
     return path.empty() ? resources.Find(start + ".png") : path;
 }
 
-}
+} // namespace
 
 ThemeChangeNotificationProvider &ThemeChangeNotificationProvider::Instance() {
     static ThemeChangeNotificationProvider provider;
@@ -49,7 +49,8 @@ void ThemeChangeNotificationProvider::NotifyThemeChanged() {
 }
 
 struct PngImage::Rep {
-    explicit Rep(short id_) : id(id_) {}
+    explicit Rep(short id_)
+        : id(id_) {}
 
     // Null when there is no such picture, or it is broken.
     Surface const *Picture() {
@@ -96,7 +97,10 @@ struct PngImage::Rep {
     std::unique_ptr<Surface> picture, scaled;
 };
 
-PngImage::PngImage(short id) : rep(new Rep(id)) { DependUpon(&ThemeChangeNotificationProvider::Instance()); }
+PngImage::PngImage(short id)
+    : rep(new Rep(id)) {
+    DependUpon(&ThemeChangeNotificationProvider::Instance());
+}
 
 PngImage::~PngImage() { delete rep; }
 

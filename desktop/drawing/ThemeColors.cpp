@@ -1,7 +1,7 @@
 #include "desktop/drawing/ThemeColors.h"
+#include "desktop/drawing/NamedColorTable.h"
 #include <algorithm>
 #include <iterator>
-#include "desktop/drawing/NamedColorTable.h"
 
 namespace {
 
@@ -15,7 +15,7 @@ RGBColor *Find(std::string const &name) {
     return entry == std::end(kNamedColorTable) ? nullptr : entry->color;
 }
 
-}
+} // namespace
 
 bool ThemeColors::IsDark() {
     RGBColor const &window = kWindowBackgroundColor;

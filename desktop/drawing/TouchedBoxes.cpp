@@ -12,7 +12,7 @@ std::int64_t Area(DeviceRect const &r) { return static_cast<std::int64_t>(r.Widt
 
 std::int64_t Waste(DeviceRect const &a, DeviceRect const &b) { return Area(a.United(b)) - Area(a) - Area(b); }
 
-}
+} // namespace
 
 void TouchedBoxes::AddUncovered(DeviceRect const &box) {
     if (box.Empty())

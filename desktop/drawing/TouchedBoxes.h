@@ -1,10 +1,10 @@
 // Which device pixels have been drawn on.
 #pragma once
-#include <vector>
 #include "desktop/drawing/DeviceScale.h"
+#include <vector>
 
-// Collects boxes, merging those that overlap or adjoin closely, so that adding costs next to nothing and never more than a few
-// boxes result. The boxes cover all that was added, at times a little more.
+// Collects boxes, merging those that overlap or adjoin closely, so that adding costs next to nothing and
+// never more than a few boxes result. The boxes cover all that was added, at times a little more.
 class TouchedBoxes {
 public:
     void Add(DeviceRect const &box) {

@@ -1,6 +1,4 @@
 #include "host/VelaDrawing.h"
-#include <algorithm>
-#include <cmath>
 #include "desktop/drawing/Colors.h"
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/LineDrawing.h"
@@ -8,6 +6,8 @@
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/observe/DrawingTrace.h"
+#include <algorithm>
+#include <cmath>
 
 namespace {
 
@@ -63,7 +63,7 @@ void FillRect(Rect const &r, OS::RGBAColor GraphicsState::*color) {
         pixels.Fill(pixels.ToDevice(r), port->State().*color);
 }
 
-}
+} // namespace
 
 void VelaDrawing::GetPort(OSPort **port) { *port = Port(); }
 
@@ -161,9 +161,10 @@ void VelaDrawing::FrameRect(Rect const *r) {
         return;
     Point const pen = port->State().pen.size;
     if (pen.h > 0 && pen.v > 0)
-        pixels.FillFrame(pixels.ToDevice(*r),
-                         pixels.ToDevice(r->left + pen.h, r->top + pen.v, r->right - pen.h, r->bottom - pen.v),
-                         port->State().fore);
+        pixels.FillFrame(
+            pixels.ToDevice(*r),
+            pixels.ToDevice(r->left + pen.h, r->top + pen.v, r->right - pen.h, r->bottom - pen.v),
+            port->State().fore);
 }
 
 void VelaDrawing::PaintRect(Rect const *r) {
@@ -320,6 +321,8 @@ OS::Font::FamilyID VelaDrawing::GetPortTextFont(OSPort *port) {
     return static_cast<DrawingPort *>(port)->State().textFamily;
 }
 
-short VelaDrawing::GetPortTextSize(OSPort *port) { return static_cast<DrawingPort *>(port)->State().textSize; }
+short VelaDrawing::GetPortTextSize(OSPort *port) {
+    return static_cast<DrawingPort *>(port)->State().textSize;
+}
 
 int VelaDrawing::GetPortTextFace(OSPort *port) { return static_cast<DrawingPort *>(port)->State().textFace; }

@@ -10,11 +10,9 @@ constexpr int kGreatestPixel = std::numeric_limits<short>::max();
 // Beyond any window, and small enough to be drawn at every scale.
 constexpr double kFarthest = 4.0 * kGreatestPixel;
 
-}
+} // namespace
 
-short SaturatedPixel(int value) {
-    return static_cast<short>(std::clamp(value, kLeastPixel, kGreatestPixel));
-}
+short SaturatedPixel(int value) { return static_cast<short>(std::clamp(value, kLeastPixel, kGreatestPixel)); }
 
 short WholePixel(double value) {
     if (std::isnan(value))

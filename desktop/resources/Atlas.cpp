@@ -54,7 +54,9 @@ private:
 class AtlasCheck {
 public:
     AtlasCheck(std::string const &path_, unsigned char const *bytes_, std::size_t size_)
-        : path(path_), bytes(bytes_), size(size_) {}
+        : path(path_)
+        , bytes(bytes_)
+        , size(size_) {}
 
     void Run() {
         CheckHeader();
@@ -78,8 +80,8 @@ private:
             Fail(path, "an icon atlas of version " + std::to_string(header->version) + "; this is version " +
                            std::to_string(kVersion));
         if (header->fileSize != size)
-            Fail(path, std::to_string(size) + " bytes long; its header says " +
-                           std::to_string(header->fileSize));
+            Fail(path,
+                 std::to_string(size) + " bytes long; its header says " + std::to_string(header->fileSize));
         if (header->scaleThousandths < kLeastScale || header->scaleThousandths > kGreatestScale)
             Fail(path, "scale " + std::to_string(header->scaleThousandths) + "/1000 is not from 0.5 to 4");
     }
@@ -148,7 +150,7 @@ private:
     Header const *header = nullptr;
 };
 
-}
+} // namespace
 
 Atlas::Atlas(std::string const &path) {
     MappedFile file(path);

@@ -5,12 +5,12 @@
 #include <cstdint>
 #include <string>
 
-// Everything in the file has been checked once the constructor is done, so that the records and pixels it gives can be used as they
-// are. What it gives points into the file, and lives as long as the atlas.
+// Everything in the file has been checked once the constructor is done, so that the records and pixels it
+// gives can be used as they are. What it gives points into the file, and lives as long as the atlas.
 class Atlas {
 public:
-    // Throws std::runtime_error, with the file's name and what is wrong, for a file that cannot be read, that is not an atlas of
-    // this version and byte order, or that has anything out of order or range.
+    // Throws std::runtime_error, with the file's name and what is wrong, for a file that cannot be read, that
+    // is not an atlas of this version and byte order, or that has anything out of order or range.
     explicit Atlas(std::string const &path);
     ~Atlas();
     Atlas(Atlas const &) = delete;
