@@ -13,6 +13,12 @@ namespace {
 
 DrawingPort *Port() { return DrawingPort::CurrentPort(); }
 
+// Of no port: the state that every port starts with.
+GraphicsState const &TextState(OSPort *port) {
+    static GraphicsState const initial;
+    return port ? static_cast<DrawingPort *>(port)->State() : initial;
+}
+
 void Trace(char const *operation) {
     if (DrawingTrace::On())
         DrawingTrace::Write(DrawingTrace::Call(operation));

@@ -53,6 +53,9 @@ void DesktopRep::DeleteDisposed() {
         delete glog;
         i = 0; // a pane's destructor may have disposed of another one
     }
+    // As long as there is a glog, some port is current.
+    if (!DrawingPort::CurrentPort() && !glogs.empty())
+        DrawingPort::MakeCurrent(&glogs.back()->Port());
 }
 
 void DesktopRep::UpdateAll() {

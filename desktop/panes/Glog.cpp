@@ -56,6 +56,9 @@ Glog::Glog(Desktop &desktop_, GlogOptions const &options_)
       height(std::clamp(options_.height, 1, kMaxSide)) {
     port.SetExtent(width, height);
     port.SetScreenPlace([this] { return window ? window->ScreenPlace() : Point{0, 0}; });
+    // Panes measure text while they are being made, before anything is prepared or drawn.
+    if (!DrawingPort::CurrentPort())
+        DrawingPort::MakeCurrent(&port);
     DamageAll();
 }
 
