@@ -324,11 +324,11 @@ void VelaDrawing::TextFace(short face) {
 }
 
 OS::Font::FamilyID VelaDrawing::GetPortTextFont(OSPort *port) {
-    return static_cast<DrawingPort *>(port)->State().textFamily;
+    return TextState(port).textFamily;
 }
 
 short VelaDrawing::GetPortTextSize(OSPort *port) {
-    return static_cast<DrawingPort *>(port)->State().textSize;
+    return TextState(port).textSize;
 }
 
-int VelaDrawing::GetPortTextFace(OSPort *port) { return static_cast<DrawingPort *>(port)->State().textFace; }
+int VelaDrawing::GetPortTextFace(OSPort *port) { return TextState(port).textFace; }
