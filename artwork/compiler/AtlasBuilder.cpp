@@ -92,14 +92,14 @@ AtlasFormat::IconRecord AtlasBuilder::DrawIcon(IconRenderer const &renderer, Ico
 
 AtlasFormat::ImageRecord AtlasBuilder::Store(RenderedImage const &image) {
     std::size_t const offset = blocks.size();
-    std::size_t const size = image.pixels.size() * AtlasFormat::kBytesPerPixel;
+    std::size_t const size = image.Pixels().size() * AtlasFormat::kBytesPerPixel;
     blocks.resize(Align(offset + size));
-    std::memcpy(blocks.data() + offset, image.pixels.data(), size);
+    std::memcpy(blocks.data() + offset, image.Pixels().data(), size);
     if (blocks.size() > std::numeric_limits<std::uint32_t>::max())
         throw ArtworkError("the atlas of theme " + theme.Name() + " is larger than 4 GiB");
     std::uint16_t const flags =
         static_cast<std::uint16_t>((image.IsOpaque() ? AtlasFormat::kImageOpaque : 0) |
                                    (image.IsEmpty() ? AtlasFormat::kImageEmpty : 0));
-    return {static_cast<std::uint32_t>(offset), static_cast<std::uint16_t>(image.width),
-            static_cast<std::uint16_t>(image.height), flags, 0};
+    return {static_cast<std::uint32_t>(offset), static_cast<std::uint16_t>(image.Width()),
+            static_cast<std::uint16_t>(image.Height()), flags, 0};
 }

@@ -26,6 +26,11 @@ constexpr int kOvalPressed = 3;
 constexpr int kStudFamily = 1004;
 constexpr int kStudPressed = 3;
 constexpr int kStudDisabled = 6;
+constexpr int kFaceFamily = 1608;
+constexpr int kNoteFamily = 1821;
+// Where a mark stands on a stock frame.
+constexpr double kMarkLeft = 8;
+constexpr double kMarkTop = 1;
 
 constexpr char kBackground[] = "kWindowBackgroundColor";
 constexpr char kText[] = "kDialogActiveTextColor";
@@ -45,14 +50,12 @@ ContactSheet::ContactSheet(std::vector<IconFamily> const &f, Theme const &t, dou
 
 void ContactSheet::Write(std::filesystem::path const &png) {
     Size const size = Draw(nullptr);
-    std::unique_ptr<cairo_surface_t, void (*)(cairo_surface_t *)> const surface(
-        cairo_image_surface_create(CAIRO_FORMAT_RGB24, int(ToDevice(size.width)), int(ToDevice(size.height))),
-        cairo_surface_destroy);
+    RenderedImage image(int(ToDevice(size.width)), int(ToDevice(size.height)));
+    RenderedImage::Surface const surface = image.MakeSurface();
     std::unique_ptr<cairo_t, void (*)(cairo_t *)> const context(cairo_create(surface.get()), cairo_destroy);
     Draw(context.get());
-    cairo_status_t const status = cairo_surface_write_to_png(surface.get(), png.c_str());
-    if (status != CAIRO_STATUS_SUCCESS)
-        throw ArtworkError(png.string() + ": " + cairo_status_to_string(status));
+    cairo_surface_flush(surface.get());
+    image.WritePng(png);
 }
 
 ContactSheet::Size ContactSheet::Draw(cairo_t *context) const {
@@ -64,6 +67,7 @@ ContactSheet::Size ContactSheet::Draw(cairo_t *context) const {
     for (IconFamily const &family : families)
         top += DrawFamily(context, family, top).height + kMargin;
     top += DrawAssembledButtons(context, top).height;
+    top += DrawFramedNotes(context, top).height;
     return {kSheetWidth, top};
 }
 
@@ -120,10 +124,8 @@ ContactSheet::Size ContactSheet::DrawAssembledButtons(cairo_t *context, double t
 
 void ContactSheet::DrawAssembledButton(cairo_t *context, int number, int first, double left, double top,
                                        int width, std::string const &label, char const *textColour) const {
-    auto const family = std::find_if(families.begin(), families.end(),
-                                     [&](IconFamily const &f) { return f.Number() == number; });
-    if (family == families.end() || !family->Find(first) || !family->Find(first + 1) ||
-        !family->Find(first + 2))
+    IconFamily const *const family = FindFamily(number);
+    if (!family || !family->Find(first) || !family->Find(first + 1) || !family->Find(first + 2))
         return;
     IconFamily::Icon const &middle = *family->Find(first + 1);
     int const cap = family->Find(first)->width;
@@ -148,15 +150,34 @@ void ContactSheet::DrawAssembledButton(cairo_t *context, int number, int first, 
              middleLine + (font.ascent - font.descent) / scale / 2, kButtonSize, textColour);
 }
 
+ContactSheet::Size ContactSheet::DrawFramedNotes(cairo_t *context, double top) const {
+    IconFamily const *const faces = FindFamily(kFaceFamily);
+    IconFamily const *const notes = FindFamily(kNoteFamily);
+    if (context && faces && notes) {
+        double left = kMargin;
+        std::size_t next = 0;
+        for (IconFamily::Icon const &note : notes->Icons()) {
+            IconFamily::Icon const &face = faces->Icons()[next++ % faces->Icons().size()];
+            DrawIcon(context, *faces, face, left, top);
+            DrawIcon(context, *notes, note, left + kMarkLeft, top + kMarkTop);
+            left += face.width + kCellGap;
+        }
+    }
+    return {kSheetWidth, kButtonRow};
+}
+
+IconFamily const *ContactSheet::FindFamily(int number) const {
+    auto const found = std::find_if(families.begin(), families.end(),
+                                    [&](IconFamily const &family) { return family.Number() == number; });
+    return found == families.end() ? nullptr : &*found;
+}
+
 void ContactSheet::DrawIcon(cairo_t *context, IconFamily const &family, IconFamily::Icon const &icon,
                             double left, double top) const {
     int const width = int(ToDevice(left + icon.width) - ToDevice(left));
     int const height = int(ToDevice(top + icon.height) - ToDevice(top));
     RenderedImage image = IconRenderer(family, theme).Render(icon, width, height);
-    std::unique_ptr<cairo_surface_t, void (*)(cairo_surface_t *)> const surface(
-        cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(image.pixels.data()),
-                                            CAIRO_FORMAT_ARGB32, width, height, width * 4),
-        cairo_surface_destroy);
+    RenderedImage::Surface const surface = image.MakeSurface();
     cairo_set_source_surface(context, surface.get(), ToDevice(left), ToDevice(top));
     cairo_paint(context);
     // The image dies with this call, and the context would keep pointing to it.

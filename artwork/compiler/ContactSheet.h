@@ -25,6 +25,9 @@ private:
     Size DrawAssembledButtons(cairo_t *context, double top) const;
     void DrawAssembledButton(cairo_t *context, int family, int firstIndex, double left, double top, int width,
                              std::string const &label, char const *textColour) const;
+    // A row of stock frames, each with the next note glyph as its mark.
+    Size DrawFramedNotes(cairo_t *context, double top) const;
+    IconFamily const *FindFamily(int number) const; // null when there is none
     void DrawIcon(cairo_t *context, IconFamily const &, IconFamily::Icon const &, double left,
                   double top) const;
     void DrawText(cairo_t *context, std::string const &text, double left, double baseline, double size,

@@ -4,10 +4,8 @@
 #include "artwork/compiler/AtlasBuilder.h"
 #include "artwork/compiler/ContactSheet.h"
 #include <CLI/CLI.hpp>
-#include <cairo.h>
 #include <cmath>
 #include <fstream>
-#include <memory>
 #include <ostream>
 
 namespace {
@@ -27,6 +25,14 @@ struct Options {
     std::vector<double> scales{1, 1.25, 1.5, 2, 3};
     bool listUndrawn = false;
 };
+
+// A message when the text is no usable scale; a plain range would let "nan" through.
+std::string CheckScale(std::string const &text) {
+    double scale = 0;
+    if (CLI::detail::lexical_cast(text, scale) && scale >= kLeastScale && scale <= kGreatestScale)
+        return {};
+    return text + " is no scale from 0.5 to 4";
+}
 
 int Thousandths(double scale) { return static_cast<int>(std::lround(scale * 1000)); }
 
@@ -49,16 +55,6 @@ void WriteAtlases(ArtworkSource const &source, Options const &options) {
         }
 }
 
-void WritePicture(RenderedImage &image, std::filesystem::path const &path) {
-    std::unique_ptr<cairo_surface_t, void (*)(cairo_surface_t *)> const surface(
-        cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(image.pixels.data()),
-                                            CAIRO_FORMAT_ARGB32, image.width, image.height,
-                                            image.width * AtlasFormat::kBytesPerPixel),
-        cairo_surface_destroy);
-    if (cairo_surface_write_to_png(surface.get(), path.c_str()) != CAIRO_STATUS_SUCCESS)
-        throw ArtworkError(path.string() + ": cannot be written");
-}
-
 void WritePictures(ArtworkSource const &source, Options const &options) {
     for (Theme const &theme : source.Themes()) {
         std::filesystem::path const folder =
@@ -70,7 +66,7 @@ void WritePictures(ArtworkSource const &source, Options const &options) {
                 RenderedImage image =
                     IconRenderer(picture, theme).Render(icon, icon.width * scale, icon.height * scale);
                 std::string const suffix = scale == 1 ? "" : "@" + std::to_string(scale) + "x";
-                WritePicture(image, folder / (std::to_string(picture.Number()) + suffix + ".png"));
+                image.WritePng(folder / (std::to_string(picture.Number()) + suffix + ".png"));
             }
     }
 }
@@ -104,7 +100,7 @@ int RunGlogArtwork(int argc, char const *const *argv, std::ostream &out, std::os
     app.add_option("source", options.source, "artwork folder with icons/, pictures/ and themes/")->required();
     app.add_option("--out", options.output, "folder that gets the atlases and pictures");
     app.add_option("--scale", options.scales, "device pixels per logical pixel; of the sheet, the first")
-        ->check(CLI::Range(kLeastScale, kGreatestScale));
+        ->check(CheckScale);
     app.add_option("--sheet", options.sheet, "PNG file that gets every icon with its number");
     app.add_option("--theme", options.theme, "theme of the sheet");
     app.add_flag("--undrawn", options.listUndrawn, "list the icons of icons/index.xml that have no drawing");

@@ -1,7 +1,6 @@
 #include "artwork/compiler/IconRenderer.h"
 #include "artwork/compiler/ArtworkError.h"
 #include "artwork/compiler/GridFit.h"
-#include <algorithm>
 #include <cairo.h>
 #include <cstdio>
 #include <librsvg/rsvg.h>
@@ -11,16 +10,12 @@
 namespace {
 
 constexpr char kFrameClass[] = "frame";
-constexpr std::uint32_t kAlphaMask = 0xff000000;
 
 struct ReleaseHandle {
     void operator()(RsvgHandle *handle) const { g_object_unref(handle); }
 };
 struct ReleaseError {
     void operator()(GError *error) const { g_error_free(error); }
-};
-struct ReleaseSurface {
-    void operator()(cairo_surface_t *surface) const { cairo_surface_destroy(surface); }
 };
 struct ReleaseContext {
     void operator()(cairo_t *context) const { cairo_destroy(context); }
@@ -46,15 +41,6 @@ std::string HexColour(Theme::Colour colour) {
 
 } // namespace
 
-bool RenderedImage::IsOpaque() const {
-    return std::all_of(pixels.begin(), pixels.end(),
-                       [](std::uint32_t p) { return (p & kAlphaMask) == kAlphaMask; });
-}
-
-bool RenderedImage::IsEmpty() const {
-    return std::all_of(pixels.begin(), pixels.end(), [](std::uint32_t p) { return (p & kAlphaMask) == 0; });
-}
-
 IconRenderer::IconRenderer(IconFamily const &f, Theme const &t)
     : family(f)
     , theme(t) {}
@@ -67,11 +53,8 @@ RenderedImage IconRenderer::Render(IconFamily::Icon const &icon, int deviceWidth
     if (!handle)
         FailWith(error, family, icon);
 
-    RenderedImage image{deviceWidth, deviceHeight, {}};
-    image.pixels.resize(static_cast<std::size_t>(deviceWidth) * static_cast<std::size_t>(deviceHeight));
-    std::unique_ptr<cairo_surface_t, ReleaseSurface> const surface(
-        cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(image.pixels.data()),
-                                            CAIRO_FORMAT_ARGB32, deviceWidth, deviceHeight, deviceWidth * 4));
+    RenderedImage image(deviceWidth, deviceHeight);
+    RenderedImage::Surface const surface = image.MakeSurface();
     std::unique_ptr<cairo_t, ReleaseContext> const context(cairo_create(surface.get()));
     RsvgRectangle const viewport{0, 0, double(deviceWidth), double(deviceHeight)};
     if (!rsvg_handle_render_document(handle.get(), context.get(), &viewport, &error))

@@ -1,18 +1,8 @@
 #pragma once
 #include "artwork/compiler/IconFamily.h"
+#include "artwork/compiler/RenderedImage.h"
 #include "artwork/compiler/Theme.h"
-#include <cstdint>
-#include <vector>
-
-// A drawn picture: premultiplied 0xAARRGGBB, row after row without gaps.
-struct RenderedImage {
-    int width; // device pixels
-    int height;
-    std::vector<std::uint32_t> pixels;
-
-    bool IsOpaque() const;
-    bool IsEmpty() const;
-};
+#include <string>
 
 // Draws icons of one family in the colours of one theme.
 class IconRenderer {

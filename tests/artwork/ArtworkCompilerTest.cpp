@@ -328,6 +328,7 @@ TEST(ArtworkCompiler, AnswersABadCommandLineWithStatusTwo) {
     SampleArtwork sample;
     EXPECT_EQ(2, RunCompiler(sample.Folder(), {}).status);
     EXPECT_EQ(2, RunCompiler(sample.Folder(), {"--undrawn", "--scale", "99"}).status);
+    EXPECT_EQ(2, RunCompiler(sample.Folder(), {"--undrawn", "--scale", "nan"}).status);
     EXPECT_EQ(2, RunCompiler(sample.Folder(), {"--polish"}).status);
 }
 
