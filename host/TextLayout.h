@@ -35,6 +35,7 @@ private:
     TextLayout(TextLayout const &);
     TextLayout &operator=(TextLayout const &);
 
+    friend struct TextLayoutAccess;
     struct Rep;
     Rep *rep;
 };

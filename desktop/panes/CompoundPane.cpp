@@ -89,8 +89,9 @@ short CompoundPane::AddGuts(GlogPane *pane, short position) {
     if (pane->GetGlog() != glog)
         PaneAccess::Adopt(*pane, glog);
     auto &list = compoundRep->subpanes;
-    auto place = position < 0 || position > NumSubpanes() ? list.end() : list.begin() + position;
-    return static_cast<short>(list.insert(place, pane) - list.begin());
+    short const index = position < 0 || position > NumSubpanes() ? NumSubpanes() : position;
+    list.insert(list.begin() + index, pane);
+    return index;
 }
 
 void CompoundPane::Del(short index) {

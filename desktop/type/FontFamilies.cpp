@@ -13,7 +13,7 @@ std::string &DialogFamily() {
     return family;
 }
 
-}
+} // namespace
 
 OS::Font::FamilyID FontFamilies::Named(std::string const &name) {
     OS::Font::FamilyID family;
@@ -49,9 +49,11 @@ void FontFamilies::SetDialogFamily(std::string const &name) { DialogFamily() = n
 namespace OS {
 namespace Font {
 
-FamilyID::FamilyID() : rep(nullptr) {}
+FamilyID::FamilyID()
+    : rep(nullptr) {}
 
-FamilyID::FamilyID(FixedFontFamily) : rep(nullptr) {}
+FamilyID::FamilyID(FixedFontFamily)
+    : rep(nullptr) {}
 
 FamilyID::FamilyID(FamilyID const &) = default;
 
@@ -66,5 +68,5 @@ FamilyID &FamilyID::operator=(FixedFontFamily) {
 
 unsigned int FamilyID::GetOrderedFontID() const { return rep ? rep->number : 0; }
 
-}
-}
+} // namespace Font
+} // namespace OS

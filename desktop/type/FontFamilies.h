@@ -1,11 +1,11 @@
 // Font families by name.
 #pragma once
+#include "host/OSFont.h"
 #include <deque>
 #include <string>
-#include "host/OSFont.h"
 
-// Gives each family name one number for as long as the program runs. Number 0 is the family of dialog text, which is the family of
-// the font table's entry 0.
+// Gives each family name one number for as long as the program runs. Number 0 is the family of dialog text,
+// which is the family of the font table's entry 0.
 class FontFamilies {
 public:
     // The family of that name; an empty one is the family of dialog text.

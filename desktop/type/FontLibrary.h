@@ -1,10 +1,12 @@
 // The fonts that text is shaped with.
 #pragma once
+#include "desktop/type/FontSpec.h"
+#include "desktop/type/FontTable.h"
+#include <cstddef>
+#include <cstdint>
 #include <string>
 #include <unordered_map>
 #include <vector>
-#include "desktop/type/FontSpec.h"
-#include "desktop/type/FontTable.h"
 
 typedef struct _FcConfig FcConfig;
 typedef struct _PangoContext PangoContext;
@@ -19,9 +21,9 @@ struct FontMetrics {
     int LineHeight() const { return ascent + descent; }
 };
 
-// One for the process. It knows the font files of the font table alone, so that text looks the same on every machine and is there
-// at once; a face's files are opened when the face is first used. When a text has characters that they lack, the system's fonts are
-// added behind them.
+// One for the process. It knows the font files of the font table alone, so that text looks the same on every
+// machine and is there at once; a face's files are opened when the face is first used. When a text has
+// characters that they lack, the system's fonts are added behind them.
 class FontLibrary {
 public:
     static FontLibrary &Instance();
@@ -34,7 +36,8 @@ public:
 
     // Adds the system's fonts; false when they had been added before.
     bool AddSystemFonts();
-    // Grows whenever text that was shaped before may look different if shaped again. Call it before using what was kept.
+    // Grows whenever text that was shaped before may look different if shaped again. Call it before using
+    // what was kept.
     unsigned int Generation();
 
 private:
@@ -49,11 +52,11 @@ private:
     void Open();
     void Close();
     void LoadFace(int faceBits);
+    void UseConfig(FcConfig *);
     Font &Find(FontSpec const &);
 
     std::vector<FontFile> files;
-    unsigned int loadedFaces = 0; // bit n: the files of face n are loaded
-    bool anyFile = false;
+    std::uint64_t loadedFaces = 0; // bit n: the files of face n are loaded
     bool systemFonts = false;
     FcConfig *config = nullptr;
     PangoFontMap *map = nullptr;

@@ -6,7 +6,7 @@ namespace FontFace {
 enum Bit { kBold = 1, kItalic = 2, kUnderline = 4, kCondensed = 32 };
 // Those that other font files stand for.
 constexpr int kFileBits = kBold | kItalic | kCondensed;
-}
+} // namespace FontFace
 
 // A font made comparable: equal specs give equal text.
 struct FontSpec {

@@ -1,8 +1,8 @@
 #include "desktop/type/FontTable.h"
-#include <filesystem>
-#include <sstream>
 #include "desktop/resources/ResourceTable.h"
 #include "desktop/type/FontSpec.h"
+#include <filesystem>
+#include <sstream>
 
 namespace {
 
@@ -24,7 +24,8 @@ int FaceOfWord(XmlFile const &file, XmlNode const &node, std::string const &word
         if (word == known.word)
             return known.bit;
     }
-    throw file.ErrorAt(node, "\"" + word + "\" is no style; plain, bold, italic, underline and condensed are");
+    throw file.ErrorAt(node,
+                       "\"" + word + "\" is no style; plain, bold, italic, underline and condensed are");
 }
 
 int FaceOf(XmlFile const &file, XmlNode const &node) {
@@ -36,7 +37,7 @@ int FaceOf(XmlFile const &file, XmlNode const &node) {
     return face;
 }
 
-}
+} // namespace
 
 void FontTable::Read(XmlFile const &file) {
     file.RequireRoot("fonts");

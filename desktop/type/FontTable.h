@@ -1,9 +1,9 @@
 // The application's font table and the font files it draws on.
 #pragma once
+#include "desktop/resources/XmlFile.h"
 #include <map>
 #include <string>
 #include <vector>
-#include "desktop/resources/XmlFile.h"
 
 struct FontFile {
     std::string path;
@@ -11,9 +11,9 @@ struct FontFile {
     bool operator==(FontFile const &other) const { return path == other.path && face == other.face; }
 };
 
-// From fonts.xml: <fonts directory="..."> with <file name="..." style="bold"/> and <font index="0" family="..." size="12"
-// style="plain"/>. A style is "plain", also when absent, or some of "bold", "italic", "underline" and "condensed". Files are relative to
-// the directory, the directory to the XML file's own.
+// From fonts.xml: <fonts directory="..."> with <file name="..." style="bold"/> and <font index="0"
+// family="..." size="12" style="plain"/>. A style is "plain", also when absent, or some of "bold", "italic",
+// "underline" and "condensed". Files are relative to the directory, the directory to the XML file's own.
 class FontTable {
 public:
     struct Entry {

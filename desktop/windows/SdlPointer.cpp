@@ -19,7 +19,8 @@ static int ButtonOf(int sdlButton) {
 
 static unsigned int Bit(int button) { return 1U << button; }
 
-SdlPointer::SdlPointer(InputQueue &queue_) : queue(queue_) {}
+SdlPointer::SdlPointer(InputQueue &queue_, std::vector<SdlWindow *> const &windows)
+    : queue(queue_), sdlCapture(windows) {}
 
 SdlWindow *SdlPointer::Target(SdlWindow *window) const {
     if (capture != nullptr)
@@ -85,7 +86,10 @@ void SdlPointer::Press(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent
     SetScreenPlace(window, press.x, press.y);
     Enter(event, target);
     pressWindow = target;
+    bool first = held == 0;
     held |= Bit(button);
+    if (first)
+        HoldCapture();
     clicks = CountClicks(target, press.clicks);
     event.button = button;
     event.clicks = clicks;
@@ -119,9 +123,11 @@ void SdlPointer::ReleaseAll(InputEvent event) {
     EndCapture();
 }
 
+void SdlPointer::HoldCapture() { sdlCapture.Hold(capture != nullptr); }
+
 void SdlPointer::EndCapture() {
     if (held == 0 && capture == nullptr)
-        SDL_CaptureMouse(SDL_FALSE);
+        sdlCapture.End();
 }
 
 // Up is positive for SDL and for us, right is positive for SDL and left for us.
@@ -142,16 +148,17 @@ void SdlPointer::Leave(InputEvent event, SdlWindow *window) {
     hover = nullptr;
 }
 
-// SDL refuses while none of our windows is active. A held button then keeps the X server's own capture, and Recapture follows.
 void SdlPointer::Recapture() {
     if (held != 0 || capture != nullptr)
-        SDL_CaptureMouse(SDL_TRUE);
+        HoldCapture();
 }
 
 void SdlPointer::Capture(InputEvent event, SdlWindow *window) {
+    if (capture == window)
+        return;
     capture = window;
     if (window != nullptr) {
-        SDL_CaptureMouse(SDL_TRUE);
+        HoldCapture();
         return;
     }
     if (held != 0)
@@ -171,5 +178,6 @@ void SdlPointer::Forget(SdlWindow const *window) {
     }
     if (capture == window)
         capture = nullptr;
+    sdlCapture.Forget(window);
     EndCapture();
 }

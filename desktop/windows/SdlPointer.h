@@ -1,6 +1,8 @@
 // The mouse of an X server.
 #pragma once
+#include <vector>
 #include "desktop/windows/InputQueue.h"
+#include "desktop/windows/SdlCapture.h"
 
 struct SDL_MouseButtonEvent;
 struct SDL_MouseMotionEvent;
@@ -13,7 +15,8 @@ class SdlWindow;
 // The calls take the event with its time and modifiers filled in, and the window that SDL names; null for none of ours.
 class SdlPointer {
 public:
-    explicit SdlPointer(InputQueue &);
+    // `windows`: those that there are, at any time.
+    SdlPointer(InputQueue &, std::vector<SdlWindow *> const &windows);
 
     void Move(InputEvent, SdlWindow *, SDL_MouseMotionEvent const &);
     // Other buttons than the three are not reported.
@@ -38,9 +41,11 @@ private:
     void LeaveIfOutside(InputEvent);
     int CountClicks(SdlWindow *, int sdlClicks);
     void ReleaseButton(InputEvent, int button);
+    void HoldCapture();
     void EndCapture();
 
     InputQueue &queue;
+    SdlCapture sdlCapture;
     SdlWindow *capture = nullptr;     // set by Capture
     SdlWindow *pressWindow = nullptr; // while a button is held
     SdlWindow *hover = nullptr;       // has been told of the pointer and not that it left

@@ -39,7 +39,7 @@ SdlWindow::SdlWindow(SdlWindowSystem &system_, WindowSpec const &spec, DeviceSca
     , width(std::max(spec.width, 1))
     , height(std::max(spec.height, 1))
     , limits()
-    , placed(spec.placed)
+    , placePending(spec.placed)
     , placeH(spec.h)
     , placeV(spec.v) {
     system.Add(this);
@@ -89,13 +89,15 @@ void SdlWindow::SetScale(DeviceScale newScale) {
     SetContentSize(width, height);
 }
 
-void SdlWindow::Show() {
-    SDL_ShowWindow(window);
-    // The window manager placed the frame where the content was to be; only now is the frame's size known.
-    if (placed)
+void SdlWindow::CorrectPlace() {
+    if (!placePending)
+        return;
+    placePending = false;
+    if (ScreenX() != scale.Edge(placeH) || ScreenY() != scale.Edge(placeV))
         SetPlace(placeH, placeV);
-    placed = false;
 }
+
+void SdlWindow::Show() { SDL_ShowWindow(window); }
 
 void SdlWindow::Hide() { SDL_HideWindow(window); }
 
@@ -104,7 +106,7 @@ void SdlWindow::Raise() { SDL_RaiseWindow(window); }
 void SdlWindow::SetTitle(std::string const &utf8) { SDL_SetWindowTitle(window, utf8.c_str()); }
 
 void SdlWindow::SetPlace(int h, int v) {
-    placed = (SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) != 0;
+    placePending = (SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) != 0;
     placeH = h;
     placeV = v;
     SDL_SetWindowPosition(window, scale.Edge(h), scale.Edge(v));

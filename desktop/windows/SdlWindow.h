@@ -30,6 +30,9 @@ public:
     int ContentV(int screenY) const { return scale.ToLogical(screenY - ScreenY()); }
     bool Contains(int h, int v) const { return h >= 0 && v >= 0 && h < width && v < height; }
 
+    // The window manager has shown the window, and its frame's size is known: brings the content, not the frame, to the place that
+    // was asked for.
+    void CorrectPlace();
     // Looks at the size that the window has come to; whether it is another one in logical pixels.
     bool TakeSize();
     // Keeps the logical size, and so asks for another one in device pixels.
@@ -68,7 +71,7 @@ private:
     DeviceScale scale;
     int width, height; // logical pixels
     SizeLimits limits;
-    bool placed; // until the first Show: `placeH` and `placeV` wait for the frame
+    bool placePending; // `placeH` and `placeV` wait for the frame
     int placeH, placeV;
     std::vector<SDL_Rect> updated; // of one Present; kept for its memory
 };

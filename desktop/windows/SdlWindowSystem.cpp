@@ -10,7 +10,7 @@ static double const kLongestBlock = 3600.0;    // seconds; SDL counts millisecon
 static double const kInputMethodInterval = 0.1; // seconds
 
 SdlWindowSystem::SdlWindowSystem(double forcedScale_)
-    : start(SDL_GetPerformanceCounter()), forcedScale(forcedScale_), pointer(queue), keyboard(queue) {}
+    : start(SDL_GetPerformanceCounter()), forcedScale(forcedScale_), pointer(queue, windows), keyboard(queue) {}
 
 SdlWindowSystem::~SdlWindowSystem() {
     if (waker != nullptr)
@@ -199,9 +199,11 @@ void SdlWindowSystem::TranslateWindowEvent(SDL_WindowEvent const &event) {
         return; // events of destroyed windows still arrive
     switch (event.event) {
     case SDL_WINDOWEVENT_EXPOSED:
+        window->CorrectPlace();
         Send(InputEvent::kExposed, window);
         break;
     case SDL_WINDOWEVENT_MOVED:
+        window->CorrectPlace();
         Send(InputEvent::kMoved, window);
         break;
     case SDL_WINDOWEVENT_SIZE_CHANGED:

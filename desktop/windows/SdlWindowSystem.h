@@ -70,12 +70,12 @@ private:
     std::uint64_t const start; // of the clock
     double forcedScale;
     SdlDisplayScale displayScale;
+    std::vector<SdlWindow *> windows; // in the order of their making
     InputQueue queue;
     InputState state;
     SdlPointer pointer;
     SdlKeyboard keyboard;
     SdlCursors cursors;
-    std::vector<SdlWindow *> windows; // in the order of their making
     SDL_Window *waker = nullptr;      // see OpenWaker
     bool activationLost = false;      // since the last Pump
 };

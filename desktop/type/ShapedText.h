@@ -1,0 +1,82 @@
+// A text turned into glyphs and lines.
+#pragma once
+#include "desktop/type/FontSpec.h"
+#include "host/Geometry.h"
+#include "host/TextSettings.h"
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+typedef struct _cairo cairo_t;
+typedef struct _PangoLayout PangoLayout;
+typedef struct _PangoLayoutLine PangoLayoutLine;
+
+// All that shaping depends on beside the text.
+struct TextShape {
+    static constexpr int kUnlimited = -1;
+
+    FontSpec font;
+    float spacing = 0;  // extra logical pixels between characters
+    bool wraps = false; // lines break where the text says and, with a width, where it is reached
+    TextSettings::TruncateCode truncation = TextSettings::kTruncateNone;
+    int width = kUnlimited;  // where lines break, or the text is shortened; logical pixels
+    int height = kUnlimited; // where a text that both wraps and is shortened ends
+
+    // Cuts the spacing to what makes sense; what is not a number is 0.
+    static float CleanSpacing(float);
+
+    bool operator==(TextShape const &other) const {
+        return font == other.font && spacing == other.spacing && wraps == other.wraps &&
+               truncation == other.truncation && width == other.width && height == other.height;
+    }
+};
+
+// Glyphs, lines and measures of one text; never changes. Measures are whole logical pixels.
+class ShapedText {
+public:
+    ShapedText(std::u16string_view, TextShape const &);
+    ~ShapedText();
+    ShapedText(ShapedText const &) = delete;
+    ShapedText &operator=(ShapedText const &) = delete;
+
+    // False once shaping anew may give something else.
+    bool IsCurrent() const;
+
+    int Width() const { return width; } // of the widest line
+    int InkWidth() const { return inkRight > inkLeft ? inkRight - inkLeft : 0; }
+    int LineCount() const { return static_cast<int>(lines.size()); }
+    int Ascent() const { return ascent; }
+    int LineHeight() const { return lineHeight; }
+    int Height() const { return LineCount() * lineHeight; }
+    // Whether the first line is written from right to left.
+    bool IsRightToLeft() const { return rightToLeft; }
+
+    // How far ink reaches beyond the box of all lines, which begins at the first line's ascent and is as wide
+    // as Width.
+    int Overhang() const { return overhang; }
+
+    // Draws with the first baseline at the point, each line placed within `boxWidth` from it.
+    void Draw(cairo_t *, int h, int baseline, int boxWidth, TextSettings::Alignment) const;
+    // Where a line of that width begins within the box, counted from its left edge; negative when it is
+    // centred or right and too wide.
+    static int LineStart(int lineWidth, int boxWidth, TextSettings::Alignment, bool rightToLeft);
+
+private:
+    struct Line {
+        PangoLayoutLine *glyphs; // the layout's
+        int width;
+        bool rightToLeft;
+    };
+    void Shape(std::u16string_view, TextShape const &);
+    void MeasureLines();
+
+    PangoLayout *layout = nullptr;
+    std::vector<Line> lines;
+    int width = 0;
+    int inkLeft = 0, inkRight = 0; // from the line starts
+    int ascent = 0, lineHeight = 0;
+    int overhang = 0;
+    bool rightToLeft = false;
+    unsigned int generation = 0;
+};

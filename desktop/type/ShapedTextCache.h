@@ -1,0 +1,15 @@
+// Shaped texts for the calls that bring no layout of their own.
+#pragma once
+#include "desktop/type/ShapedText.h"
+#include <string_view>
+
+namespace ShapedTextCache {
+
+// The text in that shape. Valid until the next call.
+ShapedText const &Get(std::u16string_view, TextShape const &);
+// The text in one line, shortened as the shape says only if it is wider than the shape's width.
+ShapedText const &GetFitted(std::u16string_view, TextShape const &);
+// Width of the whole text in one line, as Get would give it.
+int Width(std::u16string_view, TextShape const &);
+
+} // namespace ShapedTextCache
