@@ -1,0 +1,92 @@
+#include "Canvas.h"
+#include "desktop/resources/Resources.h"
+#include "host/TarnImage.h"
+#include "tests/resources/TemporaryDirectory.h"
+#include <filesystem>
+
+namespace {
+
+class Pictures : public testing::Test {
+protected:
+    Pictures() {
+        directory.Write("themes/light.xml", "<theme name=\"light\"/>");
+        directory.Write("themes/dark.xml", "<theme name=\"dark\"/>");
+        std::filesystem::create_directories(directory.Path() + "/pictures");
+        Resources::Instance().Open(directory.Path());
+        Resources::Instance().SetTheme("light");
+    }
+    ~Pictures() override { Resources::Instance().SetTheme("light"); }
+    void Write(std::string const &name, int width, int height, std::uint32_t pixel) {
+        Surface surface(width, height);
+        for (int y = 0; y < height; ++y)
+            for (int x = 0; x < width; ++x)
+                surface.Row(y)[x] = pixel;
+        std::string error;
+        ASSERT_TRUE(surface.WritePng(directory.Path() + "/pictures/" + name, error)) << error;
+    }
+    TemporaryDirectory directory;
+};
+
+std::uint32_t const kBlue = 0xFF0000FFu;
+
+} // namespace
+
+TEST_F(Pictures, AreDrawnIntoTheRectangle) {
+    Write("0042.png", 3, 2, kBlue);
+    PngImage picture(42);
+    EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 2, 3}));
+    Canvas canvas(12, 10);
+    picture.Draw({1, 2, 3, 5});
+    EXPECT_EQ(canvas.Count(kBlue), 6);
+    picture.Draw({1, 2, 9, 11});
+    EXPECT_EQ(canvas.Count(kBlue), 72);
+    picture.Draw({5, 5, 5, 5});
+    picture.Draw({9, 9, 1, 1});
+    EXPECT_EQ(canvas.Count(kBlue), 72);
+}
+
+TEST_F(Pictures, AreSharpSquaresAtTwiceTheScale) {
+    Write("0042.png", 3, 2, kBlue);
+    PngImage picture(42);
+    Canvas canvas(12, 10, 2);
+    picture.Draw({0, 0, 2, 3});
+    EXPECT_EQ(canvas.Count(kBlue), 24);
+}
+
+TEST_F(Pictures, TransparencyMixes) {
+    Write("0042.png", 3, 2, 0x80000000u);
+    PngImage picture(42);
+    Canvas canvas(3, 2);
+    picture.Draw({0, 0, 2, 3});
+    EXPECT_NEAR(canvas.At(1, 1) & 0xFF, 127, 1);
+}
+
+TEST_F(Pictures, ANumberWithoutAPictureDrawsNothing) {
+    PngImage picture(4711), negative(-1);
+    EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 0, 0}));
+    Canvas canvas(5, 5);
+    picture.Draw({0, 0, 5, 5});
+    negative.Draw({0, 0, 5, 5});
+    EXPECT_EQ(canvas.Count(Canvas::kWhite), 25);
+}
+
+TEST_F(Pictures, ABrokenPictureIsAsGoodAsNone) {
+    directory.Write("pictures/0042.png", "this is no picture");
+    PngImage picture(42);
+    EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 0, 0}));
+}
+
+TEST_F(Pictures, FollowTheThemeByThemselves) {
+    Write("0042.png", 3, 2, kBlue);
+    Write("0042-dark.png", 4, 4, Canvas::kRed);
+    Write("0043.png", 3, 2, kBlue);
+    PngImage picture(42), plain(43);
+    EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 2, 3}));
+    Resources::Instance().SetTheme("dark");
+    ThemeChangeNotificationProvider::Instance().NotifyThemeChanged();
+    EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 4, 4}));
+    EXPECT_EQ(plain.GetFrameRect(), (Rect{0, 0, 2, 3})); // has no picture of its own for the theme
+    Canvas canvas(4, 4);
+    picture.Draw({0, 0, 4, 4});
+    EXPECT_EQ(canvas.Count(Canvas::kRed), 16);
+}
