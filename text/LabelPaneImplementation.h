@@ -19,6 +19,8 @@ public:
 
     // Sets the text and the box, but repaints nothing.
     void SetText(const UString &);
+    // The string shown.
+    const UString &GetText() const { return text; }
     // Sets the text and the box and invalidates both the former box, unless it was empty of text, and the new
     // one. Without effect for the text that it has.
     void SetTextWithInval(const UString &);
