@@ -1,0 +1,160 @@
+#include "dialogs/LoadGlog.h"
+#include "desktop/panes/Glog.h"
+#include "dialogs/DialogReader.h"
+#include "dialogs/PaneMaker.h"
+#include "dialogs/RecordFile.h"
+#include "host/CompoundPane.h"
+#include "host/TarnError.h"
+#include <algorithm>
+#include <fstream>
+#include <iterator>
+#include <stdexcept>
+#include <vector>
+
+namespace {
+
+int const kOnTop = -1;
+std::size_t const kMostBytes = std::size_t(64) << 20; // of a dialog of records
+
+Desktop &OpenDesktop() {
+    Desktop *const desktop = Desktop::Current();
+    if (!desktop)
+        throw std::logic_error("dialogs are loaded on an open desktop");
+    return *desktop;
+}
+
+LoadError::Place WholeFile(std::string const &name) {
+    LoadError::Place place;
+    place.file = name;
+    return place;
+}
+
+// A glog that is disposed of unless it was finished.
+class GrowingGlog {
+public:
+    GrowingGlog(Desktop &desktop_, GlogOptions const &options)
+        : desktop(desktop_)
+        , glog(desktop_.NewGlog(options)) {}
+    ~GrowingGlog() { DisposeGlog(glog); }
+    GrowingGlog(GrowingGlog const &) = delete;
+    GrowingGlog &operator=(GrowingGlog const &) = delete;
+
+    glogRec *Get() const { return glog; }
+    glogRec *Finish(std::string const &name) {
+        PaneMaker::Guard([&](std::string const &) { return WholeFile(name); },
+                         [&] { desktop.FinishGlog(glog); });
+        glogRec *const finished = glog;
+        glog = nullptr;
+        return finished;
+    }
+
+private:
+    Desktop &desktop;
+    glogRec *glog;
+};
+
+// Panes at the glog's top level that are deleted unless they were moved elsewhere.
+class GrowingPanes {
+public:
+    explicit GrowingPanes(glogRec *glog_)
+        : glog(glog_)
+        , before(Panes()) {}
+    ~GrowingPanes() {
+        for (GlogPane *pane : Panes()) {
+            if (std::find(before.begin(), before.end(), pane) == before.end())
+                delete pane;
+        }
+    }
+    GrowingPanes(GrowingPanes const &) = delete;
+    GrowingPanes &operator=(GrowingPanes const &) = delete;
+
+private:
+    std::vector<GlogPane *> Panes() const { return Glog::From(glog).Items(); }
+
+    glogRec *glog;
+    std::vector<GlogPane *> before;
+};
+
+glogRec *MakeGlog(Dialog const &dialog) {
+    GrowingGlog growing(OpenDesktop(), dialog.options);
+    PaneMaker maker(growing.Get());
+    for (DialogItem const &item : dialog.items)
+        maker.Make(item);
+    growing.Get()->SetMinSize(dialog.minWidth, dialog.minHeight);
+    growing.Get()->SetMaxSize(dialog.maxWidth, dialog.maxHeight);
+    return growing.Finish(dialog.file);
+}
+
+bool BeginsWithMagic(std::string const &path) {
+    std::ifstream file(path, std::ios::binary);
+    char start[RecordFile::kMagicSize];
+    return file.read(start, sizeof start) && RecordFile::HasMagic(start, sizeof start);
+}
+
+std::vector<char> ReadRecords(std::string const &path) {
+    std::ifstream file(path, std::ios::binary);
+    std::vector<char> bytes;
+    for (std::istreambuf_iterator<char> at(file), end; at != end; ++at) {
+        if (bytes.size() == kMostBytes)
+            throw LoadError(WholeFile(path),
+                            "the file is larger than " + std::to_string(kMostBytes >> 20) + " MiB");
+        bytes.push_back(*at);
+    }
+    return bytes;
+}
+
+} // namespace
+
+glogRec *LoadGlog(std::string const &path) {
+    OpenDesktop();
+    if (!BeginsWithMagic(path))
+        return MakeGlog(DialogReader::ReadFile(path));
+    std::vector<char> const bytes = ReadRecords(path);
+    return LoadGlogFromRecords(bytes.data(), bytes.size(), GlogOptions().Title(path), path);
+}
+
+glogRec *LoadGlogFromText(std::string_view xml, std::string const &name) {
+    OpenDesktop();
+    return MakeGlog(DialogReader::ReadText(xml, name));
+}
+
+glogRec *LoadGlogFromRecords(void const *bytes, std::size_t size, GlogOptions const &options,
+                             std::string const &name) {
+    Desktop &desktop = OpenDesktop();
+    RecordFile const records(bytes, size, name);
+    GrowingGlog growing(desktop, GlogOptions(options).Size(records.Width(), records.Height()));
+    records.MakePanes(growing.Get());
+    return growing.Finish(name);
+}
+
+glogRec *ReloadGlog(glogRec *shown, std::string const &path) {
+    glogRec *const fresh = LoadGlog(path);
+    if (PlatformWindow *const window = Glog::From(shown).Window()) {
+        Point const topLeft = window->ScreenPlace();
+        Rect place = {topLeft.v, topLeft.h, static_cast<short>(topLeft.v + GetGlogHeight(fresh)),
+                      static_cast<short>(topLeft.h + GetGlogWidth(fresh))};
+        PositionGlog(fresh, &place, false);
+    }
+    ShowGlog(fresh, kShowGlog);
+    DisposeGlog(shown);
+    return fresh;
+}
+
+void LoadItems(std::string const &path, CompoundPane *into) {
+    Desktop &desktop = OpenDesktop();
+    Dialog const dialog = DialogReader::ReadFile(path);
+    glogRec *const glog = into->GetGlog();
+    GrowingPanes const growing(glog);
+    PaneMaker maker(glog);
+    std::vector<GlogPane *> panes;
+    for (DialogItem const &item : dialog.items)
+        panes.push_back(maker.Make(item));
+    for (GlogPane *pane : panes)
+        into->Add(pane, kOnTop);
+    PaneMaker::Guard([&](std::string const &) { return WholeFile(path); }, [&] { desktop.FinishGlog(glog); });
+}
+
+GlogOptions ReadGlogOptions(std::string const &path) {
+    OpenDesktop();
+    return DialogReader::ReadFile(path).options;
+}

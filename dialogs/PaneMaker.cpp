@@ -1,0 +1,61 @@
+#include "dialogs/PaneMaker.h"
+#include "dialogs/CommonKeys.h"
+#include "dialogs/Dialog.h"
+#include "dialogs/ItemType.h"
+#include "dialogs/KeyFault.h"
+#include "host/CompoundPane.h"
+#include "host/GlogStyleSheet.h"
+#include "host/TarnError.h"
+#include <new>
+
+namespace {
+
+int const kOnTop = -1;
+
+} // namespace
+
+void PaneMaker::Guard(PlaceOfKey const &placeOf, std::function<void()> const &make) {
+    try {
+        make();
+    } catch (LoadError const &) {
+        throw;
+    } catch (KeyFault const &fault) {
+        throw LoadError(placeOf(fault.Key()), fault.what());
+    } catch (TarnError const &) {
+        throw LoadError(placeOf(""), "a part that the pane needs is missing, or memory has run out");
+    } catch (std::bad_alloc const &) {
+        throw LoadError(placeOf(""), "memory has run out");
+    } catch (std::exception const &error) {
+        throw LoadError(placeOf(""), error.what());
+    }
+}
+
+GlogPane *PaneMaker::Make(DialogItem const &item) {
+    GlogPane *pane = nullptr;
+    Guard([&](std::string const &key) { return item.PlaceOf(key); }, [&] { pane = MakeAlone(item); });
+    MakeInside(pane, item);
+    if (item.type->reporter)
+        item.type->reporter(pane);
+    return pane;
+}
+
+GlogPane *PaneMaker::MakeAlone(DialogItem const &item) {
+    GlogStyleSheet sheet(item.keys);
+    GlogPane *const pane = item.type->maker(glog, &sheet);
+    if (!pane)
+        throw LoadError(item.place, "the pane cannot be made");
+    if (item.id)
+        pane->SetID(item.id);
+    CommonKeys::Apply(pane, *item.type, &sheet);
+    return pane;
+}
+
+void PaneMaker::MakeInside(GlogPane *pane, DialogItem const &item) {
+    if (item.items.empty())
+        return;
+    CompoundPane *const container = dynamic_cast<CompoundPane *>(pane);
+    if (!container)
+        throw LoadError(item.place, "panes of this type hold no items");
+    for (DialogItem const &inner : item.items)
+        container->Add(Make(inner), kOnTop);
+}

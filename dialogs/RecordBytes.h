@@ -1,0 +1,31 @@
+// The bytes of one binary record.
+#pragma once
+#include "dialogs/LoadError.h"
+#include "host/Geometry.h"
+#include <cstddef>
+#include <string>
+
+// Read from front to back, numbers with their low byte first. Reading beyond the end throws a LoadError that
+// names the record and the byte.
+class RecordBytes {
+public:
+    // The bytes stay the caller's and must outlive this object. `place` names the record and the offset of
+    // its first byte.
+    RecordBytes(unsigned char const *bytes, std::size_t size, LoadError::Place const &place);
+
+    unsigned char Byte();
+    short Short();
+    Point ReadPoint();  // v, then h
+    std::string Rest(); // what is left, as a text in UTF-8
+    void Skip(std::size_t count);
+    std::size_t Left() const { return size - at; }
+
+    // The place of the next byte.
+    LoadError::Place Place() const;
+
+private:
+    unsigned char const *bytes;
+    std::size_t size;
+    std::size_t at = 0;
+    LoadError::Place start;
+};

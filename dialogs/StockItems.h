@@ -1,0 +1,9 @@
+// The item types of the library's own panes, family by family.
+#pragma once
+
+class ItemRegistry;
+
+// Each also tells the tree dump what its panes show.
+void AddButtonItems(ItemRegistry &); // OvalButton, StudButton, FrameButton
+void AddLabelItems(ItemRegistry &);  // Label
+void AddGroupItems(ItemRegistry &);  // Group, Spacer
