@@ -32,15 +32,16 @@ if(CLANGXX)
   list(APPEND compilers ${CLANGXX})
 endif()
 
-# One small source for each pair. It includes the header twice, which finds a missing guard as well.
+# One small source for each pair. It includes the header twice, which finds a missing guard as well. Its name is
+# relative, so that the compiler cache serves all build trees alike.
 file(MAKE_DIRECTORY ${WORK_DIR})
 set(jobs "")
 foreach(compiler ${compilers})
   get_filename_component(compiler_name ${compiler} NAME)
   foreach(header ${headers})
     string(REPLACE "/" "_" name ${header})
-    set(source ${WORK_DIR}/${compiler_name}-${name}.cpp)
-    file(CONFIGURE OUTPUT ${source} CONTENT "#include \"${header}\"\n#include \"${header}\"\n")
+    set(source ${compiler_name}-${name}.cpp)
+    file(CONFIGURE OUTPUT ${WORK_DIR}/${source} CONTENT "#include \"${header}\"\n#include \"${header}\"\n")
     string(APPEND jobs "${compiler} ${header} ${source}\n")
   endforeach()
 endforeach()
@@ -51,6 +52,7 @@ list(JOIN flags " " flags)
 execute_process(
   COMMAND xargs -P ${cores} -L 1 sh -c
           "${launcher} $0 ${flags} -c $2 -o $2.o || { echo \"$1 does not compile alone with $0\"; exit 1; }"
+  WORKING_DIRECTORY ${WORK_DIR}
   INPUT_FILE ${WORK_DIR}/jobs
   OUTPUT_VARIABLE failures
   ERROR_VARIABLE diagnostics
