@@ -35,19 +35,20 @@ public:
     virtual void UpdateLayoutRect();
     virtual bool FindGophers(GopherInfo &);
 
-    // Shows what the subpanes have drawn.
+    // Updates the glog at once.
     virtual void Flush();
     // Calls Select of each subpane.
     virtual void SelectSubpanes(char);
     // Draws the frame of a pane that has one.
     virtual void DrawFrame(Rect *);
-    // Takes the pane over and puts it at the position, from 0; -1: on top. Its layout item goes to the end of
-    // the layout group. Calls AddGuts, then SetContainer and PanePositionChanged of the subpane. The index,
-    // or a negative number when the pane is null.
+    // Takes the pane over, out of its former container, and puts it at the position, from 0; -1: on top. Its
+    // layout item joins the layout group. Calls AddGuts, then SetContainer, ContainmentChanged,
+    // PanePositionChanged and SetActive of the subpane, and invalidates it. The index, or a negative number
+    // when the pane is null.
     virtual short Add(GlogPane *, short position);
-    // Does what Add is told. Subclasses that react to an addition override this one.
+    // The list part of Add. Subclasses that react to an addition override this one.
     virtual short AddGuts(GlogPane *, short position);
-    // Takes the subpane out and deletes it. An index that does not exist has no effect.
+    // Invalidates the subpane, takes it out and deletes it. An index that does not exist has no effect.
     virtual void Del(short index);
 
     // Takes the subpane out; true keeps it alive for the caller, false deletes it.

@@ -52,8 +52,9 @@ public:
     virtual void Deactivate();
     // Takes the active flag from the window once more.
     virtual void SetActive();
-    // The window or container has grown by the delta. By default nothing; panes that fill their container
-    // follow.
+    // The window or container has grown by the delta. By default a top-level pane takes it along in the
+    // directions in which its layout item has a share of growth; panes that fill their container follow in
+    // their own ways.
     virtual void Resize(Point delta);
     // The pane came to another container or glog.
     virtual void ContainmentChanged();
@@ -64,7 +65,7 @@ public:
     // Whether the point is in the pane, for clicks; and for help tags.
     virtual char Contains(Point);
     virtual char ContainsForHelp(Point);
-    // Called by the container when the pane is added to it, and with null when it is taken out.
+    // Called by the container when the pane is added to it.
     virtual void SetContainer(CompoundPane *);
     // Writes the bounds. The normal way to ask for them; panes that have only parts calculate it.
     virtual void GetBox(Rect *out);
@@ -81,7 +82,7 @@ public:
     virtual void Offset(Point delta);
     // Whether the pane shares a pixel with the rectangle. The mode means nothing to the default.
     virtual char Intersects(Rect *, char mode);
-    // Sets the port's text colour for the pane's active flag.
+    // Sets the port's colours for the pane's active flag; by default black on white.
     virtual void ActivateColors();
     // Runs the task until the mouse button is released. The point is where it went down, in pane coordinates.
     // Other windows and timers go on meanwhile.
@@ -145,7 +146,7 @@ public:
     // that has moved or scrolled, or by the layout. Called once also before GlogItemInit.
     virtual void PanePositionChanged();
     // Sets the cursor for the point; true when the pane has decided on one. By default asks
-    // AdjustCursorAndDisplayHelp.
+    // AdjustCursorAndDisplayHelp for points inside.
     virtual char DispatchCursor(Point);
     // Gives the whole pane one help tag, by a default helper; null removes it. The tag stays the host's.
     virtual void SetHelpTag(LocalizedStrings::HelpTag const *);
@@ -159,11 +160,12 @@ public:
     virtual GlogPane *FindByID(int);
     // A container of the pane was shown or hidden. By default nothing.
     virtual void ContainerChangedVisibility();
-    // Whether help tags of the pane come from elsewhere than the tag table. By default false.
+    // Whether help tags of the pane come from a helper instead of the tag table. By default true when there
+    // is a helper.
     virtual bool UsesNonVLHelpTagSystem() const;
-    // Takes the bounds from the layout, if the pane is in one.
+    // Takes the bounds from the place of the layout item.
     virtual void UpdateLayoutRect();
-    // Takes over visibility and number of the other pane.
+    // Takes over bounds, visibility and number of the other pane.
     virtual void CopyPaneAttributes(GlogPane *);
     // Looks for the pane that typing goes to. By default false.
     virtual bool FindGophers(GopherInfo &);
@@ -171,8 +173,7 @@ public:
     virtual bool Print(PrintMessageRec *);
 
 protected:
-    // Sets the cursor for a point in the pane and shows its help tag; true when the pane has set a cursor of
-    // its own.
+    // Sets the cursor for a point in the pane, by default the arrow; true when it has.
     virtual char AdjustCursorAndDisplayHelp(Point);
     // A press of the primary mouse button in the pane. 0: not taken; -1: handled, nothing to report;
     // positive: the pane was hit, 1 for a single button, otherwise the index of the part plus 1. By default
@@ -186,7 +187,8 @@ protected:
     virtual void ConfirmChangesOnClickAway();
     // Called before each step of a mouse task. By default Prepare.
     virtual void PrepareDuringTrackMouse();
-    // Whether the layout may move the pane now; whether it has to be settled first.
+    // Whether a change of the box makes the layout invalid, by default not; whether the layout has to be
+    // settled.
     virtual bool CanUpdateLayoutRect() const;
     virtual bool DoesLayoutNeedToBeUpdated() const;
     // The layout has to be settled before the next drawing.
@@ -205,10 +207,11 @@ public:
     // box from the glog's resource if that has one for the number. Answers the pane, or null, and changes
     // nothing, when the glog is null.
     GlogPane *GlogPaneInit(glogRec *glog, short id);
-    // Makes the pane's port, origin and clip current for drawing outside of DrawGuts. During an update the
-    // clip stays within what is being updated. Does little when nothing has changed since the last time.
+    // Makes the pane's port, origin and clip current, for drawing outside of DrawGuts. During an update the
+    // clip stays within what is being updated. Without effect for a pane in no glog.
     void Prepare();
-    // The next Prepare does everything anew: for drawing that has left the port in another state.
+    // The next Prepare has to do its whole work, whatever seems unchanged: drawing has left the port in
+    // another state.
     static void ForceNextPrepare();
     // The stored bounds.
     Rect GetBounds() const;

@@ -12,8 +12,8 @@ public:
     // replaced by one that knows parts.
     virtual bool IsDefaultHelper() const = 0;
     // Looks up the tag for the point, in pane coordinates. When there is one, answers true and writes the
-    // tag, the rectangle for which it holds, its placement, and the delay in seconds before it appears; else
-    // writes nothing.
+    // tag, its placement, the delay in seconds before it appears, and the rectangle for which it holds; a
+    // default helper leaves the rectangle alone. Without a tag nothing is written.
     virtual bool GetHelpTag(Point, LocalizedStrings::HelpTag const *&, Rect &, OS::Help::Placement &,
                             double &) = 0;
 };

@@ -25,6 +25,6 @@ OSRgn const &GetIconRegion(short family, short index);
 // below 1.
 void TileIcon(Rect const *, short family, short index, short tileWidth, short tileHeight);
 // Fills the rectangle from three icons of the family, beginning with the first index: the left cap, the
-// middle, repeated as often as it takes, and the right cap. When the rectangle is narrower than both caps
-// they share its width.
+// middle, repeated as often as it takes, and the right cap, all as high as the rectangle. When it is narrower
+// than both caps each gets half of it.
 void TileIconInRectWithEndCaps(OS::RectBase<OS::RectTag> const &, short family, short firstIndex);

@@ -106,8 +106,9 @@ private:
 class WithDarkenDrawMode {
 public:
     enum Mode { kMode1 = 1 };
-    // The strength is a percentage, 0 (leaves everything) to 100 (black where the foreground is). The sheet
-    // may be null and is not kept.
+    // Whatever is drawn takes the strength away from what is beneath, in percent: 0 leaves it, 100 makes it
+    // black; values beyond are cut. The colour of the drawing does not count. The sheet may be null and is
+    // not kept.
     WithDarkenDrawMode(int strength, GlogStyleSheet *, Mode);
     ~WithDarkenDrawMode();
 

@@ -49,7 +49,7 @@ int TightStringWidth(UString const &, float spacing, float scale);
 // Draws the text in the port's font with its baseline at the pen, and moves the pen to the text's end.
 void DrawString(UString const &);
 // Draws the text in the port's font with its baseline starting at the point; the pen stays. A text wider than
-// maxWidth is shortened as the code says; -1: no limit.
+// maxWidth is shortened as the code says; -1: no limit. No text is drawn for a width of 0 or below -1.
 void DrawStringAtPoint(UString const &, Point, int maxWidth, TextSettings::TruncateCode);
 
 // Draws the text in the port's font inside the rectangle.

@@ -135,10 +135,11 @@ void GetHiliteColor(RGBColor *);
 // Makes the system's colour for selections the foreground colour.
 void SetUserHiliteColorAsForeColor();
 
-// Draws a bevelled frame inside the rectangle. The first number is the depth in pixels, negative for a sunken
-// frame; the second the gray level of the bevel in percent of white.
+// Draws a bevelled frame inside the rectangle. The depth is in pixels, negative for a sunken frame; the gray
+// is that of the bevel in percent of white, or of black in a dark theme.
 void Frame3DRect(Rect const *, short depth, short gray);
-// Draws the inner shadow of a list along the line from the first point to the second.
+// Draws the inner shadow of a list below a horizontal line or to the right of a vertical one; other lines
+// draw nothing.
 void DrawShadowLine(Point, Point);
 // Draws the frame of an editable text just inside the rectangle.
 void FrameTextWell(Rect const &);

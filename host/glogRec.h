@@ -26,14 +26,14 @@ struct glogRec : public TarnOSWindow::OSWindow {
     virtual bool DidActivateWithCurrentMouseDown() const = 0;
 };
 
-// Redraws at once what is invalid, and shows it. Without effect while the glog is hidden. Here and below the
-// glog must not be null.
+// Redraws at once what is invalid, and shows it. Without effect for null and while the glog is hidden.
 void UpdateGlog(glogRec *);
-// The content's size in pixels.
+// The content's size in pixels. Here and below the glog must not be null.
 short GetGlogWidth(glogRec *);
 short GetGlogHeight(glogRec *);
 
-// A top-level item by its place, from 1 in order of attachment; null beyond. The item stays the glog's.
+// The pane of the number, also inside containers; where no pane has it, the top-level pane at that place,
+// from 1 in order of attachment. Null when there is neither. The pane stays the glog's.
 GlogPane *GetGlogItem(glogRec *, short id);
 // How many top-level items there are.
 short CountGlogItems(glogRec *);
@@ -49,7 +49,7 @@ void PositionGlog(glogRec *, Rect *, bool);
 // Closes the window and deletes the panes; the pointer is invalid afterwards. May be called from inside one
 // of its panes: what is still running ends first.
 void DisposeGlog(glogRec *);
-// Whether making the glog or its panes has failed.
+// Whether the glog cannot be used: it is null, or has been disposed of.
 bool GlogError(glogRec *);
 
 namespace LowLevelGlogOpening {
