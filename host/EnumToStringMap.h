@@ -4,8 +4,8 @@
 
 class EnumToStringMap {
 public:
-    // The number of the name, or 0 when it is unknown; a name that is a whole number stands for itself. Callers
-    // narrow it to 16 bits.
+    // The number of the name, or 0 when it is unknown; a name that is a whole number stands for itself.
+    // Callers narrow it to 16 bits.
     int GetID(UString const &name) const;
 
 protected:
