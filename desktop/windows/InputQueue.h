@@ -1,22 +1,23 @@
 // The events of a window system that wait to be taken.
 #pragma once
-#include <deque>
 #include "desktop/windows/InputEvent.h"
+#include <deque>
 
-// First in, first out; what makes an earlier event pointless takes its place, so that a slow program is never behind by more than
-// one redraw.
+// First in, first out; what makes an earlier event pointless takes its place, so that a slow program is never
+// behind by more than one redraw.
 class InputQueue {
 public:
-    // A mouse move takes the place of one directly before it in the same window, never of one before a button, key or wheel event.
-    // A resize, move or exposure removes earlier ones of its kind in the same window, wherever they are.
+    // A mouse move takes the place of one directly before it in the same window, never of one before a
+    // button, key or wheel event. A resize, move or exposure removes earlier ones of its kind in the same
+    // window, wherever they are.
     void Push(InputEvent const &);
     // False when there is none.
     bool Pop(InputEvent &);
     bool Empty() const { return events.empty(); }
     // The event pushed last, while it waits; null otherwise.
     InputEvent *Last();
-    // Removes the events of the window, which is about to be destroyed. Releases of keys and buttons stay, without a window: what
-    // was held down is held no longer.
+    // Removes the events of the window, which is about to be destroyed. Releases of keys and buttons stay,
+    // without a window: what was held down is held no longer.
     void Forget(PlatformWindow const *);
 
 private:

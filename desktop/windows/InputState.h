@@ -1,9 +1,10 @@
 // What is held down, and where the pointer is, as the taken events tell.
 #pragma once
-#include <set>
 #include "desktop/windows/InputEvent.h"
+#include <set>
 
-// Follows the events as a program takes them, not as they happen: a program that still has a release to take sees the button held.
+// Follows the events as a program takes them, not as they happen: a program that still has a release to take
+// sees the button held.
 class InputState {
 public:
     void Take(InputEvent const &);
@@ -14,7 +15,8 @@ public:
     bool IsKeyPressed(int keyCode) const { return keys.count(keyCode) != 0; }
     unsigned short CurrentModifiers() const { return modifiers; }
 
-    // The window whose mouse event was taken last, and the place in it; null before the first and when the window is gone.
+    // The window whose mouse event was taken last, and the place in it; null before the first and when the
+    // window is gone.
     PlatformWindow *PointerWindow() const { return pointerWindow; }
     int PointerH() const { return pointerH; }
     int PointerV() const { return pointerV; }

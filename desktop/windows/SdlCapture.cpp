@@ -1,20 +1,22 @@
 #include "desktop/windows/SdlCapture.h"
+#include "desktop/windows/SdlWindow.h"
 #include <SDL.h>
 #include <SDL_syswm.h>
-#include "desktop/windows/SdlWindow.h"
 
 namespace {
 
 // A window of SDL as the X library knows it.
 class XWindow {
 public:
-    explicit XWindow(SDL_Window *window) : info() {
+    explicit XWindow(SDL_Window *window)
+        : info() {
         SDL_VERSION(&info.version);
         known = SDL_GetWindowWMInfo(window, &info) == SDL_TRUE;
     }
     long EventMask() const {
         XWindowAttributes attributes;
-        bool told = known && XGetWindowAttributes(info.info.x11.display, info.info.x11.window, &attributes) != 0;
+        bool told =
+            known && XGetWindowAttributes(info.info.x11.display, info.info.x11.window, &attributes) != 0;
         return told ? attributes.your_event_mask : 0;
     }
     void Select(long eventMask) const {
@@ -34,7 +36,8 @@ private:
 
 } // namespace
 
-SdlCapture::SdlCapture(std::vector<SdlWindow *> const &windows_) : windows(windows_) {}
+SdlCapture::SdlCapture(std::vector<SdlWindow *> const &windows_)
+    : windows(windows_) {}
 
 void SdlCapture::IgnoreEntering() {
     for (SdlWindow *window : windows) {

@@ -24,7 +24,8 @@ namespace {
 // The X library, which SDL has loaded; SDL itself does not tell the user's settings.
 class XResources {
 public:
-    XResources() : library(SDL_LoadObject("libX11.so.6")) {}
+    XResources()
+        : library(SDL_LoadObject("libX11.so.6")) {}
     ~XResources() {
         if (library != nullptr)
             SDL_UnloadObject(library);

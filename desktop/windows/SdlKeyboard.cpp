@@ -1,10 +1,10 @@
 #include "desktop/windows/SdlKeyboard.h"
+#include "desktop/resources/Utf.h"
+#include "desktop/windows/SdlKeys.h"
 #include <SDL.h>
 #include <algorithm>
 #include <cstdlib>
 #include <cstring>
-#include "desktop/resources/Utf.h"
-#include "desktop/windows/SdlKeys.h"
 
 static bool SessionHasInputMethod() {
     char const *setting = std::getenv("XMODIFIERS");
@@ -12,7 +12,9 @@ static bool SessionHasInputMethod() {
     return method != nullptr && std::strcmp(method, "@im=none") != 0 && std::strcmp(method, "@im=") != 0;
 }
 
-SdlKeyboard::SdlKeyboard(InputQueue &queue_) : queue(queue_), inputMethod(SessionHasInputMethod()) {}
+SdlKeyboard::SdlKeyboard(InputQueue &queue_)
+    : queue(queue_)
+    , inputMethod(SessionHasInputMethod()) {}
 
 void SdlKeyboard::Press(InputEvent event, PlatformWindow *window, SDL_KeyboardEvent const &press) {
     modifiers = SdlKeys::ModifiersOf(press.keysym.mod);

@@ -1,15 +1,15 @@
 // The keyboard of an X server, and its input method.
 #pragma once
+#include "desktop/windows/InputQueue.h"
 #include <cstdint>
 #include <map>
 #include <string>
-#include "desktop/windows/InputQueue.h"
 
 struct SDL_KeyboardEvent;
 struct Rect;
 
-// Makes the events of keys and text. While text input is on, what a key types is what the keyboard's layout or the input method
-// says; while it is off, as SdlKeys::TextOf guesses.
+// Makes the events of keys and text. While text input is on, what a key types is what the keyboard's layout
+// or the input method says; while it is off, as SdlKeys::TextOf guesses.
 //
 // The calls take the event with its time filled in, and the window that SDL names; null for none of ours.
 class SdlKeyboard {

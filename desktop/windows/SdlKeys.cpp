@@ -1,8 +1,8 @@
 #include "desktop/windows/SdlKeys.h"
-#include <SDL.h>
-#include <string_view>
 #include "desktop/resources/Utf.h"
 #include "desktop/windows/KeyCodes.h"
+#include <SDL.h>
+#include <string_view>
 
 namespace {
 struct KeyPair {
@@ -46,11 +46,11 @@ static KeyPair const kNamedKeys[] = {
 };
 
 static KeypadKey const kKeypadKeys[] = {
-    {SDLK_KP_0, '0', KeyCodes::kNone},     {SDLK_KP_1, '1', KeyCodes::kEnd},
-    {SDLK_KP_2, '2', KeyCodes::kDown},     {SDLK_KP_3, '3', KeyCodes::kPageDown},
-    {SDLK_KP_4, '4', KeyCodes::kLeft},     {SDLK_KP_5, '5', KeyCodes::kNone},
-    {SDLK_KP_6, '6', KeyCodes::kRight},    {SDLK_KP_7, '7', KeyCodes::kHome},
-    {SDLK_KP_8, '8', KeyCodes::kUp},       {SDLK_KP_9, '9', KeyCodes::kPageUp},
+    {SDLK_KP_0, '0', KeyCodes::kNone},        {SDLK_KP_1, '1', KeyCodes::kEnd},
+    {SDLK_KP_2, '2', KeyCodes::kDown},        {SDLK_KP_3, '3', KeyCodes::kPageDown},
+    {SDLK_KP_4, '4', KeyCodes::kLeft},        {SDLK_KP_5, '5', KeyCodes::kNone},
+    {SDLK_KP_6, '6', KeyCodes::kRight},       {SDLK_KP_7, '7', KeyCodes::kHome},
+    {SDLK_KP_8, '8', KeyCodes::kUp},          {SDLK_KP_9, '9', KeyCodes::kPageUp},
     {SDLK_KP_PERIOD, '.', KeyCodes::kDelete},
 };
 

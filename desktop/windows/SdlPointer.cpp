@@ -1,6 +1,6 @@
 #include "desktop/windows/SdlPointer.h"
-#include <SDL.h>
 #include "desktop/windows/SdlWindow.h"
+#include <SDL.h>
 
 static int const kNoButton = 0, kFirstButton = 1, kLastButton = 3;
 
@@ -20,7 +20,8 @@ static int ButtonOf(int sdlButton) {
 static unsigned int Bit(int button) { return 1U << button; }
 
 SdlPointer::SdlPointer(InputQueue &queue_, std::vector<SdlWindow *> const &windows)
-    : queue(queue_), sdlCapture(windows) {}
+    : queue(queue_)
+    , sdlCapture(windows) {}
 
 SdlWindow *SdlPointer::Target(SdlWindow *window) const {
     if (capture != nullptr)

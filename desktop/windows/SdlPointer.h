@@ -1,18 +1,20 @@
 // The mouse of an X server.
 #pragma once
-#include <vector>
 #include "desktop/windows/InputQueue.h"
 #include "desktop/windows/SdlCapture.h"
+#include <vector>
 
 struct SDL_MouseButtonEvent;
 struct SDL_MouseMotionEvent;
 struct SDL_MouseWheelEvent;
 class SdlWindow;
 
-// Makes the mouse's events. While a button is held all of them belong to the window of the press, and while a window has the capture
-// to that one: SDL reports some for another window, or for none. Places are therefore worked out on the screen.
+// Makes the mouse's events. While a button is held all of them belong to the window of the press, and while a
+// window has the capture to that one: SDL reports some for another window, or for none. Places are therefore
+// worked out on the screen.
 //
-// The calls take the event with its time and modifiers filled in, and the window that SDL names; null for none of ours.
+// The calls take the event with its time and modifiers filled in, and the window that SDL names; null for
+// none of ours.
 class SdlPointer {
 public:
     // `windows`: those that there are, at any time.
@@ -24,7 +26,8 @@ public:
     void Release(InputEvent, SdlWindow *, SDL_MouseButtonEvent const &);
     void Turn(InputEvent, SdlWindow *, SDL_MouseWheelEvent const &);
     void Leave(InputEvent, SdlWindow *);
-    // The activation went to another program: what is held counts as released, since its release may never be reported.
+    // The activation went to another program: what is held counts as released, since its release may never be
+    // reported.
     void ReleaseAll(InputEvent);
     // A window of ours was activated, which ends SDL's capture: it is taken up again when it is still wanted.
     void Recapture();

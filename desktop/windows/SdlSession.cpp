@@ -13,15 +13,18 @@ struct Hint {
 } // namespace
 
 static Hint const kHints[] = {
-    // The Wayland driver loses the places of pop-ups and the capture of the mouse; the X server of a Wayland session has both.
+    // The Wayland driver loses the places of pop-ups and the capture of the mouse; the X server of a Wayland
+    // session has both.
     {SDL_HINT_VIDEODRIVER, kVideoDriver},
-    // Pixels go to the window straight from memory: through a texture the first one takes half a second and 90 MB.
+    // Pixels go to the window straight from memory: through a texture the first one takes half a second and
+    // 90 MB.
     {SDL_HINT_FRAMEBUFFER_ACCELERATION, "0"},
     {SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0"},
     {SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1"},
     // Long compositions of an input method arrive whole.
     {SDL_HINT_IME_SUPPORT_EXTENDED_TEXT, "1"},
-    // A click that brings the window to the front works on the control under it too: mixers stand beside other windows.
+    // A click that brings the window to the front works on the control under it too: mixers stand beside
+    // other windows.
     {SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1"},
     // A drag that leaves the window goes on.
     {SDL_HINT_MOUSE_AUTO_CAPTURE, "1"},

@@ -1,10 +1,10 @@
 #include "desktop/windows/SdlWindow.h"
-#include <SDL.h>
-#include <algorithm>
-#include <stdexcept>
 #include "desktop/drawing/Surface.h"
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/windows/SdlWindowSystem.h"
+#include <SDL.h>
+#include <algorithm>
+#include <stdexcept>
 
 // Our pixels are opaque where they reach the screen, so their alpha need not be looked at.
 static std::uint32_t const kSurfaceFormat = SDL_PIXELFORMAT_RGB888;
@@ -15,7 +15,8 @@ static int const kGreatestWindowSize = 32767;
 static std::uint32_t WindowFlags(WindowSpec const &spec) {
     std::uint32_t flags = SDL_WINDOW_HIDDEN;
     if (spec.popup)
-        flags |= SDL_WINDOW_POPUP_MENU | SDL_WINDOW_SKIP_TASKBAR | SDL_WINDOW_ALWAYS_ON_TOP | SDL_WINDOW_BORDERLESS;
+        flags |= SDL_WINDOW_POPUP_MENU | SDL_WINDOW_SKIP_TASKBAR | SDL_WINDOW_ALWAYS_ON_TOP |
+                 SDL_WINDOW_BORDERLESS;
     else if (spec.resizable)
         flags |= SDL_WINDOW_RESIZABLE;
     return flags;
@@ -64,8 +65,8 @@ int SdlWindow::ScreenY() const {
     return y;
 }
 
-// Every device pixel counts, so the last logical pixel may be cut. The current size stays where it gives the same device size: below
-// scale 1 several do.
+// Every device pixel counts, so the last logical pixel may be cut. The current size stays where it gives the
+// same device size: below scale 1 several do.
 int SdlWindow::WholeLogicalPixels(DeviceScale scale, int device, int current) {
     return scale.Edge(current) == device ? current : std::max(scale.ToLogical(device - 1) + 1, 1);
 }
@@ -145,8 +146,8 @@ static void CopyPixels(Surface const &from, DeviceRect const &rect, SDL_Surface 
                       from.Width() * kSurfacePixelBytes, to.format->format, target, to.pitch);
 }
 
-// A rectangle that lies wholly outside the window would be refused by the X server, which ends the program: nothing but what both
-// have goes there. They differ between a resize and the surface that answers it.
+// A rectangle that lies wholly outside the window would be refused by the X server, which ends the program:
+// nothing but what both have goes there. They differ between a resize and the surface that answers it.
 void SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
     if ((SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) != 0)
         return; // what is hidden is exposed when it is shown

@@ -1,15 +1,15 @@
 // A window of an X server.
 #pragma once
+#include "desktop/windows/PlatformWindow.h"
 #include <cstdint>
 #include <vector>
-#include "desktop/windows/PlatformWindow.h"
 
 struct SDL_Rect;
 struct SDL_Window;
 class SdlWindowSystem;
 
-// Larger than its logical size by its scale. Its pixels are copied from the surfaces that are presented and kept by SDL only until
-// the next resize. The window system must outlive it.
+// Larger than its logical size by its scale. Its pixels are copied from the surfaces that are presented and
+// kept by SDL only until the next resize. The window system must outlive it.
 class SdlWindow : public PlatformWindow {
 public:
     // Throws std::runtime_error with SDL's reason.
@@ -30,8 +30,8 @@ public:
     int ContentV(int screenY) const { return scale.ToLogical(screenY - ScreenY()); }
     bool Contains(int h, int v) const { return h >= 0 && v >= 0 && h < width && v < height; }
 
-    // The window manager has shown the window, and its frame's size is known: brings the content, not the frame, to the place that
-    // was asked for.
+    // The window manager has shown the window, and its frame's size is known: brings the content, not the
+    // frame, to the place that was asked for.
     void CorrectPlace();
     // Looks at the size that the window has come to; whether it is another one in logical pixels.
     bool TakeSize();

@@ -1,16 +1,19 @@
 #include "desktop/windows/SdlWindowSystem.h"
+#include "desktop/drawing/WholePixels.h"
+#include "desktop/windows/SdlWindow.h"
 #include <SDL.h>
 #include <algorithm>
 #include <cmath>
-#include "desktop/drawing/WholePixels.h"
-#include "desktop/windows/SdlWindow.h"
 
 static double const kMillisecondsPerSecond = 1000.0;
-static double const kLongestBlock = 3600.0;    // seconds; SDL counts milliseconds in 32 bits
+static double const kLongestBlock = 3600.0;     // seconds; SDL counts milliseconds in 32 bits
 static double const kInputMethodInterval = 0.1; // seconds
 
 SdlWindowSystem::SdlWindowSystem(double forcedScale_)
-    : start(SDL_GetPerformanceCounter()), forcedScale(forcedScale_), pointer(queue, windows), keyboard(queue) {}
+    : start(SDL_GetPerformanceCounter())
+    , forcedScale(forcedScale_)
+    , pointer(queue, windows)
+    , keyboard(queue) {}
 
 SdlWindowSystem::~SdlWindowSystem() {
     if (waker != nullptr)
@@ -32,7 +35,6 @@ void SdlWindowSystem::UpdateScale(SdlWindow *window) {
     if (scale.Factor() == window->Scale())
         return;
     window->SetScale(scale);
-    cursors.Forget();
     InputEvent event = Blank();
     event.kind = InputEvent::kScaleChanged;
     event.window = window;
@@ -247,7 +249,7 @@ void SdlWindowSystem::CaptureMouse(PlatformWindow *window) {
 
 void SdlWindowSystem::SetCursor(int cursor) {
     SdlWindow *window = MainWindow();
-    cursors.Show(cursor, window != nullptr ? window->Scale() : 1.0);
+    cursors.Show(cursor, DeviceScale(window != nullptr ? window->Scale() : 1.0));
 }
 
 std::string SdlWindowSystem::GetClipboardText() {

@@ -1,7 +1,5 @@
 // Real windows, on an X server through SDL.
 #pragma once
-#include <cstdint>
-#include <vector>
 #include "desktop/windows/InputQueue.h"
 #include "desktop/windows/InputState.h"
 #include "desktop/windows/SdlCursors.h"
@@ -10,16 +8,20 @@
 #include "desktop/windows/SdlPointer.h"
 #include "desktop/windows/SdlSession.h"
 #include "desktop/windows/WindowSystem.h"
+#include <cstdint>
+#include <vector>
 
 struct SDL_Window;
 struct SDL_WindowEvent;
 union SDL_Event;
 class SdlWindow;
 
-// One at a time. It must outlive its windows. Waiting blocks in the system until something happens; nothing is polled.
+// One at a time. It must outlive its windows. Waiting blocks in the system until something happens; nothing
+// is polled.
 class SdlWindowSystem : public WindowSystem {
 public:
-    // `forcedScale` holds for all windows; 0 chooses for each by its display. Throws std::runtime_error when there is no display.
+    // `forcedScale` holds for all windows; 0 chooses for each by its display. Throws std::runtime_error when
+    // there is no display.
     explicit SdlWindowSystem(double forcedScale = 0);
     ~SdlWindowSystem() override;
     SdlWindowSystem(SdlWindowSystem const &) = delete;
@@ -35,7 +37,8 @@ public:
     unsigned short CurrentModifiers() const override { return state.CurrentModifiers(); }
     Point MousePlace(PlatformWindow const &) const override;
     void CaptureMouse(PlatformWindow *) override;
-    // 0 goes back to the displays'. Every window whose scale changes by it keeps its logical size and gets kScaleChanged.
+    // 0 goes back to the displays'. Every window whose scale changes by it keeps its logical size and gets
+    // kScaleChanged.
     void ForceScale(double factor) override;
     void SetCursor(int cursor) override;
     std::string GetClipboardText() override;
@@ -55,7 +58,7 @@ private:
     SdlWindow *MainWindow() const;           // the active one, else the oldest, else null
     double ScaleOf(int display) const;
     void UpdateScale(SdlWindow *);
-    InputEvent Blank() const;                // with time and modifiers
+    InputEvent Blank() const; // with time and modifiers
     void Send(InputEvent::Kind, SdlWindow *);
 
     void Pump();
@@ -76,6 +79,6 @@ private:
     SdlPointer pointer;
     SdlKeyboard keyboard;
     SdlCursors cursors;
-    SDL_Window *waker = nullptr;      // see OpenWaker
-    bool activationLost = false;      // since the last Pump
+    SDL_Window *waker = nullptr; // see OpenWaker
+    bool activationLost = false; // since the last Pump
 };

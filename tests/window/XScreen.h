@@ -1,0 +1,21 @@
+// What an X server shows, seen by another client than the one under test.
+#pragma once
+#include <cstdint>
+#include <memory>
+
+class XScreen {
+public:
+    XScreen(); // throws std::runtime_error when the server that DISPLAY names does not answer
+    ~XScreen();
+    XScreen(XScreen const &) = delete;
+    XScreen &operator=(XScreen const &) = delete;
+
+    // The colour at the place of the screen, as 0xRRGGBB.
+    std::uint32_t PixelAt(int x, int y) const;
+    // Bits of each of the colours red, green and blue that the screen can show.
+    int ColourBits() const;
+
+private:
+    struct Connection;
+    std::unique_ptr<Connection> connection;
+};
