@@ -106,9 +106,8 @@ std::size_t FontLibrary::SpecHash::operator()(FontSpec const &spec) const {
 }
 
 FontLibrary &FontLibrary::Instance() {
-    // Never destroyed: layouts of static lifetime still hold its fonts.
-    static FontLibrary *library = new FontLibrary;
-    return *library;
+    static FontLibrary library;
+    return library;
 }
 
 FontLibrary::FontLibrary() {}
@@ -139,12 +138,12 @@ void FontLibrary::Refresh() {
     resourceGeneration = Resources::Instance().Generation();
 }
 
-// The configuration must be current before there is a font map, or the map loads the system's.
+// The configuration must be current before there is a font map, or the map loads the system's. The map takes
+// the current one: setting it as the map's own would leak it.
 void FontLibrary::Open() {
     config = FcConfigCreate();
     FcConfigSetCurrent(config);
     map = pango_cairo_font_map_new_for_font_type(CAIRO_FONT_TYPE_FT);
-    pango_fc_font_map_set_config(PANGO_FC_FONT_MAP(map), config);
     context = pango_font_map_create_context(map);
     pango_context_set_language(context, pango_language_from_string(kShapingLanguage));
     pango_context_set_round_glyph_positions(context, TRUE);
@@ -162,6 +161,7 @@ void FontLibrary::Close() {
         return;
     g_object_unref(context);
     g_object_unref(map);
+    FcConfigSetCurrent(nullptr);
     FcConfigDestroy(config);
     context = nullptr;
     map = nullptr;
@@ -232,7 +232,6 @@ bool FontLibrary::AddSystemFonts() {
 
 void FontLibrary::UseConfig(FcConfig *other) {
     FcConfigSetCurrent(other);
-    pango_fc_font_map_set_config(PANGO_FC_FONT_MAP(map), other);
     FcConfigDestroy(config);
     config = other;
 }

@@ -57,6 +57,20 @@ PangoLayout *NewLayout(std::string const &utf8, TextShape const &shape) {
     return layout;
 }
 
+// The text of a line that was shortened, with an ellipsis for what is missing. Shaped for itself it looks as
+// it should: the layout that did the shortening widens the ellipsis until the line fills its whole width.
+std::string ShortenedText(PangoLayout *layout, std::string const &utf8) {
+    constexpr char kEllipsis[] = "\xE2\x80\xA6";
+    std::string text = utf8;
+    for (GSList *node = pango_layout_get_line_readonly(layout, 0)->runs; node; node = node->next) {
+        PangoItem const *item = static_cast<PangoLayoutRun *>(node->data)->item;
+        if (item->analysis.flags & PANGO_ANALYSIS_FLAG_IS_ELLIPSIS)
+            text.replace(static_cast<std::size_t>(item->offset), static_cast<std::size_t>(item->length),
+                         kEllipsis);
+    }
+    return text;
+}
+
 } // namespace
 
 float TextShape::CleanSpacing(float spacing) {
@@ -72,17 +86,26 @@ ShapedText::ShapedText(std::u16string_view text, TextShape const &shape) {
     generation = FontLibrary::Instance().Generation();
 }
 
-ShapedText::~ShapedText() { g_object_unref(layout); }
+ShapedText::~ShapedText() { Replace(nullptr); }
 
 bool ShapedText::IsCurrent() const { return generation == FontLibrary::Instance().Generation(); }
 
 void ShapedText::Shape(std::u16string_view text, TextShape const &shape) {
     std::string const utf8 = shape.wraps ? TextSanitizer::Lines(text) : TextSanitizer::OneLine(text);
-    layout = NewLayout(utf8, shape);
-    if (pango_layout_get_unknown_glyphs_count(layout) == 0 || !FontLibrary::Instance().AddSystemFonts())
+    Replace(NewLayout(utf8, shape));
+    if (pango_layout_get_unknown_glyphs_count(layout) != 0 && FontLibrary::Instance().AddSystemFonts())
+        Replace(NewLayout(utf8, shape));
+    if (shape.wraps || !pango_layout_is_ellipsized(layout))
         return;
-    g_object_unref(layout);
-    layout = NewLayout(utf8, shape);
+    TextShape whole = shape;
+    whole.width = TextShape::kUnlimited;
+    Replace(NewLayout(ShortenedText(layout, utf8), whole));
+}
+
+void ShapedText::Replace(PangoLayout *other) {
+    if (layout)
+        g_object_unref(layout);
+    layout = other;
 }
 
 void ShapedText::MeasureLines() {

@@ -69,6 +69,7 @@ private:
         bool rightToLeft;
     };
     void Shape(std::u16string_view, TextShape const &);
+    void Replace(PangoLayout *);
     void MeasureLines();
 
     PangoLayout *layout = nullptr;

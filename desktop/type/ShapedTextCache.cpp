@@ -19,15 +19,15 @@ struct Caches {
 };
 
 Caches &CurrentCaches() {
-    // Never destroyed, like the fonts it depends on.
-    static Caches *caches = new Caches;
+    // The fonts first: they go last.
     unsigned int const generation = FontLibrary::Instance().Generation();
-    if (caches->generation != generation) {
-        caches->texts.Clear();
-        caches->widths.Clear();
-        caches->generation = generation;
+    static Caches caches;
+    if (caches.generation != generation) {
+        caches.texts.Clear();
+        caches.widths.Clear();
+        caches.generation = generation;
     }
-    return *caches;
+    return caches;
 }
 
 } // namespace
