@@ -104,3 +104,13 @@ TEST_F(ProviderDying, IsSilentForADependentThatHasLeft) {
     mouth.reset();
     EXPECT_EQ(log, (Log{"a: dying", "c: dying"}));
 }
+
+TEST_F(ProviderDying, ADependentThatJoinsOnThatOccasionIsNotTold) {
+    a->DependUpon(mouth.get());
+    a->onDying = [this](Mouth *dying) {
+        dying->AddDependent(b.get());
+        b->RemoveProvider(dying); // nobody else will
+    };
+    mouth.reset();
+    EXPECT_EQ(log, Log{"a: dying"});
+}

@@ -138,8 +138,15 @@ public:
 
     bool refuses = false;
     std::function<void()> onHear;
+    std::function<void(Provider<Moody> *)> onDying;
 
 private:
+    void ProviderDying(Provider<Moody> *provider) override {
+        log.push_back("dying");
+        if (onDying)
+            onDying(provider);
+    }
+
     Log &log;
 };
 
@@ -170,4 +177,18 @@ TEST_F(ProviderFailure, AFailedSubscriptionDuringABroadcastEndsTheBroadcast) {
     log.clear();
     Say(provider);
     EXPECT_EQ(log, Log{"heard"});
+}
+
+TEST_F(ProviderFailure, AFailedSubscriptionToADyingProviderShortensItsFarewell) {
+    std::unique_ptr<Provider<Moody>> provider(new Provider<Moody>);
+    Moody first(log), second(log);
+    provider->AddDependent(&first);
+    provider->AddDependent(&second);
+    first.refuses = true;
+    first.onDying = [&](Provider<Moody> *dying) {
+        dying->AddDependent(&first);
+        second.RemoveProvider(dying); // the farewell ends before it
+    };
+    provider.reset();
+    EXPECT_EQ(log, Log{"dying"});
 }

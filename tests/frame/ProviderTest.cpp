@@ -190,6 +190,24 @@ TEST_F(ProviderTest, ACopyOfADependentDependsOnNobody) {
     EXPECT_EQ(log, (Log{"a: hello", "a: again"}));
 }
 
+TEST_F(ProviderTest, ACopyOfADependentMayOutliveItsProvider) {
+    std::unique_ptr<Mouth> shortLived(new Mouth);
+    a.DependUpon(shortLived.get());
+    Listener const copy(a);
+    shortLived.reset();
+    EXPECT_EQ(log, Log{"a: dying"});
+}
+
+TEST_F(ProviderTest, HoldsNoMemoryOnEitherSideOnceTheLastHasLeft) {
+    Allocations::Counter first;
+    a.DependUpon(&mouth);
+    long const toJoin = first.Count();
+    a.CancelDependency(&mouth);
+    Allocations::Counter second;
+    a.DependUpon(&mouth);
+    EXPECT_EQ(second.Count(), toJoin) << "something was still there";
+}
+
 TEST_F(ProviderTest, AssigningDependentsLeavesWhatBothDependOn) {
     struct Counting : Ears {
         int heard = 0;
