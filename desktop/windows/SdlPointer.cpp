@@ -1,7 +1,10 @@
 #include "desktop/windows/SdlPointer.h"
 #include "desktop/windows/SdlWindow.h"
 #include <SDL.h>
+#include <cstdlib>
 
+// Two quick clicks on small controls side by side are not a double-click on the second.
+static int const kClickRadius = 4; // logical pixels
 static int const kNoButton = 0, kFirstButton = 1, kLastButton = 3;
 
 static int ButtonOf(int sdlButton) {
@@ -69,13 +72,21 @@ void SdlPointer::Move(InputEvent event, SdlWindow *window, SDL_MouseMotionEvent 
     Send(event, InputEvent::kMouseMove, target);
 }
 
-// SDL counts the clicks at one place of any window. Those before the pointer came to this one do not count.
+bool SdlPointer::IsWhereLastClicked(SdlWindow *window) const {
+    return window == clickWindow && std::abs(window->ContentH(screenX) - clickH) <= kClickRadius &&
+           std::abs(window->ContentV(screenY) - clickV) <= kClickRadius;
+}
+
+// SDL counts the clicks that follow each other quickly, far apart and in any window. Those elsewhere do not
+// count.
 int SdlPointer::CountClicks(SdlWindow *window, int sdlClicks) {
     if (sdlClicks <= clickBase)
         clickBase = 0;
-    if (window != clickWindow)
+    if (!IsWhereLastClicked(window))
         clickBase = sdlClicks - 1;
     clickWindow = window;
+    clickH = window->ContentH(screenX);
+    clickV = window->ContentV(screenY);
     return sdlClicks - clickBase;
 }
 

@@ -43,6 +43,7 @@ private:
     void Enter(InputEvent, SdlWindow *);
     void LeaveIfOutside(InputEvent);
     int CountClicks(SdlWindow *, int sdlClicks);
+    bool IsWhereLastClicked(SdlWindow *) const;
     void ReleaseButton(InputEvent, int button);
     void HoldCapture();
     void EndCapture();
@@ -55,5 +56,6 @@ private:
     unsigned int held = 0;            // bit n: button n
     int screenX = 0, screenY = 0;     // device pixels
     SdlWindow *clickWindow = nullptr; // of the last press
-    int clickBase = 0, clicks = 0;    // SDL's count before the first click in that window, and our count
+    int clickH = 0, clickV = 0;       // where that was, in its logical pixels
+    int clickBase = 0, clicks = 0;    // SDL's count before the first click there, and our count
 };

@@ -28,8 +28,6 @@ static Hint const kHints[] = {
     {SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1"},
     // A drag that leaves the window goes on.
     {SDL_HINT_MOUSE_AUTO_CAPTURE, "1"},
-    // Two quick clicks on small controls side by side are not a double-click on the second.
-    {SDL_HINT_MOUSE_DOUBLE_CLICK_RADIUS, "5"},
     // The desktop decides when the program ends.
     {SDL_HINT_QUIT_ON_LAST_WINDOW_CLOSE, "0"},
     // SIGINT and SIGTERM end the program as the session's end does.

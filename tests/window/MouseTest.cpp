@@ -59,6 +59,16 @@ TEST_F(Mouse, TwoQuickClicksApartAreSingle) {
     EXPECT_EQ(Await(InputEvent::kMouseDown).clicks, 1);
 }
 
+TEST_F(Mouse, ThePlaceOfADoubleClickIsJudgedInLogicalPixels) {
+    OpenSystem(2.0);
+    Window window = Open(At(100, 80, 200, 150));
+    PointAt(*window, 40, 30);
+    Do("click 1 mousemove_relative 8 0 click 1 mousemove_relative 10 0 click 1");
+    EXPECT_EQ(Await(InputEvent::kMouseDown).clicks, 1);
+    EXPECT_EQ(Await(InputEvent::kMouseDown).clicks, 2);
+    EXPECT_EQ(Await(InputEvent::kMouseDown).clicks, 1);
+}
+
 TEST_F(Mouse, AClickInAnotherWindowStartsToCountAnew) {
     Window left = Open(At(100, 150, 200, 200)), right = Open(At(400, 150, 200, 200));
     PointAt(*left, 40, 30);
@@ -86,6 +96,19 @@ TEST_F(Mouse, ADragGoesOnOutsideTheWindow) {
     EXPECT_EQ(release.h, 300);
     EXPECT_EQ(release.v, 250);
     EXPECT_FALSE(System().IsMouseDown());
+}
+
+TEST_F(Mouse, ADragMayComeBackAndGoOutAgain) {
+    Window window = Open(At(300, 250, 200, 100));
+    PointAt(*window, 20, 20);
+    Do("mousedown 1 mousemove 280 240");
+    Drain();
+    Do("mousemove 320 270");
+    EXPECT_EQ(Await(InputEvent::kMouseMove).h, 20);
+    Do("mousemove 600 500");
+    EXPECT_EQ(Await(InputEvent::kMouseMove).h, 300);
+    Do("mouseup 1");
+    EXPECT_EQ(Await(InputEvent::kMouseUp).h, 300);
 }
 
 TEST_F(Mouse, ADragOverAnotherWindowBelongsToTheWindowOfThePress) {
@@ -242,12 +265,11 @@ TEST_F(Mouse, LosingTheActivationToNobodyReleasesTheButton) {
     PointAt(*window, 20, 20);
     Do("mousedown 1");
     Await(InputEvent::kMouseDown);
-    RunBeside("xprop -root -f _NET_ACTIVE_WINDOW 32c; xdotool windowfocus --sync $(xwininfo -root | awk "
-              "'/Window id/{print $4}')"
-              " >/dev/null 2>&1");
-    Do("mouseup 1");
+    RunBeside("xdotool windowfocus $(xwininfo -root -int | awk '/Window id/ { print $4 }')");
     Drain();
     EXPECT_FALSE(System().IsMouseDown());
+    Do("mouseup 1");
+    EXPECT_TRUE(Drain(InputEvent::kMouseUp).empty());
 }
 
 TEST_F(Mouse, EventsForAWindowThatIsGoneAreDropped) {

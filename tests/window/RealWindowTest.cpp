@@ -93,17 +93,6 @@ TEST_F(RealWindow, AnswersASizeThatItWasGiven) {
     EXPECT_TRUE(Drain(InputEvent::kResized).empty());
 }
 
-TEST_F(RealWindow, TellsOfASizeThatTheUserGives) {
-    WindowSpec spec = At(200, 150, 300, 200);
-    spec.resizable = true;
-    Window window = Open(spec);
-    RunBeside("xdotool getactivewindow windowsize --sync 350 260");
-    window->SetTitle("resized");
-    Drain();
-    EXPECT_EQ(window->Width(), 350);
-    EXPECT_EQ(window->Height(), 260);
-}
-
 TEST_F(RealWindow, ReportsTheUsersSizeOnce) {
     WindowSpec spec = At(200, 150, 300, 200);
     spec.resizable = true;

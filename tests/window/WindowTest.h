@@ -43,6 +43,7 @@ protected:
     // Expects the screen to come to show the colour at the place in device pixels from the content's top
     // left.
     void ExpectPixel(PlatformWindow const &, int x, int y, std::uint32_t colour);
+    XScreen const &Screen() const { return screen; }
 
 private:
     std::unique_ptr<SdlWindowSystem> system;

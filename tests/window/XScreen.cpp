@@ -1,6 +1,7 @@
 #include "tests/window/XScreen.h"
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
+#include <X11/extensions/Xfixes.h>
 #include <stdexcept>
 
 static int const kDeepColourDepth = 24;
@@ -37,4 +38,19 @@ std::uint32_t XScreen::PixelAt(int x, int y) const {
 int XScreen::ColourBits() const {
     Display *display = connection->display;
     return DefaultDepth(display, DefaultScreen(display)) >= kDeepColourDepth ? kFullBits : kReducedBits;
+}
+
+XScreen::PointerPicture XScreen::Pointer() const {
+    // The library answers nothing to a client that has not asked for the extension.
+    int events, errors;
+    XFixesCursorImage *image = XFixesQueryExtension(connection->display, &events, &errors)
+                                   ? XFixesGetCursorImage(connection->display)
+                                   : nullptr;
+    if (image == nullptr)
+        throw std::runtime_error("the X server does not show its pointer");
+    int middle = image->height / 2 * image->width + image->width / 2;
+    PointerPicture picture = {image->width, image->height, image->xhot, image->yhot,
+                              static_cast<std::uint32_t>(image->pixels[middle])};
+    XFree(image);
+    return picture;
 }

@@ -15,6 +15,13 @@ public:
     // Bits of each of the colours red, green and blue that the screen can show.
     int ColourBits() const;
 
+    struct PointerPicture {
+        int width, height, hotX, hotY;
+        std::uint32_t middle; // the pixel there, 0xAARRGGBB premultiplied
+    };
+    // The mouse pointer as it is shown now.
+    PointerPicture Pointer() const;
+
 private:
     struct Connection;
     std::unique_ptr<Connection> connection;
