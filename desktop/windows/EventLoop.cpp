@@ -12,6 +12,10 @@ EventLoop *theLoop = nullptr;
 // An activation so soon before a press came from that press.
 double const kActivatingPressWindow = 0.25;
 
+bool IsRelease(InputEvent const &event) { return event.kind == InputEvent::kMouseUp && event.button == 1; }
+
+bool Drags(InputEvent const &event) { return event.kind == InputEvent::kMouseMove || IsRelease(event); }
+
 // Counts the loops and handlers on the stack, also when they are left by an exception.
 class Nesting {
 public:
@@ -186,6 +190,7 @@ void EventLoop::HandlePress(Glog &glog, InputEvent const &event) {
         heldWindow = event.window;
         lastPoint = {static_cast<short>(event.v), static_cast<short>(event.h)};
         pointer.clear();
+        TakeDeferredDrag();
         windows.CaptureMouse(event.window);
     }
     glog.Click(event);
@@ -225,11 +230,29 @@ PlatformWindow *EventLoop::WindowOf(DrawingPort &port) const {
 void EventLoop::Sort(InputEvent const &event) {
     if (HandleWindowEvent(event))
         return;
-    bool const drags = event.kind == InputEvent::kMouseMove || (event.kind == InputEvent::kMouseUp && event.button == 1);
-    if (heldWindow && drags)
+    // What follows the release belongs to the next press, which waits too.
+    bool const released = !pointer.empty() && IsRelease(pointer.back());
+    if (heldWindow && !released && Drags(event))
         pointer.push_back(event);
-    else if (event.kind != InputEvent::kMouseMove && event.kind != InputEvent::kMouseLeave)
+    else if (event.kind == InputEvent::kMouseMove && !deferred.empty() &&
+             deferred.back().kind == InputEvent::kMouseMove && deferred.back().window == event.window)
+        deferred.back() = event;
+    else
         deferred.push_back(event);
+}
+
+// A press that had to wait finds its drag and release waiting behind it.
+void EventLoop::TakeDeferredDrag() {
+    for (auto i = deferred.begin(); i != deferred.end() && i->kind != InputEvent::kMouseDown;) {
+        if (!Drags(*i)) {
+            ++i;
+            continue;
+        }
+        pointer.push_back(*i);
+        i = deferred.erase(i);
+        if (IsRelease(pointer.back()))
+            return;
+    }
 }
 
 bool EventLoop::NextDragPoint(double limit, Point &where, double &when, bool &timedOut) {
@@ -278,8 +301,7 @@ bool EventLoop::ButtonStillDown() {
     InputEvent event;
     while (Take(event, windows.Now(), WindowSystem::Waiter::kPause, "the state of the mouse button"))
         Sort(event);
-    return heldWindow && std::none_of(pointer.begin(), pointer.end(),
-                                      [](InputEvent const &e) { return e.kind == InputEvent::kMouseUp; });
+    return heldWindow && std::none_of(pointer.begin(), pointer.end(), IsRelease);
 }
 
 void EventLoop::Pause(double seconds) {

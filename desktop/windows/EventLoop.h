@@ -56,6 +56,7 @@ private:
     bool HandleWindowEvent(InputEvent const &);
     void Handle(InputEvent const &);
     void HandlePress(Glog &, InputEvent const &);
+    void TakeDeferredDrag();
     void ReleasePointer();
 
     Desktop &desktop;
