@@ -1,5 +1,6 @@
 #include "buttons/GlogButtonPane.h"
 #include "desktop/windows/SimulatedWindowSystem.h"
+#include "host/CompoundPane.h"
 #include "host/Services.h"
 #include "host/TarnError.h"
 #include "tests/PaneTest.h"
@@ -464,6 +465,28 @@ TEST_F(ButtonPane, AnEnabledButtonInAMovedPlaceIsTrackedThere) {
     button->SetBox(&moved);
     EXPECT_EQ(ResultOfClick("click 30 20"), kNoClick);
     EXPECT_EQ(ResultOfClick("press 130 120\nwait 0.3\nmove 159 129\nrelease"), 1);
+}
+
+TEST_F(ButtonPane, FollowsTheMouseInItsOwnCoordinatesWhateverPortItIsLeftWith) {
+    CompoundPane *const box = new CompoundPane;
+    box->CompoundPaneInit(glog, 1);
+    Rect place = {50, 60, 150, 260};
+    box->SetBox(&place);
+    box->Add(button, 0);
+    ProceduresKept kept;
+    static glogRec *owner;
+    owner = glog;
+    btnDepress = [](GlogButtonPane *pane) {
+        pane->Depress();
+        SetPortToGlog(owner);
+    };
+    EXPECT_EQ(ResultOfClick("press 90 70\nwait 0.3\nmove 91 71\nrelease"), 1);
+    EXPECT_EQ(button->changes, (Changes{"depress", "release"}));
+    btnRelease = [](GlogButtonPane *pane) {
+        pane->Release();
+        SetPortToGlog(owner);
+    };
+    EXPECT_EQ(ResultOfClick("press 90 70\nwait 0.3\nmove 5 5\nwait 0.3\nmove 91 71\nrelease"), 1);
 }
 
 namespace {

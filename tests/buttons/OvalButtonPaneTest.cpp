@@ -1,4 +1,5 @@
 #include "buttons/OvalButtonPane.h"
+#include "host/CompoundPane.h"
 #include "host/Icons.h"
 #include "host/LocalizedStrings.h"
 #include "host/NamedColors.h"
@@ -212,4 +213,21 @@ TEST_F(OvalButton, TakesPlaceWidthTextAndModeOneByOne) {
 TEST_F(OvalButton, ASheetWithoutItemFailsAnAssertion) {
     GlogStyleSheet empty;
     EXPECT_THROW(OvalButtonPane::NewOvalButtonPane(glog, &empty), BrokenInvariant);
+}
+
+TEST_F(OvalButton, TakesItsLayoutPropertiesFromTheGlogsSheet) {
+    boost::shared_ptr<XMLLib::ContainerItem> const layout = XMLLib::CreateContainer(Text("Layout"));
+    layout->AddSIntItem(Text("Width"), 93);
+    boost::shared_ptr<XMLLib::ContainerItem> const item = XMLLib::CreateContainer(Text("Glog"));
+    item->AddItem(Text("Layout"), layout);
+    glog = desktop.NewGlog(GlogOptions().StyleSheet(std::make_shared<GlogStyleSheet>(item)));
+    OvalButtonPane *const button = New(10, 20, 80);
+    CompoundPane *const column = new CompoundPane;
+    column->CompoundPaneInit(glog, 1);
+    Rect box = {0, 0, 200, 300};
+    column->SetBox(&box);
+    column->SetUseLayout(true);
+    column->Add(button, 0);
+    Rect const place = button->GetLayoutRect()->GetBorderRect();
+    EXPECT_EQ(place.right - place.left, 93);
 }

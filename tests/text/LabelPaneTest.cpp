@@ -192,6 +192,21 @@ TEST_F(Label, CentresAnOddWidthRoundingTowardZero) {
     EXPECT_EQ(label->BoxNow().right, 126);
 }
 
+TEST_F(Label, AWidthBeyondSixteenBitsWraps) {
+    label->ForgetForcedStringWidth();
+    label->SetOrigin({0, 100});
+    label->SetHOption(1);
+    std::string text(4000, 'W');
+    bool sawOddNegative = false;
+    for (int i = 0; i < 4; ++i, text += 'l') {
+        label->SetText(Text(text.c_str()));
+        short const width = static_cast<short>(Measure(0, text.c_str()).width);
+        sawOddNegative |= width < 0 && width % 2 != 0;
+        EXPECT_EQ(label->BoxNow().left, static_cast<short>(100 - width / 2)) << width;
+    }
+    EXPECT_TRUE(sawOddNegative);
+}
+
 TEST_F(Label, EndsAtItsAnchorWithTheBottomOption) {
     label->SetVOption(2);
     label->SetOrigin({100, 0});
@@ -325,6 +340,15 @@ TEST_F(Label, MeasuringTheWidthLeavesThePortAsItWas) {
     EXPECT_EQ(port, other->GetPort());
 }
 
+TEST_F(Label, MeasuresTheWidthInThePortOfItsGlog) {
+    glogRec *const other = desktop.NewGlog(GlogOptions().Size(50, 50));
+    SetPortToGlog(other);
+    SetFontData(GetIndVelaFont(9));
+    label->ForgetForcedStringWidth();
+    label->CalcBox();
+    EXPECT_EQ(VelaDrawing::GetPortTextSize(other->GetPort()), GetIndVelaFont(9)->size);
+}
+
 // Text and font
 
 TEST_F(Label, SetTextMeasuresAndRepaintsNothing) {
@@ -409,11 +433,38 @@ TEST_F(Label, SettersOfAnchorAndOptionsRepaintNothing) {
     EXPECT_TRUE(label->invalidated.empty());
 }
 
+TEST_F(Label, SettersOfAnchorAndOptionsMoveTheBoxAtOnce) {
+    label->SetHOption(-1);
+    EXPECT_EQ(label->BoxNow().right, 0);
+    label->SetVOption(2);
+    EXPECT_EQ(label->BoxNow().bottom, 0);
+    label->SetOrigin({7, 8});
+    EXPECT_EQ(label->BoxNow().right, 8);
+    EXPECT_EQ(label->BoxNow().bottom, 7);
+}
+
 // Drawing
 
 TEST_F(Label, DrawsItsTextAtItsOriginInTheActiveColour) {
     label->SetOrigin({20, 30});
     EXPECT_EQ(Drawn(), Expected({30, 30}, kDialogActiveTextColor));
+}
+
+TEST_F(Label, DrawsItsTextInsideTheExtraPixels) {
+    label->SetExtraWidth(6);
+    label->SetExtraHeight(8);
+    label->SetVOption(0);
+    label->SetOrigin({20, 30});
+    EXPECT_EQ(Drawn(), Expected({20, 30}, kDialogActiveTextColor));
+}
+
+TEST_F(Label, DrawsInItsOwnGlogWhicheverPortIsCurrent) {
+    glogRec *const other = desktop.NewGlog(GlogOptions().Size(50, 50));
+    SetPortToGlog(other);
+    label->DrawGuts(nullptr);
+    OSPort *port = nullptr;
+    VelaDrawing::GetPort(&port);
+    EXPECT_EQ(port, glog->GetPort());
 }
 
 TEST_F(Label, DrawsGrayTextInTheInactiveColour) {
@@ -567,6 +618,16 @@ TEST_F(LabelInLayout, KeepsTheLayoutsBoxAndCentresTheTextInItsHeight) {
     EXPECT_EQ(label->GetTextOrigin(), (Point{41 / 2 + 10 / 2 + 20, 30}));
 }
 
+TEST_F(LabelInLayout, HalvesHeightAndAscentOneByOne) {
+    label->ForceFontInfo({11, 4, 20, 0});
+    Place({20, 30, 61, 130});
+    EXPECT_EQ(label->GetTextOrigin().v, 20 + 20 + 5);
+    label->SetLineSpacing(41);
+    Show();
+    Rect const item = Item().GetItemRect();
+    EXPECT_EQ(Drawn(), Expected({static_cast<short>(item.top + 20 + 5), item.left}, kDialogActiveTextColor));
+}
+
 TEST_F(LabelInLayout, MeasuringChangesNeitherBoxNorTextOrigin) {
     Place({20, 30, 61, 130});
     Point const origin = label->GetTextOrigin();
@@ -637,6 +698,16 @@ TEST_F(LabelInLayout, IsAsHighAsItsLineSpacingAtOnce) {
     EXPECT_EQ(HeightOf(Item().GetBorderRect()), 25);
 }
 
+TEST_F(LabelInLayout, TakesItsLineSpacingFromTheSheet) {
+    TestItem item;
+    item.String("Text", "Gain").Integer("LineSpacing", 33);
+    LabelPane *const made = LabelPane::NewLabelPane(glog, item.Sheet());
+    column->Add(made, 1);
+    EXPECT_EQ(HeightOf(made->GetLayoutRect()->GetBorderRect()), 33);
+    made->SetSize(20);
+    EXPECT_EQ(HeightOf(made->GetLayoutRect()->GetBorderRect()), 33);
+}
+
 // Records
 
 namespace {
@@ -705,6 +776,17 @@ TEST_F(Label, ARecordsUnknownAlignmentLeavesTheOptionAlone) {
     made->ForceStringWidth(50);
     made->CalcBox();
     EXPECT_EQ(BoxOf(*made).left, 150);
+}
+
+TEST_F(Label, ARecordsLeftAlignmentReplacesTheOption) {
+    LabelPane *const made = new LabelPane;
+    made->LabelPaneInit(glog, 3, UString());
+    made->SetHOption(-1);
+    gStringResRec record = RecordOf(0);
+    made->LabelPaneResInit(glog, &record);
+    made->ForceStringWidth(50);
+    made->CalcBox();
+    EXPECT_EQ(BoxOf(*made).left, 200);
 }
 
 TEST_F(Label, ARecordsFontIsAnIndexWithoutSign) {
