@@ -69,7 +69,7 @@ short CompoundPane::Add(GlogPane *pane, short position) {
         return index;
     pane->SetContainer(this);
     if (GetLayout().get() && pane->GetLayoutRect().get())
-        LayoutEngine::Append(*GetLayout(), pane->GetLayoutRect(), index);
+        LayoutEngine::Append(*GetLayout(), pane->GetLayoutRect(), -1); // wherever the pane itself came
     pane->ContainmentChanged();
     pane->PanePositionChanged();
     pane->SetActive();

@@ -112,7 +112,8 @@ public:
         bool const sub = *end == '/';
         if (sub)
             second = std::strtol(end + 1, &end, 10);
-        if (end == word.c_str() || *end != '\0' || first < 0 || first > 32767 || second < 0 || second > 32767)
+        bool const empty = end == word.c_str() || (sub && word.back() == '/');
+    if (empty || *end != '\0' || first < 0 || first > 32767 || second < 0 || second > 32767)
             Fail("expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"" + word + "\"");
         step.menu = sub ? static_cast<int>(first) : 0;
         step.item = static_cast<int>(sub ? second : first);

@@ -58,7 +58,7 @@ void HelpTagWindow::PointerAt(Glog &over, Point p) {
         return;
     }
     bool const same = glog == &over && wanted.tag == found.tag && VelaDrawing::PtInRect(p, &wanted.part);
-    if (same && window)
+    if (same && (window || due >= 0))
         return;
     Hide();
     wanted = found;

@@ -116,8 +116,8 @@ bool SimulatedWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter 
         steps.pop_front();
         stepTimed = false;
         Perform(step);
-        // A step without events gives a wait that has a limit the chance to see it pass.
-        if (queue.empty() && deadline >= 0 && now >= deadline)
+        // After a step without events the wait's limit may have passed, or the script have ended.
+        if (queue.empty() && ((deadline >= 0 && now >= deadline) || (waiter == Waiter::kMainLoop && steps.empty())))
             return false;
     }
 }
