@@ -41,12 +41,18 @@ void SetInsets(GroupPane *group, GlogStyleSheet *sheet) {
     group->SetInsets(inset("top"), inset("left"), inset("bottom"), inset("right"));
 }
 
+GroupPane::Arrangement ArrangementNamed(UString const &word) {
+    if (word == ResourceKey("free"))
+        return GroupPane::kFree;
+    return word == ResourceKey("horiz") ? GroupPane::kRightward : GroupPane::kDownward;
+}
+
 GlogPane *MakeGroup(glogRec *glog, GlogStyleSheet *sheet) {
     bool const panel = sheet->GetUStringItemValue(ResourceKey("Style")) == ResourceKey("panel");
     GroupPane *const group = GroupPane::NewGroupPane(glog, panel ? GroupPane::kPanel : GroupPane::kPlain);
     if (!group)
         return nullptr;
-    group->SetVertical(!(sheet->GetUStringItemValue(ResourceKey("Direction")) == ResourceKey("horiz")));
+    group->SetArrangement(ArrangementNamed(sheet->GetUStringItemValue(ResourceKey("Direction"))));
     group->SetSpacing(sheet->GetSInt32ItemValue(ResourceKey("Spacing")));
     SetInsets(group, sheet);
     SetPlace(group, sheet->GetItemRes());
@@ -62,7 +68,7 @@ void AddGroupItems(ItemRegistry &registry) {
                      .Keys(KeyList()
                                .Rect("BoundsRect")
                                .Point("Origin")
-                               .Word("Direction", {"vert", "horiz"})
+                               .Word("Direction", {"vert", "horiz", "free"})
                                .Integer("Spacing", 0, kLargestInset)
                                .Attributes("Insets", InsetKeys())
                                .Word("Style", {"plain", "panel"}))

@@ -26,8 +26,10 @@ GroupPane *GroupPane::NewGroupPane(glogRec *owner, Style style) {
     return pane.release();
 }
 
-void GroupPane::SetVertical(bool vertical) {
-    GetLayout()->SetAttributeFromString(GlogLayoutItem::kDirection, ResourceKey(vertical ? "vert" : "horiz"));
+void GroupPane::SetArrangement(Arrangement arrangement) {
+    SetUseLayout(arrangement != kFree);
+    GetLayout()->SetAttributeFromString(GlogLayoutItem::kDirection,
+                                        ResourceKey(arrangement == kRightward ? "horiz" : "vert"));
 }
 
 void GroupPane::SetLength(GlogLayoutItem::Attribute attribute, int pixels) {

@@ -1,4 +1,4 @@
-// A container that places its panes one below the other or side by side.
+// A container that places its panes one below the other, side by side, or where they say.
 //
 // It takes no clicks of its own; its panes do.
 #pragma once
@@ -6,6 +6,8 @@
 
 class GroupPane : public CompoundPane {
 public:
+    // Downward, to the right, or each at its own place.
+    enum Arrangement { kDownward, kRightward, kFree };
     // What is drawn behind the panes: nothing, or a plate with rounded corners.
     enum Style { kPlain, kPanel };
 
@@ -13,9 +15,10 @@ public:
     // wanting. The box is empty until it is set, or the layout that the group lies in sets it.
     static GroupPane *NewGroupPane(glogRec *, Style);
 
-    // Whether the panes go downward (at first) or to the right.
-    void SetVertical(bool);
-    // Pixels between the panes, at first 0; and between the edges and the panes.
+    // At first kDownward.
+    void SetArrangement(Arrangement);
+    // Pixels between the panes, and between the edges and the panes; at first 0, and without effect for
+    // kFree.
     void SetSpacing(int);
     void SetInsets(int top, int left, int bottom, int right);
 

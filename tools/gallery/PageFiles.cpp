@@ -1,0 +1,51 @@
+#include "tools/gallery/PageFiles.h"
+#include <algorithm>
+#include <filesystem>
+#include <stdexcept>
+
+namespace {
+
+namespace fs = std::filesystem;
+
+char const kOwnProgram[] = "/proc/self/exe";
+char const kPlaceInPrefix[] = "share/glogpanes/gallery";
+
+fs::path OwnDirectory() {
+    std::error_code failed;
+    fs::path const program = fs::read_symlink(kOwnProgram, failed);
+    return program.parent_path().parent_path() / kPlaceInPrefix;
+}
+
+std::string NameOf(fs::path const &page) {
+    std::string const stem = page.stem().string();
+    std::size_t const dash = stem.find('-');
+    return dash == std::string::npos ? stem : stem.substr(dash + 1);
+}
+
+} // namespace
+
+PageFiles::PageFiles(std::string const &given) {
+    fs::path const directory = given.empty() ? OwnDirectory() : fs::path(given);
+    frame = (directory / "gallery.xml").string();
+    std::error_code failed;
+    std::vector<fs::path> found;
+    for (fs::directory_entry const &entry : fs::directory_iterator(directory / "pages", failed)) {
+        if (entry.path().extension() == ".xml")
+            found.push_back(entry.path());
+    }
+    if (failed || found.empty())
+        throw std::runtime_error(directory.string() + ": there are no pages of a gallery here");
+    std::sort(found.begin(), found.end());
+    for (fs::path const &page : found)
+        pages.push_back({NameOf(page), page.string()});
+}
+
+std::size_t PageFiles::Find(std::string const &name) const {
+    std::string known;
+    for (std::size_t i = 0; i < pages.size(); ++i) {
+        if (pages[i].name == name)
+            return i;
+        known += (i ? ", " : "") + pages[i].name;
+    }
+    throw std::runtime_error("there is no page \"" + name + "\"; there are " + known);
+}

@@ -1,0 +1,26 @@
+// The gallery's dialogs on disk.
+#pragma once
+#include <string>
+#include <vector>
+
+// One page: a dialog named NUMBER-NAME.xml, the numbers giving the order.
+struct PageFile {
+    std::string name; // "push-buttons"
+    std::string path;
+};
+
+class PageFiles {
+public:
+    // gallery.xml and pages/ in this directory; empty: share/glogpanes/gallery beside the program's own.
+    // Throws std::runtime_error, naming the directory, when they are not there.
+    explicit PageFiles(std::string const &directory);
+
+    std::string const &Frame() const { return frame; } // the dialog round the pages
+    std::vector<PageFile> const &Pages() const { return pages; }
+    // The place of the page in Pages(). Throws std::runtime_error, naming the pages there are.
+    std::size_t Find(std::string const &name) const;
+
+private:
+    std::string frame;
+    std::vector<PageFile> pages;
+};
