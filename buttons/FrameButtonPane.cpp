@@ -39,8 +39,10 @@ FrameButtonPane *FrameButtonPane::NewFrameButtonPane(glogRec *owner, gfbResRec *
     return pane.release();
 }
 
+// By value, as the interface has it. NOLINTBEGIN(performance-unnecessary-value-param)
 FrameButtonPane *FrameButtonPane::NewFrameButtonPane(glogRec *owner,
                                                      boost::shared_ptr<XMLLib::ContainerItem> item) {
+    // NOLINTEND(performance-unnecessary-value-param)
     gfbResRec resource;
     resource.kind = gfbResRec::kKind;
     resource.origin = OptionalPoint(item, "Origin");

@@ -8,7 +8,6 @@
 #include "host/glogRec.h"
 #include <memory>
 #include <new>
-#include <utility>
 
 namespace {
 
@@ -72,7 +71,8 @@ OvalButtonPane *OvalButtonPane::InitOvalButtonPane(glogRec *owner, Point topLeft
 
 void OvalButtonPane::GetButtonText(UString &text) const { text = label; }
 
-void OvalButtonPane::SetButtonText(UString text) { label = std::move(text); }
+// By value, as the interface has it. NOLINTNEXTLINE(performance-unnecessary-value-param)
+void OvalButtonPane::SetButtonText(UString text) { label = text; }
 
 void OvalButtonPane::DrawGuts(OSRgn *) {
     SaveColors const colors;

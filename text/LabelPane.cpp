@@ -135,6 +135,7 @@ void LabelPane::SetBox(Rect *box) {
         CalcBox();
         return;
     }
+    // Not the base's, which would size the box to the text. NOLINTNEXTLINE(bugprone-parent-virtual-call)
     GlogPane::SetBox(box);
     TarnQuickDrawText::FontInfo info;
     _GetFontInfoMethod(&info);
@@ -167,7 +168,7 @@ void LabelPane::CalcBox() {
 
     if (!IsInLayout()) {
         SetTextOrigin(Point{baseline, left});
-        GlogPane::SetBox(&box);
+        GlogPane::SetBox(&box); // the box is measured already. NOLINT(bugprone-parent-virtual-call)
     }
     ReportNaturalSize(oldBox, box);
 }

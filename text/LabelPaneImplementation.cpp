@@ -63,6 +63,7 @@ void LabelPaneImplementation::SetSize(short newSize) {
     CalcBox();
 }
 
+// By value, as the interface has it. NOLINTNEXTLINE(performance-unnecessary-value-param)
 void LabelPaneImplementation::SetFont(fontSaveRec font) {
     bool const changes =
         font.family.GetOrderedFontID() != family.GetOrderedFontID() || font.face != face || font.size != size;

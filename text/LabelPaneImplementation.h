@@ -72,9 +72,10 @@ protected:
     void SetTextOrigin(Point);
     Point GetTextOrigin() const { return textOrigin; }
     // Metrics and width of the text, in pixels: the forced ones, or those of the font in the current port,
-    // which gets the font. The underscores belong to the names.
+    // which gets the font. The underscores belong to the names. NOLINTBEGIN(bugprone-reserved-identifier)
     void _GetFontInfoMethod(TarnQuickDrawText::FontInfo *);
     short _StringWidthMethod();
+    // NOLINTEND(bugprone-reserved-identifier)
 
     // Always 0: a click goes through.
     int HandleClick(EventRecordAdapter *) override;
