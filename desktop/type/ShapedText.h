@@ -3,7 +3,6 @@
 #include "desktop/type/FontSpec.h"
 #include "host/Geometry.h"
 #include "host/TextSettings.h"
-#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
