@@ -39,6 +39,8 @@ public:
         return whole != 0 ? logical * whole : RoundedDown(Scaled(logical) + kOne / 2, kOne);
     }
     DeviceRect ToDevice(int left, int top, int right, int bottom) const {
+        if (whole != 0)
+            return {left * whole, top * whole, right * whole, bottom * whole};
         return {Edge(left), Edge(top), Edge(right), Edge(bottom)};
     }
     // The logical pixel that covers the device pixel, by the same rounding of edges.

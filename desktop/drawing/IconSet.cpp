@@ -55,14 +55,23 @@ IconSet::Icon IconSet::FindFamily(short family) const {
     return {kMissingIconSide, kMissingIconSide, -1, nullptr};
 }
 
-IconSet::Icon IconSet::Find(short family, short index) const {
+IconSet::Icon IconSet::Find(short family, short index) {
+    constexpr unsigned kFamilyStep = 31; // so that the first icons of families do not all share a place
+    Found &place =
+        found[(static_cast<unsigned>(family) * kFamilyStep + static_cast<unsigned>(index)) % kFoundPlaces];
+    if (!place.known || place.family != family || place.index != index)
+        place = {family, index, true, Search(family, index)};
+    return place.icon;
+}
+
+IconSet::Icon IconSet::Search(short family, short index) const {
     for (int i = static_cast<int>(layers.size()) - 1; i >= 0; --i) {
         Atlas const &atlas = layers[static_cast<std::size_t>(i)]->atlas;
         FamilyRecord const *record = atlas.FindFamily(family);
         if (IconRecord const *icon = record ? atlas.FindIcon(*record, index) : nullptr)
             return {icon->width, icon->height, i, icon};
     }
-    Icon missing = family == kMissingIconFamily ? Icon{0, 0, -1, nullptr} : Find(kMissingIconFamily, 0);
+    Icon missing = family == kMissingIconFamily ? Icon{0, 0, -1, nullptr} : Search(kMissingIconFamily, 0);
     Icon const size = FindFamily(family);
     missing.width = size.width;
     missing.height = size.height;
@@ -102,8 +111,8 @@ PixelImage IconSet::ScaledImage(Icon const &icon, int deviceWidth, int deviceHei
          static_cast<std::uint64_t>(width))
             << kSideBits |
         static_cast<std::uint64_t>(height);
-    auto found = scaled.find(key);
-    if (found == scaled.end()) {
+    auto kept = scaled.find(key);
+    if (kept == scaled.end()) {
         if (scaled.size() >= kMostScaledImages)
             scaled.clear();
         // The largest of the four images is the most exact.
@@ -111,9 +120,9 @@ PixelImage IconSet::ScaledImage(Icon const &icon, int deviceWidth, int deviceHei
         std::unique_ptr<Surface> surface(new Surface(width, height));
         ScalePixels(layer.atlas.Pixels(best), best.width, best.height, surface->Pixels(), width, height);
         bool const opaque = surface->IsOpaque();
-        found = scaled.emplace(key, Scaled{std::move(surface), opaque}).first;
+        kept = scaled.emplace(key, Scaled{std::move(surface), opaque}).first;
     }
-    return {found->second.surface->PixmanImage(), width, height, found->second.opaque, false};
+    return {kept->second.surface->PixmanImage(), width, height, kept->second.opaque, false};
 }
 
 void DrawMissingIcon(PixelScope &pixels, DeviceRect const &r) {

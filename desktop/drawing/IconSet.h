@@ -3,6 +3,7 @@
 #include "desktop/drawing/DeviceScale.h"
 #include "desktop/drawing/PixelScope.h"
 #include "desktop/resources/Atlas.h"
+#include <array>
 #include <cstdint>
 #include <memory>
 #include <string>
@@ -29,7 +30,7 @@ public:
         AtlasFormat::IconRecord const *record = nullptr;
     };
     // The icon; the artwork's mark for a missing icon, in the family's size, when there is none.
-    Icon Find(short family, short index) const;
+    Icon Find(short family, short index);
     // The size of a family's icons, in logical pixels; the mark's size for an unknown family.
     Icon FindFamily(short family) const;
 
@@ -40,11 +41,21 @@ public:
 private:
     struct Layer;
     struct Scaled;
+    // What was found last among the icons that share a place in the table.
+    struct Found {
+        short family, index;
+        bool known = false;
+        Icon icon;
+    };
+    static constexpr std::size_t kFoundPlaces = 128; // a power of two
+
+    Icon Search(short family, short index) const;
     PixelImage Stored(Layer &, AtlasFormat::IconRecord const &, int choice);
     PixelImage ScaledImage(Icon const &, int deviceWidth, int deviceHeight);
 
     std::vector<std::unique_ptr<Layer>> layers;
     std::unordered_map<std::uint64_t, Scaled> scaled;
+    std::array<Found, kFoundPlaces> found;
 };
 
 // Draws the mark for a missing icon by lines alone, where not even that has artwork.

@@ -42,19 +42,20 @@ template <class Draw> void ForEachRun(Point from, Point to, Draw draw) {
 
 } // namespace
 
-void DrawLine(PixelScope &pixels, Point from, Point to, Point penSize, OS::RGBAColor const &color) {
-    int const penH = penSize.h, penV = penSize.v;
+void DrawLine(PixelScope &pixels, PenState const &pen, Point to, OS::RGBAColor const &color) {
+    int const penH = pen.size.h, penV = pen.size.v;
     if (penH <= 0 || penV <= 0)
         return;
+    Point const &from = pen.location;
     int const left = std::min(from.h, to.h), right = std::max(from.h, to.h) + penH;
     int const top = std::min(from.v, to.v), bottom = std::max(from.v, to.v) + penV;
     DeviceRect const all = pixels.ToDevice(left, top, right, bottom);
-    if (!pixels.Meets(all))
-        return;
     if (from.h == to.h || from.v == to.v) {
         pixels.Fill(all, color);
         return;
     }
+    if (!pixels.Meets(all))
+        return;
     if (penH == 1 && penV == 1) {
         ForEachRun(from, to,
                    [&](int l, int t, int r, int b) { pixels.Fill(pixels.ToDevice(l, t, r, b), color); });

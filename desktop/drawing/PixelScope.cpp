@@ -1,14 +1,18 @@
 #include "desktop/drawing/PixelScope.h"
 #include "desktop/drawing/Surface.h"
 #include <algorithm>
+#include <array>
+#include <cstring>
 
 namespace {
 
 constexpr std::uint32_t kFullAlpha = 0xFF;
 constexpr double kLargest8 = 255.0, kLargest16 = 65535.0;
 constexpr int kBitsPerPixel = 32;
-// Rows this short are filled faster here than by a call into the library.
-constexpr int kShortRow = 16;
+// Rows this short are filled faster here than by a call into the library, single rows up to the second
+// number.
+constexpr int kShortRow = 16, kShortSingleRow = 512;
+constexpr std::uintptr_t kStoreBytes = 16;
 // What is left of an icon that is drawn as disabled.
 constexpr std::uint16_t kFadedAlpha = 0x6666;
 
@@ -24,8 +28,15 @@ pixman_color_t PremultipliedColor(OS::RGBAColor const &color) {
             Component16(Unit(color.b) * alpha), Component16(alpha)};
 }
 
-bool Same(OS::RGBAColor const &a, OS::RGBAColor const &b) {
-    return a.r == b.r && a.g == b.g && a.b == b.b && a.a == b.a;
+void FillRow(std::uint32_t *row, int width, std::uint32_t pixel) {
+    for (; width > 0 && reinterpret_cast<std::uintptr_t>(row) % kStoreBytes != 0; --width)
+        *row++ = pixel;
+    std::array<std::uint32_t, kShortRow> block; // copied as a whole, which becomes a few wide stores
+    block.fill(pixel);
+    for (; width >= kShortRow; width -= kShortRow, row += kShortRow)
+        std::memcpy(__builtin_assume_aligned(row, kStoreBytes), block.data(), sizeof block);
+    for (int x = 0; x < width; ++x)
+        row[x] = pixel;
 }
 
 // One colour everywhere.
@@ -71,16 +82,6 @@ private:
 
 } // namespace
 
-PixelScope::PixelScope(DrawingPort &port_)
-    : port(port_)
-    , device(nullptr) {
-    if (!port.surface)
-        return;
-    port.device->UpdateClip(port);
-    if (!port.device->clipBounds.Empty())
-        device = port.device.get();
-}
-
 template <class Draw> void PixelScope::ForEachVisible(DeviceRect const &r, Draw draw) {
     DeviceRect box = r.Intersected(device->clipBounds);
     if (box.Empty())
@@ -99,40 +100,29 @@ template <class Draw> void PixelScope::ForEachVisible(DeviceRect const &r, Draw 
     }
 }
 
-std::uint32_t PixelScope::PixelOf(OS::RGBAColor const &color) {
-    if (!Same(color, device->color)) {
-        double alpha = Unit(color.a);
-        device->color = color;
-        device->pixel = Component8(alpha) << 24 | Component8(Unit(color.r) * alpha) << 16 |
-                        Component8(Unit(color.g) * alpha) << 8 | Component8(Unit(color.b) * alpha);
-    }
-    return device->pixel;
-}
-
 void PixelScope::FillPixels(DeviceRect const &r, std::uint32_t pixel) {
     Surface &surface = *port.surface;
     int const width = r.Width();
-    if (width > kShortRow) {
+    if (width > (r.Height() == 1 ? kShortSingleRow : kShortRow)) {
         pixman_fill(surface.Pixels(), surface.Width(), kBitsPerPixel, r.left, r.top, width, r.Height(),
                     pixel);
         return;
     }
     std::uint32_t *row = surface.Row(r.top) + r.left;
     for (int y = r.top; y < r.bottom; ++y, row += surface.Width())
-        for (int x = 0; x < width; ++x)
-            row[x] = pixel;
+        FillRow(row, width, pixel);
 }
 
-void PixelScope::Fill(DeviceRect const &r, OS::RGBAColor const &color) {
-    FillPlainly(r, port.state.darken != 0 ? port.Ink() : color);
-}
-
-void PixelScope::Cover(OS::RGBAColor const &color) { FillPlainly(device->clipBounds, color); }
-
-void PixelScope::FillPlainly(DeviceRect const &r, OS::RGBAColor const &color) {
-    std::uint32_t const pixel = PixelOf(color);
-    if (pixel >> 24 == kFullAlpha) {
-        ForEachVisible(r, [&](DeviceRect const &part) { FillPixels(part, pixel); });
+void PixelScope::FillBox(DeviceRect const &r, OS::RGBAColor const &color) {
+    if (!device->IsColor(color)) {
+        double alpha = Unit(color.a);
+        device->color = color;
+        device->pixel = Component8(alpha) << 24 | Component8(Unit(color.r) * alpha) << 16 |
+                        Component8(Unit(color.g) * alpha) << 8 | Component8(Unit(color.b) * alpha);
+        device->solid = device->pixel >> 24 == kFullAlpha;
+    }
+    if (device->solid) {
+        ForEachVisible(r, [&](DeviceRect const &part) { FillPixels(part, device->pixel); });
         return;
     }
     pixman_color_t const over = PremultipliedColor(color);
@@ -141,6 +131,8 @@ void PixelScope::FillPlainly(DeviceRect const &r, OS::RGBAColor const &color) {
         pixman_image_fill_boxes(PIXMAN_OP_OVER, port.surface->PixmanImage(), &over, 1, &box);
     });
 }
+
+void PixelScope::Cover(OS::RGBAColor const &color) { FillBox(device->clipBounds, color); }
 
 void PixelScope::FillFrame(DeviceRect const &outer, DeviceRect const &inner, OS::RGBAColor const &color) {
     if (inner.Empty()) {

@@ -18,7 +18,15 @@ struct PixelImage {
 // everything.
 class PixelScope {
 public:
-    explicit PixelScope(DrawingPort &);
+    explicit PixelScope(DrawingPort &port_)
+        : port(port_)
+        , device(nullptr) {
+        if (!port.surface)
+            return;
+        port.device->UpdateClip(port);
+        if (!port.device->clipBounds.Empty())
+            device = port.device.get();
+    }
 
     // False when nothing at all can show; nothing else may be called then.
     bool CanDraw() const { return device != nullptr; }
@@ -33,7 +41,19 @@ public:
     bool Meets(DeviceRect const &r) const { return !r.Intersected(device->clipBounds).Empty(); }
 
     // In the given colour, over what is beneath if the colour is transparent.
-    void Fill(DeviceRect const &, OS::RGBAColor const &);
+    void Fill(DeviceRect const &r, OS::RGBAColor const &color) {
+        DeviceRect const box = r.Intersected(device->clipBounds);
+        if (box.Empty())
+            return;
+        // By far the most rectangles and lines are of the same solid colour as the one before, and meet a
+        // clip of one box.
+        if (device->clipIsBox && device->solid && device->IsColor(color) && port.state.darken == 0) {
+            port.touched.Add(box);
+            FillPixels(box, device->pixel);
+        } else {
+            FillBox(box, port.state.darken != 0 ? port.Ink() : color);
+        }
+    }
     // All of the clip, without regard to darkening.
     void Cover(OS::RGBAColor const &);
     // The four bars between the outer and the inner box, which must not reach beyond the outer. An empty
@@ -44,8 +64,7 @@ public:
     void DrawImage(PixelImage const &, int left, int top, DeviceRect const &box, bool fades);
 
 private:
-    void FillPlainly(DeviceRect const &, OS::RGBAColor const &);
-    std::uint32_t PixelOf(OS::RGBAColor const &);
+    void FillBox(DeviceRect const &, OS::RGBAColor const &);
     void FillPixels(DeviceRect const &, std::uint32_t pixel);
     template <class Draw> void ForEachVisible(DeviceRect const &, Draw);
 

@@ -2,6 +2,7 @@
 #include "desktop/drawing/ClipPath.h"
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/Surface.h"
+#include <cairo.h>
 #include <vector>
 
 DrawingPort::Device::Device() { pixman_region32_init(&clip); }
@@ -23,9 +24,7 @@ void DrawingPort::Device::ForgetSurface() {
     context = nullptr;
 }
 
-void DrawingPort::Device::UpdateClip(DrawingPort const &port) {
-    if (clipKnown)
-        return;
+void DrawingPort::Device::FindClip(DrawingPort const &port) {
     int count = 0;
     pixman_box32_t const *logical =
         pixman_region32_rectangles(const_cast<pixman_region32_t *>(Region::Raw(port.clip)), &count);

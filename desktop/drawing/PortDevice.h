@@ -1,7 +1,6 @@
 // What a port keeps about its surface between drawing calls.
 #pragma once
 #include "desktop/drawing/DrawingPort.h"
-#include <cairo.h>
 #include <cstdint>
 #include <pixman.h>
 
@@ -15,9 +14,14 @@ struct DrawingPort::Device {
     void ForgetSurface();
     // The boxes of the port's clip in device pixels, and the smallest box around them. Cached until
     // ForgetClip.
-    void UpdateClip(DrawingPort const &);
+    void UpdateClip(DrawingPort const &port) {
+        if (!clipKnown)
+            FindClip(port);
+    }
     // A context with the port's clip, in device pixels, without any other state that matters.
     cairo_t *UpdateContext(DrawingPort &);
+
+    void FindClip(DrawingPort const &);
 
     bool clipKnown = false;
     DeviceRect clipBounds{0, 0, 0, 0};
@@ -27,7 +31,12 @@ struct DrawingPort::Device {
     cairo_t *context = nullptr;
     bool contextClipKnown = false;
 
-    // The last colour drawn in, as a pixel.
+    bool IsColor(OS::RGBAColor const &c) const {
+        return c.r == color.r && c.g == color.g && c.b == color.b && c.a == color.a;
+    }
+
+    // The last colour drawn in, as a premultiplied pixel.
     OS::RGBAColor color;
     std::uint32_t pixel = 0xFF000000u;
+    bool solid = true; // has full alpha
 };

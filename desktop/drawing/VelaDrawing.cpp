@@ -153,7 +153,7 @@ void VelaDrawing::LineTo(short h, short v) {
     Point const to = {v, h};
     PixelScope pixels(*port);
     if (pixels.CanDraw())
-        DrawLine(pixels, pen.location, to, pen.size, port->State().fore);
+        DrawLine(pixels, pen, to, port->State().fore);
     pen.location = to;
 }
 
@@ -323,12 +323,8 @@ void VelaDrawing::TextFace(short face) {
         port->State().textFace = face;
 }
 
-OS::Font::FamilyID VelaDrawing::GetPortTextFont(OSPort *port) {
-    return TextState(port).textFamily;
-}
+OS::Font::FamilyID VelaDrawing::GetPortTextFont(OSPort *port) { return TextState(port).textFamily; }
 
-short VelaDrawing::GetPortTextSize(OSPort *port) {
-    return TextState(port).textSize;
-}
+short VelaDrawing::GetPortTextSize(OSPort *port) { return TextState(port).textSize; }
 
 int VelaDrawing::GetPortTextFace(OSPort *port) { return TextState(port).textFace; }

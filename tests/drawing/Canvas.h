@@ -5,6 +5,7 @@
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/Surface.h"
 #include <cstdint>
+#include <ostream>
 #include <string>
 #include <vector>
 
