@@ -22,9 +22,11 @@ JsonLine MessageTrace::Begin() {
     return line;
 }
 
-JsonLine MessageTrace::Begin(GlogPane &pane) {
+JsonLine MessageTrace::Begin(GlogPane &pane) { return Begin(ClassName(pane), pane.GetID()); }
+
+JsonLine MessageTrace::Begin(std::string const &className, int id) {
     JsonLine line = Begin();
-    line.Text("pane", ClassName(pane)).Integer("id", pane.GetID());
+    line.Text("pane", className).Integer("id", id);
     return line;
 }
 

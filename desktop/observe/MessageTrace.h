@@ -15,6 +15,7 @@ public:
     static bool On() { return on; }
     static JsonLine Begin();           // with the time
     static JsonLine Begin(GlogPane &); // with time, class and number of the pane
+    static JsonLine Begin(std::string const &className, int id); // the same of a pane that may be gone
     static void Write(JsonLine const &);
     static std::string ClassName(GlogPane &);
 

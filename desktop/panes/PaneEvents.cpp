@@ -10,13 +10,10 @@ namespace {
 template <class Operation> int Reported(GlogPane &pane, char const *name, bool isHit, Operation operation) {
     glogRec *const glog = pane.GetGlog(); // lives on while events are handled in it
     int const id = pane.GetID();
-    JsonLine line;
-    bool const watched = MessageTrace::On();
-    if (watched)
-        line = MessageTrace::Begin(pane);
+    std::string const className = MessageTrace::On() ? MessageTrace::ClassName(pane) : std::string();
     int const result = operation();
-    if (watched)
-        MessageTrace::Write(line.Text("message", std::string(name)).Integer("result", result));
+    if (!className.empty())
+        MessageTrace::Write(MessageTrace::Begin(className, id).Text("message", std::string(name)).Integer("result", result));
     if (isHit && glog && result != 0)
         Glog::From(glog).NoteHit(id);
     return result;

@@ -204,7 +204,8 @@ TEST_F(Mouse, OnlyThePrimaryButtonIsTheMouseButton) {
 TEST_F(Mouse, ThePlaceInAnotherWindowIsKnown) {
     Window left = Open(At(100, 150, 200, 200)), right = Open(At(400, 150, 200, 200));
     PointAt(*left, 40, 30);
-    Await(InputEvent::kMouseMove);
+    Drain();
+    EXPECT_EQ(System().MousePlace(*left).h, 40);
     EXPECT_EQ(System().MousePlace(*right).h, 40 - 300);
     EXPECT_EQ(System().MousePlace(*right).v, 30);
 }
@@ -217,6 +218,8 @@ TEST_F(Mouse, LeavingTheWindowIsReportedOnce) {
     std::vector<InputEvent> events = Drain(InputEvent::kMouseLeave);
     ASSERT_EQ(events.size(), 1U);
     EXPECT_EQ(events[0].window, window.get());
+    EXPECT_LT(events[0].h, 0);
+    EXPECT_LT(events[0].v, 0);
 }
 
 TEST_F(Mouse, ADragOutOfTheWindowLeavesItWithTheRelease) {
