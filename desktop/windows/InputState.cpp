@@ -4,7 +4,7 @@ static int const kPrimaryButton = 1;
 
 static bool HasPlace(InputEvent::Kind kind) {
     return kind == InputEvent::kMouseDown || kind == InputEvent::kMouseUp || kind == InputEvent::kMouseMove ||
-           kind == InputEvent::kWheel;
+           kind == InputEvent::kMouseLeave || kind == InputEvent::kWheel;
 }
 
 static bool HasModifiers(InputEvent::Kind kind) {

@@ -32,7 +32,7 @@ SdlWindow *SdlPointer::Target(SdlWindow *window) const {
     return held != 0 ? pressWindow : window;
 }
 
-// Of a release outside of all windows SDL does not tell where it was.
+// SDL tells only of places in its windows; of others the X server is asked.
 void SdlPointer::SetScreenPlace(SdlWindow *window, int x, int y) {
     if (window == nullptr) {
         SDL_GetGlobalMouseState(&screenX, &screenY);
@@ -156,6 +156,7 @@ void SdlPointer::Turn(InputEvent event, SdlWindow *window, SDL_MouseWheelEvent c
 void SdlPointer::Leave(InputEvent event, SdlWindow *window) {
     if (held != 0 || capture != nullptr || window == nullptr || window != hover)
         return;
+    SetScreenPlace(nullptr, 0, 0); // the last move was one to the window's edge, wherever the pointer went
     Send(event, InputEvent::kMouseLeave, hover);
     hover = nullptr;
 }

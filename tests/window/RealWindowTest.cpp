@@ -267,14 +267,6 @@ TEST_F(Picture, IsAskedForWhenAnotherWindowWentFromAboveIt) {
     EXPECT_EQ(Await(InputEvent::kExposed).window, below.get());
 }
 
-TEST_F(Picture, IsAskedForOnceHoweverOftenItIsLost) {
-    Window below = Open(At(200, 150, 200, 150)), one = Open(At(220, 180, 100, 50)),
-           other = Open(At(260, 240, 100, 50));
-    one.reset();
-    other.reset();
-    EXPECT_EQ(Drain(InputEvent::kExposed).size(), 1U);
-}
-
 TEST_F(Picture, OfAHiddenWindowIsNotPresented) {
     Window window = System().CreateWindow(At(200, 150, 100, 80));
     Fill(*window, 0x123456);
