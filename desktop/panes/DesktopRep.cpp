@@ -67,3 +67,8 @@ void DesktopRep::DamageAll() {
     for (Glog *glog : glogs)
         glog->DamageAll();
 }
+
+void DesktopRep::Idle() {
+    for (std::size_t i = 0; i < glogs.size(); ++i)
+        glogs[i]->Idle();
+}

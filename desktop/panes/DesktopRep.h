@@ -25,6 +25,7 @@ public:
     void Dispose(Glog *);                 // at once, or when no event is being handled any more
     void DeleteDisposed();
     void UpdateAll();
+    void Idle();
     void DamageAll();
 
     DesktopOptions options;

@@ -411,3 +411,13 @@ void Glog::Activation(bool on) {
         if (std::find(items.begin(), items.end(), pane) != items.end())
             pane->SetActive();
 }
+
+void Glog::Idle() {
+    if (!active || !shown || idling)
+        return; // a pane that waits in its Idle is not called again meanwhile
+    idling = true;
+    for (std::size_t i = 0; i < items.size(); ++i)
+        if (PaneAccess::OwnVisibility(*items[i]))
+            items[i]->Idle();
+    idling = false;
+}

@@ -76,6 +76,7 @@ public:
     void PointerLeft();
     void Activation(bool on);
     void Resized(int width, int height);
+    void Idle(); // before the application waits, for the glog in front
     void SetActivatedByMouseDown(bool on) { activatedByMouseDown = on; }
     GlogPane *TopmostAt(Point) const;
 
@@ -110,6 +111,7 @@ private:
     bool shown = false;
     bool active = false;
     bool activatedByMouseDown = false;
+    bool idling = false;
     bool placed = false;
     Rect screenPlace{0, 0, 0, 0};
 };

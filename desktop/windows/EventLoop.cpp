@@ -53,6 +53,7 @@ bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter wa
         double const now = windows.Now();
         chores.Run(now);
         helpTags->Tick(now);
+        DesktopRep::Of(desktop).Idle();
         DesktopRep::Of(desktop).UpdateAll();
         if (waiter == WindowSystem::Waiter::kMainLoop && deadline < 0 && windows.AtEnd())
             return false;

@@ -65,11 +65,14 @@ public:
         return 1;
     }
 
+    void Idle() override { ++idles; }
+
     using GlogPane::AddLayoutSubItem;
     using GlogPane::UseLayoutSubItemMode;
 
     Calls &calls;
     std::string name;
+    int idles = 0;
     int clickResult = 0;
     int keyResult = 0;
     bool takesTab = false;

@@ -225,6 +225,23 @@ TEST_F(TrackingTest, AMouseTaskContinuesEachTimeItsSleepTimeRunsOut) {
 
 TEST_F(TrackingTest, TheAutoScrollTimeIsATwentiethOfASecond) { EXPECT_EQ(MouseTask::DefaultAutoScrollTime(), 0.05); }
 
+// Idle time
+
+TEST_F(TrackingTest, VisiblePanesOfTheActiveGlogAreToldOfIdleTimeBeforeEachWait) {
+    ProbePane *hidden = new ProbePane(glog, {0, 0, 5, 5}, calls, "hidden");
+    hidden->SetVisibility(0);
+    Show();
+    desktop.Play("");
+    int const before = pane->idles;
+    desktop.Play("wait 1\nclick 1 199");
+    EXPECT_GT(pane->idles, before);
+    EXPECT_EQ(hidden->idles, 0);
+    desktop.Play("activate off");
+    int const inactive = pane->idles;
+    desktop.Play("click 1 199");
+    EXPECT_EQ(pane->idles, inactive);
+}
+
 // Chores
 
 class Chore : public CIdleChore {
