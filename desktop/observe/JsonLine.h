@@ -7,6 +7,7 @@
 // {"op":"Draw1Icon","family":1002}: fields in the order in which they are added. Strings are UTF-8 and are escaped.
 class JsonLine {
 public:
+    // Each appends a field and answers the line.
     JsonLine &Text(char const *key, std::string const &utf8);
     JsonLine &Text(char const *key, UString const &);
     JsonLine &Integer(char const *key, long long);
