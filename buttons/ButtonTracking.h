@@ -14,7 +14,7 @@ enum TransitionTo {
     kTransitionTick = 3        // still inside, nothing has changed; comes with each pass, for animations
 };
 
-typedef void (*TransitionProc)(void *data, enum TransitionTo to);
+typedef void (*TransitionProc)(void *data, enum TransitionTo to); // draws the transition, or acts on it
 
 // Tracks until the release. The press shows for a tenth of a second at least, and while the mouse rests the
 // procedure gets a tick fifteen times a second. The procedure gets `data` as it stands here; while the mouse

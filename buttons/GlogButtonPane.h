@@ -56,8 +56,8 @@ protected:
     // changed, when it cannot be attached.
     GlogButtonPane *InitGlogButtonPane(glogRec *glog, unsigned char mode);
 
-    unsigned char GetMode() const { return mode; }
-    bool ButtonIsDown() const { return buttonIsDown; }
+    unsigned char GetMode() const { return mode; }     // as SetMode stored it
+    bool ButtonIsDown() const { return buttonIsDown; } // between Depress and Release
     // True inside Track. The application runs there, so a button may be called while it is being pressed.
     bool StillTracking() const { return stillTracking; }
 

@@ -18,6 +18,7 @@ public:
     DesktopOptions &Language(std::string const &code) { return language = code, *this; }   // "en" (default), "de"
     DesktopOptions &Artwork(std::string const &path) { return artwork = path, *this; }     // default: beside the library
 
+    // What was set.
     std::string theme = "light";
     double scale = 0;
     std::string language = "en";
@@ -27,12 +28,13 @@ public:
 // How a glog is made in code; dialogs in XML say the same in attributes.
 class GlogOptions {
 public:
-    GlogOptions &Title(std::string const &utf8) { return title = utf8, *this; }
+    GlogOptions &Title(std::string const &utf8) { return title = utf8, *this; } // of the window
     GlogOptions &Size(int w, int h) { return width = w, height = h, *this; } // content in pixels, 1 to 16000
-    GlogOptions &Growable(bool on) { return growable = on, *this; }
+    GlogOptions &Growable(bool on) { return growable = on, *this; }          // by the user; default: not
     // The glog's own style sheet; the glog takes it over. Default: none.
     GlogOptions &StyleSheet(std::shared_ptr<GlogStyleSheet> sheet) { return styleSheet = std::move(sheet), *this; }
 
+    // What was set.
     std::string title;
     int width = 320, height = 200;
     bool growable = false;
@@ -56,7 +58,7 @@ public:
 
     int Run();                          // handles events until the last visible glog closes or Quit; the exit status
     bool ProcessEvents(double seconds); // handles what comes within the time; false once Run would have ended
-    void Quit(int status = 0);
+    void Quit(int status = 0);          // ends Run, which answers the status
 
     // Both redraw everything. Unknown themes and scales out of range throw std::invalid_argument and change nothing.
     void SetTheme(std::string const &);
@@ -76,6 +78,7 @@ public:
     // Writes what the glog's window shows, in device pixels; throws std::runtime_error when the file cannot be written.
     void Snapshot(glogRec *, std::string const &pngPath);
 
+    // What shows the windows and supplies events and time.
     WindowSystem &Windows();
 
 protected:

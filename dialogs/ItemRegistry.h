@@ -9,7 +9,7 @@
 // that use them.
 class ItemRegistry {
 public:
-    static ItemRegistry &Instance();
+    static ItemRegistry &Instance(); // one for the process
 
     // A type of a name that is taken replaces the former one. Throws std::invalid_argument for a type without
     // name or maker, for one whose keys repeat those that every item has, and for a record kind of another

@@ -36,6 +36,7 @@ public:
     explicit ItemType(std::string const &name_)
         : name(name_) {}
 
+    // Each sets what it is named after and answers the type.
     ItemType &Keys(KeyList const &);
     ItemType &MadeBy(Maker);
     ItemType &FromRecord(int kind, int kindMask, RecordMaker);
@@ -45,13 +46,13 @@ public:
     // The item may have <Items> of its own. The panes that its maker makes must be CompoundPanes.
     ItemType &HoldsItems();
 
-    std::string name; // as the attribute "type" has it
-    KeyList keys;
-    Maker maker;
-    int recordKind = 0;
-    int recordKindMask = kWholeKind;
-    RecordMaker recordMaker; // empty: there are no such records
-    Reporter reporter;       // empty: such panes tell nothing
-    int layoutType = 0;
-    bool holdsItems = false;
+    std::string name;                // as the attribute "type" has it
+    KeyList keys;                    // beside those that every item may have
+    Maker maker;                     // never empty in the registry
+    int recordKind = 0;              // as a record's first number tells it
+    int recordKindMask = kWholeKind; // which bits of that number count
+    RecordMaker recordMaker;         // empty: there are no such records
+    Reporter reporter;               // empty: such panes tell nothing
+    int layoutType = 0;              // as LayoutType set it
+    bool holdsItems = false;         // as HoldsItems set it
 };

@@ -10,7 +10,7 @@ public:
     KeyFault(std::string const &key_, std::string const &message)
         : std::runtime_error(message)
         , key(key_) {}
-    std::string const &Key() const { return key; }
+    std::string const &Key() const { return key; } // the key that is wrong
 
 private:
     std::string key;

@@ -14,7 +14,7 @@ struct KeySchema;
 // wide unless narrower limits are given.
 class KeyList {
 public:
-    static constexpr long long kSmallest = -32768, kLargest = 32767;
+    static constexpr long long kSmallest = -32768, kLargest = 32767; // of integers without limits
 
     // A whole number within the limits, both included.
     KeyList &Integer(std::string const &name, long long smallest = kSmallest, long long largest = kLargest);
@@ -43,9 +43,9 @@ public:
     KeyList &Repeated();
     KeyList &As(std::string const &itemKey);
 
-    KeySchema const *Find(std::string const &name) const; // null when there is none
-    std::vector<KeySchema> const &Keys() const { return keys; }
-    std::vector<std::string> Names() const;
+    KeySchema const *Find(std::string const &name) const;       // null when there is none
+    std::vector<KeySchema> const &Keys() const { return keys; } // in the order of their adding
+    std::vector<std::string> Names() const;                     // in the same order
 
 private:
     KeySchema &Add(std::string const &name);
@@ -56,12 +56,12 @@ private:
 struct KeySchema {
     enum Kind { kInteger, kString, kWord, kRect, kPoint, kAttributes, kContainer, kAnything };
 
-    std::string name;    // of the element or attribute
-    std::string itemKey; // in the item tree; mostly the same
-    Kind kind = kAnything;
-    bool required = false;
-    bool repeated = false;
-    long long smallest = KeyList::kSmallest, largest = KeyList::kLargest;
-    std::vector<std::string> words; // of kWord
-    KeyList keys;                   // of a container, or the attributes
+    std::string name;                                                     // of the element or attribute
+    std::string itemKey;                                                  // in the item tree; mostly the same
+    Kind kind = kAnything;                                                // what may stand there
+    bool required = false;                                                // an item without it is wrong
+    bool repeated = false;                                                // may stand several times
+    long long smallest = KeyList::kSmallest, largest = KeyList::kLargest; // of kInteger
+    std::vector<std::string> words;                                       // of kWord
+    KeyList keys;                                                         // of a container, or the attributes
 };

@@ -7,8 +7,8 @@
 // without the parts that there are none of; for a binary dialog the place is "file: byte 34: ".
 class LoadError : public std::runtime_error {
 public:
-    struct Place {
-        std::string file;
+    struct Place {                // where a dialog is wrong
+        std::string file;         // its path, or the name that was given for it
         int line = 0, column = 0; // from 1, the column in characters; 0: none
         long long byte = -1;      // offset in a binary dialog, from 0; -1: none
         std::string item;         // such as "item 3 (OvalButton)"; empty for what is no item's
@@ -17,6 +17,7 @@ public:
 
     LoadError(Place const &, std::string const &message);
 
+    // The parts of the place, and the message without it.
     std::string const &File() const { return place.file; }
     int Line() const { return place.line; }
     int Column() const { return place.column; }

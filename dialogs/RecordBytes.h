@@ -13,12 +13,12 @@ public:
     // its first byte.
     RecordBytes(unsigned char const *bytes, std::size_t size, LoadError::Place const &place);
 
-    unsigned char Byte();
-    short Short();
-    Point ReadPoint();  // v, then h
-    std::string Rest(); // what is left, as a text in UTF-8
-    void Skip(std::size_t count);
-    std::size_t Left() const { return size - at; }
+    unsigned char Byte();                          // the next 8 bits
+    short Short();                                 // the next 16
+    Point ReadPoint();                             // v, then h
+    std::string Rest();                            // what is left, as a text in UTF-8
+    void Skip(std::size_t count);                  // leaves out bytes
+    std::size_t Left() const { return size - at; } // how many bytes are still to be read
 
     // The place of the next byte.
     LoadError::Place Place() const;

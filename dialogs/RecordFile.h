@@ -20,15 +20,15 @@ struct glogRec;
 // Items are numbered from 1 as they follow each other.
 class RecordFile {
 public:
-    static std::size_t const kMagicSize = 8; // bytes
-    static bool HasMagic(void const *bytes, std::size_t size);
+    static std::size_t const kMagicSize = 8;                   // bytes
+    static bool HasMagic(void const *bytes, std::size_t size); // whether these are records at all
 
     // Checks header, lengths and kinds; throws LoadError. The bytes stay the caller's and must outlive this
     // object.
     RecordFile(void const *bytes, std::size_t size, std::string const &name);
 
-    int Width() const { return width; }
-    int Height() const { return height; }
+    int Width() const { return width; }   // of the glog, in pixels
+    int Height() const { return height; } // likewise
     // Makes all panes in the glog. Throws LoadError; what was made by then stays with the glog.
     void MakePanes(glogRec *) const;
 

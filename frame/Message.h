@@ -15,7 +15,7 @@
 // Calls an operation without arguments.
 template <class L> class Message0 : public DependentCastMessenger<L> {
 public:
-    typedef void (L::*Function)();
+    typedef void (L::*Function)(); // of the listener
 
     explicit Message0(Function operation)
         : function(operation) {}
@@ -28,7 +28,7 @@ private:
 // Calls an operation with one argument.
 template <class L, class A, class S> class Message1 : public DependentCastMessenger<L> {
 public:
-    typedef void (L::*Function)(A);
+    typedef void (L::*Function)(A); // of the listener
 
     Message1(Function operation, S const *first)
         : function(operation)
@@ -43,7 +43,7 @@ private:
 // Calls an operation with two arguments.
 template <class L, class A, class S, class B, class T> class Message2 : public DependentCastMessenger<L> {
 public:
-    typedef void (L::*Function)(A, B);
+    typedef void (L::*Function)(A, B); // of the listener
 
     Message2(Function operation, S const *first, T const *second)
         : function(operation)
@@ -61,7 +61,7 @@ private:
 template <class L, class A, class S, class B, class T, class C, class U>
 class Message3 : public DependentCastMessenger<L> {
 public:
-    typedef void (L::*Function)(A, B, C);
+    typedef void (L::*Function)(A, B, C); // of the listener
 
     Message3(Function operation, S const *first, T const *second, U const *third)
         : function(operation)

@@ -19,7 +19,7 @@ public:
     void Cancel();
 
 protected:
-    virtual void DoIdle() = 0;
+    virtual void DoIdle() = 0; // the chore itself, to be done in little time
 
 private:
     friend class IdleChores;

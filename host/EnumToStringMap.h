@@ -22,7 +22,7 @@ private:
 // Names of icon families, as in the XML keys "ISetID" and "FamilyID".
 class ISetIDMapper : public EnumToStringMap {
 public:
-    static ISetIDMapper &Instance();
+    static ISetIDMapper &Instance(); // one for the process
 
 private:
     ISetIDMapper();
@@ -31,7 +31,7 @@ private:
 // Names of pictures, as in the XML key "ResIDName".
 class PictIDMapper : public EnumToStringMap {
 public:
-    static PictIDMapper &Instance();
+    static PictIDMapper &Instance(); // one for the process
 
 private:
     PictIDMapper();

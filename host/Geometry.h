@@ -7,16 +7,16 @@
 // Whole pixels. Point and Rect lie in binary resource records as they stand, so they stay plain, of 4 and 8
 // bytes.
 struct Point {
-    short v, h;
+    short v, h; // down, and to the right
 };
-struct Rect {
-    short top, left, bottom, right;
+struct Rect {                       // edges; the right and the bottom one are outside
+    short top, left, bottom, right; // pixels
 };
 
 namespace OS {
 
-struct Point {
-    double x, y;
+struct Point {   // a place in the plane
+    double x, y; // to the right, and down
 
     Point()
         : x(0)
@@ -29,8 +29,8 @@ struct Point {
         , y(p.v) {}
 };
 
-struct Size {
-    double width, height;
+struct Size {             // of a rectangle in the plane
+    double width, height; // to the right, and down
 
     Size()
         : width(0)

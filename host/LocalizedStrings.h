@@ -20,9 +20,9 @@ UString GetString(short list, short index);
 // A text that appears as a tooltip; only the host looks inside.
 class HelpTag;
 
-class HelpTagMgr {
+class HelpTagMgr { // finds help tags in the user's language
 public:
-    static HelpTagMgr &Instance();
+    static HelpTagMgr &Instance(); // one for the process
 
     // The tag under group and key, which are ASCII. Never the caller's; valid for the life of the process.
     // Null when there is none.

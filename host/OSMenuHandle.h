@@ -32,9 +32,9 @@ public:
     // Looks for the id among the installed menus. True and the menu, or false and `out` untouched.
     static bool FindInMenuList(short id, OSMenuHandle &out);
 
-    bool IsValid() const;
-    void clear(); // drops this reference; other handles keep theirs
-    short GetMenuID() const;
+    bool IsValid() const;    // whether it names a menu
+    void clear();            // drops this reference; other handles keep theirs
+    short GetMenuID() const; // 0 for an invalid handle
     // Makes the menu a copy of the other's items; ids stay.
     void CloneMenu(OSMenuHandle const &);
 
@@ -50,18 +50,18 @@ public:
     void SetItemEnabled(short item, bool);
     bool IsItemEnabled(short item) const;
 
-    void SetMenuItemText(short item, UString const &);
-    void GetMenuItemText(short item, UString &) const;
-    void SetMenuItemIcon(short item, short icon);
-    short GetMenuItemIcon(short item) const; // 0: none
+    void SetMenuItemText(short item, UString const &); // as it stands, without marks
+    void GetMenuItemText(short item, UString &) const; // replaces the string
+    void SetMenuItemIcon(short item, short icon);      // 0: none
+    short GetMenuItemIcon(short item) const;           // 0: none
 
     // An item is hierarchical when it opens a submenu: the installed menu of the item's hierarchical id.
     bool IsMenuItemHierarchical(short item) const;
     void SetMenuItemHierarchicalID(short item, short menuID); // 0: none
     short GetMenuItemHierarchicalID(short item) const;
 
-    void ApplyDecoratorToItem(short item, boost::shared_ptr<MenuItemDecorator> const &);
-    void SetMenuItemCheck(short item, bool);
+    void ApplyDecoratorToItem(short item, boost::shared_ptr<MenuItemDecorator> const &); // shared
+    void SetMenuItemCheck(short item, bool); // the mark before the text
 
     // Inserts an item; after item 0 is at the beginning, after the last or beyond at the end.
     void InsertItem(short afterItem, UString const &);

@@ -60,11 +60,11 @@ public:
 // Edit commands, on the engine's selection.
 namespace TextEditActions {
 
-enum Magnitude { kCharacter = 0 };
+enum Magnitude { kCharacter = 0 }; // how much to delete
 
-void Cut(OSTextEdit &);
-void Copy(OSTextEdit &);
-void Paste(OSTextEdit &);
+void Cut(OSTextEdit &);   // to the clipboard
+void Copy(OSTextEdit &);  // to the clipboard
+void Paste(OSTextEdit &); // in the place of the selection
 // Deletes the selection; without one, as much as the magnitude says before the insertion point.
 void DeleteBackward(OSTextEdit &, Magnitude);
 
@@ -76,7 +76,7 @@ void DeleteBackward(OSTextEdit &, Magnitude);
 // area in its window when its text or selection changes.
 class OSTextEdit : public Provider<OS::TextEditListener> {
 public:
-    typedef boost::optional<TarnOSWindow::OSWindow &> Window;
+    typedef boost::optional<TarnOSWindow::OSWindow &> Window; // none: not shown yet
 
     // A new engine, owned by the caller; null when there could be none. Flags: 1 styled, 2 several lines, 4
     // read-only, 8 without scrolling by itself.
@@ -116,20 +116,20 @@ public:
     virtual void DrawBackgroundWhenNotSelected(bool) = 0;
 
     virtual bool HasSelection() const = 0; // of at least one unit
-    virtual void SelectAll() = 0;
-    virtual void DeselectAll() = 0;
+    virtual void SelectAll() = 0;          // the whole text
+    virtual void DeselectAll() = 0;        // leaves an insertion point
     // Selects up to the end, exclusive; both are cut to the text.
     virtual void SetSelection(unsigned int start, unsigned int end) = 0;
     virtual void GetSelection(unsigned int &start, unsigned int &end) const = 0;
     // What an input method is composing, as start and end; none when it is not.
     virtual boost::optional<std::pair<unsigned int, unsigned int>> GetMarkedRange() const = 0;
 
-    virtual int GetScrollDelta() const = 0;           // pixels of one step of scrolling
-    virtual int GetCurrentScrolledOffset() const = 0; // pixels of text above the top edge
-    virtual int GetTextHeight() const = 0;            // pixels
-    virtual void SetVScrollPos(int, int) = 0;
-    virtual void VScrollToCharacterPosition(unsigned int) = 0;
-    virtual void SetAutoScroll(bool) = 0;
+    virtual int GetScrollDelta() const = 0;                    // pixels of one step of scrolling
+    virtual int GetCurrentScrolledOffset() const = 0;          // pixels of text above the top edge
+    virtual int GetTextHeight() const = 0;                     // pixels
+    virtual void SetVScrollPos(int, int) = 0;                  // scrolls to the first, in pixels
+    virtual void VScrollToCharacterPosition(unsigned int) = 0; // until it can be seen
+    virtual void SetAutoScroll(bool) = 0; // whether it follows the insertion point by itself
 
     // Handles a key or click; false when it was of no use.
     virtual bool HandleEvent(EventRecordAdapter *) = 0;

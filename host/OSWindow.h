@@ -21,12 +21,12 @@ class OSWindow : public Provider<OSWindow_PlatformWindowListener> {
 public:
     // Where a new window goes in the order of windows.
     enum PositionArg { PositionOnTop = 0 };
-    class SendBehindArg {
+    class SendBehindArg { // a place in that order
     public:
         explicit SendBehindArg(PositionArg p)
             : position(p) {}
 
-        PositionArg position;
+        PositionArg position; // where the window goes
     };
 
     virtual ~OSWindow() {}

@@ -12,8 +12,8 @@ class OSPort;
 struct SaveColorRec {
     RGBColor fore, back;
 };
-void GetColors(SaveColorRec *);
-void SetColors(SaveColorRec const *);
+void GetColors(SaveColorRec *);       // reads the port's
+void SetColors(SaveColorRec const *); // makes them the port's
 // Black on white, which icons need.
 void ClearColors();
 
@@ -105,7 +105,7 @@ private:
 // Makes drawing darken what is beneath instead of covering it.
 class WithDarkenDrawMode {
 public:
-    enum Mode { kMode1 = 1 };
+    enum Mode { kMode1 = 1 }; // there is one way only
     // Whatever is drawn takes the strength away from what is beneath, in percent: 0 leaves it, 100 makes it
     // black; values beyond are cut. The colour of the drawing does not count. The sheet may be null and is
     // not kept.

@@ -5,7 +5,7 @@
 // The count is a plain integer: one thread.
 class RCObject {
 public:
-    void AddRef() { ++refCount; }
+    void AddRef() { ++refCount; } // one more holder
     // The object may be gone afterwards.
     void Release() {
         if (--refCount == 0)

@@ -34,7 +34,7 @@ void YieldUntilKeyUp(unsigned int key);
 // Which keys are down.
 class KeybdMgr {
 public:
-    static KeybdMgr &Instance();
+    static KeybdMgr &Instance(); // one for the process
     // By character code; false for one that no key has.
     bool IsKeyPressed(int key);
 };

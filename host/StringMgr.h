@@ -4,7 +4,7 @@
 
 class StringMgr {
 public:
-    static StringMgr &Instance();
+    static StringMgr &Instance(); // one for the process
 
     // Keeps a copy and answers its key, never 0. Each call gives a key of its own, to be freed once by the
     // caller. When all 32767 keys are taken, FailMemFullError is called.

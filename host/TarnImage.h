@@ -27,7 +27,7 @@ public:
 // Sends ThemeChanged.
 class ThemeChangeNotificationProvider : public Provider<ThemeChangeNotificationProvider_Listener> {
 public:
-    static ThemeChangeNotificationProvider &Instance();
+    static ThemeChangeNotificationProvider &Instance(); // one for the process
     // For the host: sends ThemeChanged to everybody.
     void NotifyThemeChanged();
 };

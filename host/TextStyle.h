@@ -6,10 +6,10 @@
 namespace OS {
 
 struct TextStyle {
-    Font::FamilyID family;
-    int face;        // 0 plain, 1 bold, 32 condensed; the values add up
-    short size;      // logical pixels
-    RGBAColor color; // black and opaque by default
+    Font::FamilyID family; // that of dialog text by default
+    int face;              // 0 plain, 1 bold, 32 condensed; the values add up
+    short size;            // logical pixels
+    RGBAColor color;       // black and opaque by default
 
     TextStyle()
         : face(0)

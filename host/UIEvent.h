@@ -5,9 +5,9 @@
 // Offered to panes by GlogPane::CanHandleCustomEvent. Valid for the call that it is given to.
 class UIEvent {
 public:
-    struct MouseWheelParams {
-        float delta; // notches; positive toward the start: up or left
-        int axis;    // 0 horizontal, 1 vertical; others are possible and mean nothing to panes
+    struct MouseWheelParams { // one turn along one axis
+        float delta;          // notches; positive toward the start: up or left
+        int axis;             // 0 horizontal, 1 vertical; others are possible and mean nothing to panes
     };
 
     virtual ~UIEvent() {}

@@ -10,7 +10,7 @@ public:
     // right-pointing double angle mark (U+00BB).
     enum ByteEncoding { kByteEncoding1 = 1 };
 
-    typedef char16_t Unit;
+    typedef char16_t Unit; // of UTF-16
     // Not found; also "to the end" where a count is wanted.
     static std::size_t const npos = static_cast<std::size_t>(-1);
 
@@ -22,9 +22,9 @@ public:
     UString(UString const &, std::size_t start, std::size_t count);
     ~UString();
 
-    bool empty() const;
-    std::size_t length() const;
-    void clear();
+    bool empty() const;         // whether there is no unit
+    std::size_t length() const; // in units
+    void clear();               // makes it empty
 
     // Where the other string first occurs at or after the index; npos when it does not.
     std::size_t find(UString const &, std::size_t from) const;

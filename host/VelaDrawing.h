@@ -101,16 +101,16 @@ bool RectInRgn(Rect const *, OSRgn *);
 
 // Colours of the port. The background is what EraseRect fills with.
 
-void RGBForeColor(RGBColor const &);
-void RGBBackColor(RGBColor const &);
-void GetForeColor(RGBColor *);
-void GetBackColor(RGBColor *);
+void RGBForeColor(RGBColor const &); // of what is drawn
+void RGBBackColor(RGBColor const &); // of what is erased
+void GetForeColor(RGBColor *);       // must not be null
+void GetBackColor(RGBColor *);       // must not be null
 
 // Text state of the port.
 
-void TextFont(OS::Font::FamilyID);
-void TextSize(short); // logical pixels
-void TextFace(short); // 0 plain, 1 bold, 32 condensed; the values add up
+void TextFont(OS::Font::FamilyID); // the family
+void TextSize(short);              // logical pixels
+void TextFace(short);              // 0 plain, 1 bold, 32 condensed; the values add up
 // The text state of any port, which must not be null.
 OS::Font::FamilyID GetPortTextFont(OSPort *);
 short GetPortTextSize(OSPort *);

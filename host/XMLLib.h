@@ -11,7 +11,7 @@
 
 namespace XMLLib {
 
-class Item {
+class Item { // what may stand under a key
 public:
     virtual ~Item() {}
 };
@@ -21,17 +21,17 @@ class SIntItem : public Item {
 public:
     explicit SIntItem(long long v)
         : value(v) {}
-    long long Get() const { return value; }
+    long long Get() const { return value; } // all 64 bits
 
 private:
     long long value;
 };
 
-class UStringItem : public Item {
+class UStringItem : public Item { // a text
 public:
     explicit UStringItem(UString const &s)
         : value(s) {}
-    UString const &Get() const { return value; }
+    UString const &Get() const { return value; } // stays the item's
 
 private:
     UString value;
@@ -56,8 +56,8 @@ public:
     // The string under the key; empty when there is none.
     UString GetUStringItemValue(UString const &key) const;
 
-    void AddSIntItem(UString const &key, long long value);
-    void AddUStringItem(UString const &key, UString const &value);
+    void AddSIntItem(UString const &key, long long value);         // appends an integer
+    void AddUStringItem(UString const &key, UString const &value); // appends a string
     // Appends an item of any kind, which is shared from now on; null has no effect.
     void AddItem(UString const &key, boost::shared_ptr<Item>);
 

@@ -39,7 +39,7 @@ GlogPane *GetGlogItem(glogRec *, short id);
 short CountGlogItems(glogRec *);
 // Makes the glog's port current, with its origin at the top left of the content.
 void SetPortToGlog(glogRec *);
-enum ShowOrHideEnum { kShowGlog = 0, kHideGlog = 1 };
+enum ShowOrHideEnum { kShowGlog = 0, kHideGlog = 1 }; // for ShowGlog
 // Shows the glog in front of the others, or hides it.
 void ShowGlog(glogRec *, ShowOrHideEnum);
 

@@ -10,14 +10,14 @@ class GlogPane;
 // {"time":0.125,"pane":"CheckBoxPane","id":3,"message":"ButtonValueChanged","index":1,"value":true}.
 class MessageTrace {
 public:
-    typedef std::function<void(std::string const &line)> Sink;
+    typedef std::function<void(std::string const &line)> Sink; // gets a line without line end
     static void SetSink(Sink); // an empty function ends the trace
-    static bool On() { return on; }
+    static bool On() { return on; } // whether a sink stands; ask before building a line
     static JsonLine Begin();           // with the time
     static JsonLine Begin(GlogPane &); // with time, class and number of the pane
     static JsonLine Begin(std::string const &className, int id); // the same of a pane that may be gone
-    static void Write(JsonLine const &);
-    static std::string ClassName(GlogPane &);
+    static void Write(JsonLine const &); // to the sink
+    static std::string ClassName(GlogPane &); // of the most derived class
 
 private:
     static bool on;

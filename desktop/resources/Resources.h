@@ -9,7 +9,7 @@
 // missing one has nothing in it.
 class Resources {
 public:
-    static Resources &Instance();
+    static Resources &Instance(); // one for the process
 
     // The directory of the library's own artwork, found from where the library's file is:
     // share/glogpanes/artwork beside or one above its directory. Throws ResourceError, naming the places,
