@@ -144,9 +144,8 @@ void LabelPane::SetBox(Rect *box) {
 
 void LabelPane::Offset(Point delta) {
     GlogPane::Offset(delta);
+    // Only box and anchor: the pen start of the text follows at the next CalcBox, as after every plain store.
     origin = Moved(origin, delta.v, delta.h);
-    // Without this the text would stay behind until the next CalcBox.
-    SetTextOrigin(Moved(GetTextOrigin(), delta.v, delta.h));
 }
 
 void LabelPane::CalcBox() {

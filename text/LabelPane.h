@@ -52,7 +52,7 @@ public:
     // of the box; the size is ignored. In a layout: takes the rectangle as it is and centres the text in its
     // height.
     void SetBox(Rect *) override;
-    // Moves box, text and anchor.
+    // Moves box and anchor. The text is drawn at its new place from the next CalcBox on.
     void Offset(Point delta) override;
     // Derives the box from the anchor. In a layout the box stays. Either way a width or height that differs
     // from that of the present box is given to the layout item.

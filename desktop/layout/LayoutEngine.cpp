@@ -121,15 +121,15 @@ LayoutEngine::Extent LayoutEngine::MeasurePane(GlogLayoutItem::Rep &rep) {
 LayoutEngine::Extent LayoutEngine::Measure(GlogLayoutItem &item) {
     GlogLayoutItem::Rep &rep = Rep(item);
     Extent natural{rep.width, rep.height};
-    if (rep.width < 0 || rep.height < 0) {
+    if (rep.width <= 0 || rep.height <= 0) {
         Extent inside = rep.isGroup ? MeasureGroup(rep) : MeasurePane(rep);
         // A container's own group keeps its insets inside, since nothing lies round it.
         if (rep.isGroup && !rep.parent) {
             inside.width += rep.insetLeft + rep.insetRight;
             inside.height += rep.insetTop + rep.insetBottom;
         }
-        natural.width = rep.width < 0 ? inside.width : rep.width;
-        natural.height = rep.height < 0 ? inside.height : rep.height;
+        natural.width = rep.width <= 0 ? inside.width : rep.width;
+        natural.height = rep.height <= 0 ? inside.height : rep.height;
     }
     return {std::max(natural.width, rep.minWidth), std::max(natural.height, rep.minHeight)};
 }

@@ -27,7 +27,7 @@ struct GlogLayoutItem::Rep {
     Rect place{0, 0, 0, 0};
     bool hasPlace = false;
 
-    int width = -1, height = -1; // natural size; negative: not told, the made rectangle counts
+    int width = 0, height = 0; // natural size; 0 or less: not told, the made rectangle counts
     int minWidth = 0, minHeight = 0;
     int insetTop = 0, insetLeft = 0, insetBottom = 0, insetRight = 0;
     int growWidth = 0, growHeight = 0; // shares of the room that is left over

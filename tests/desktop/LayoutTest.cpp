@@ -67,6 +67,8 @@ TEST_F(LayoutTest, ReportedSizesReplaceTheMadeOnes) {
     EXPECT_EQ(a->GetDrawRectangle(), (Rect{0, 0, 15, 44}));
     Set(a, Item::kMinWidth, 60);
     EXPECT_EQ(a->GetDrawRectangle().right, 60);
+    Set(a, Item::kHeight, 0);
+    EXPECT_EQ(a->GetDrawRectangle().bottom, 20) << "0 tells nothing: the rectangle it was made with counts";
 }
 
 TEST_F(LayoutTest, GrowingItemsShareTheRoomThatIsLeftToThePixel) {

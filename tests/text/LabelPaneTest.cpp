@@ -261,14 +261,15 @@ TEST_F(Label, SetBoxMovesTheAnchorByAsMuchAsTheCorner) {
     EXPECT_EQ(label->GetTextOrigin(), (Point{105, 207}));
 }
 
-TEST_F(Label, OffsetMovesBoxAnchorAndText) {
+TEST_F(Label, OffsetMovesBoxAndAnchorAndTheTextFollowsAtTheNextCalcBox) {
     label->SetOrigin({100, 200});
     label->Offset({3, -4});
     EXPECT_EQ(label->GetOrigin(), (Point{103, 196}));
     EXPECT_EQ(label->BoxNow(), (Rect{103, 196, 117, 246}));
-    EXPECT_EQ(label->GetTextOrigin(), (Point{113, 196}));
+    EXPECT_EQ(label->GetTextOrigin(), (Point{110, 200}));
     label->CalcBox();
     EXPECT_EQ(label->BoxNow(), (Rect{103, 196, 117, 246}));
+    EXPECT_EQ(label->GetTextOrigin(), (Point{113, 196}));
 }
 
 // Measuring
