@@ -8,8 +8,8 @@ struct CursorEntry {
     int hotH, hotV; // logical pixels from the icon's top left
 };
 
-// From cursors.xml: <cursors><cursor number="..." family="..." icon="..." hotH="..." hotV="..."/>...</cursors>.
-// Other attributes are for readers.
+// From cursors.xml: <cursors><cursor number="..." family="..." icon="..." hotH="..."
+// hotV="..."/>...</cursors>. Other attributes are for readers.
 class CursorTable {
 public:
     // The table of the resources that are open; throws ResourceError for a broken file.
