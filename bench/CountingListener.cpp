@@ -1,0 +1,5 @@
+#include "bench/CountingListener.h"
+
+CountingListener::~CountingListener() {}
+
+void CountingListener::GlogButtonPressed(GlogButtonPane *) { ++heard; }

@@ -1,0 +1,111 @@
+#!/usr/bin/env python3
+"""Prints what the benchmarks measured, beside what they are measured against.
+
+    Table.py [--check] FILE...
+
+Takes the median of all repetitions of a benchmark. With --check the exit status is 1 when a goal is missed.
+"""
+import argparse
+import json
+import statistics
+import sys
+from collections import namedtuple
+
+# A measurement beside another one of the same run. `most` is the goal for their ratio, None where there is none, and
+# `clock` the time that counts: "cpu_time", of the processor, or "real_time", by the clock.
+Ratio = namedtuple("Ratio", "what measured beside most clock", defaults=(None, "cpu_time"))
+# A measurement with a goal of its own, in a unit that stands for so many of the file's.
+Amount = namedtuple("Amount", "what measured unit size most", defaults=(None,))
+
+# A message to nobody is one pointer test, as the other is; what is left is the error of measuring it.
+POINTER_TEST = 1.25
+
+RATIOS = (
+    Ratio("message to nobody / pointer test", "Broadcast/ours/0", "Broadcast/bare/0", POINTER_TEST),
+    Ratio("message to 1 dependent / plain loop", "Broadcast/ours/1", "Broadcast/bare/1", 2.0),
+    Ratio("message to 10 dependents / plain loop", "Broadcast/ours/10", "Broadcast/bare/10", 2.0),
+    Ratio("message to 100 dependents / plain loop", "Broadcast/ours/100", "Broadcast/bare/100", 2.0),
+    Ratio("icon / pixman", "Icon/ours", "Icon/bare", 1.5),
+    Ratio("run of tiles / pixman", "Tiles/ours", "Tiles/bare", 1.5),
+    Ratio("rectangle / pixman", "Rectangle/ours", "Rectangle/bare", 1.5),
+    Ratio("horizontal line / pixman", "Line/ours", "Line/bare", 1.5),
+    Ratio("text at a point / Pango", "Text/ours at a point", "Text/bare", 1.2),
+    Ratio("text in a rectangle / Pango", "Text/ours in a rectangle", "Text/bare", 1.2),
+    Ratio("label pane / Pango", "Label/ours", "Text/bare", 1.2),
+    Ratio("oval button / pixman and Pango", "Button/ours", "Button/bare"),
+    Ratio("redraw of 16 x 16 / of 200 panes", "Redraw/spot", "Redraw/all", 0.02),
+    Ratio("redraw of a button / of 200 panes", "Redraw/button", "Redraw/all"),
+    Ratio("start to first frame / bare program", "Start/ours", "Start/bare", 1.15, "real_time"),
+    Ratio("processor time of it / bare program", "Start/ours", "Start/bare"),
+)
+AMOUNTS = (
+    Amount("click to listener", "Click to listener/manual_time", "us", 1e3),
+    Amount("resident memory", "Idle/resident", "MB", 1024 * 1024, 24),
+    Amount("wake-ups of an idle window", "Idle/wake-ups", "", 1, 1),
+)
+
+SIZES = {"ns": 1, "us": 1e3, "ms": 1e6, "s": 1e9, "count": 1, "bytes": 1}
+MARKS = {True: "PASS", False: "over"}
+
+
+def read(paths):
+    """Values by name and clock, in nanoseconds where they are times."""
+    values = {}
+    for path in paths:
+        with open(path, encoding="utf-8") as file:
+            entries = json.load(file)["benchmarks"]
+        for entry in entries:
+            if entry.get("error_occurred"):
+                sys.exit(f"{entry['name']}: {entry['error_message']}")
+            if entry["run_type"] != "iteration":
+                continue
+            for clock in ("cpu_time", "real_time"):
+                values.setdefault((entry["name"], clock), []).append(entry[clock] * SIZES[entry["time_unit"]])
+    return values
+
+
+def time_text(nanoseconds):
+    for unit in ("s", "ms", "us"):
+        if nanoseconds >= SIZES[unit]:
+            return f"{nanoseconds / SIZES[unit]:.3g} {unit}"
+    return f"{nanoseconds:.3g} ns"
+
+
+def mark(value, most):
+    return "" if most is None else MARKS[value <= most]
+
+
+def row(what, measured, beside, value, most):
+    goal = "" if most is None else f"{most:g}"
+    print(f"{what:40} {measured:>10} {beside:>10} {value:>9} {goal:>6} {mark(float(value), most)}".rstrip())
+
+
+def main():
+    parser = argparse.ArgumentParser()
+    parser.add_argument("--check", action="store_true")
+    parser.add_argument("files", nargs="+")
+    options = parser.parse_args()
+    values = read(options.files)
+
+    def median(name, clock):
+        if (name, clock) not in values:
+            sys.exit(f"there is no measurement of {name}")
+        return statistics.median(values[name, clock])
+
+    missed = 0
+    print(f"{'':40} {'measured':>10} {'beside':>10} {'ratio':>9} {'goal':>6}")
+    for ratio in RATIOS:
+        measured, beside = median(ratio.measured, ratio.clock), median(ratio.beside, ratio.clock)
+        value = f"{measured / beside:.3f}"
+        row(ratio.what, time_text(measured), time_text(beside), value, ratio.most)
+        missed += mark(float(value), ratio.most) == MARKS[False]
+    for amount in AMOUNTS:
+        value = f"{median(amount.measured, 'real_time') / amount.size:.1f}"
+        row(amount.what, f"{value} {amount.unit}", "", value, amount.most)
+        missed += mark(float(value), amount.most) == MARKS[False]
+    print(f"{missed} goal(s) missed" if missed else "All goals met")
+    return 1 if options.check and missed else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())
