@@ -1,0 +1,32 @@
+# Runs the installed programs: each finds libraries, artwork and pages from where it is.
+include(${CMAKE_CURRENT_LIST_DIR}/Run.cmake)
+
+set(prefix ${WORK_DIR}/prefix)
+set(out ${WORK_DIR}/pictures)
+file(REMOVE_RECURSE ${out})
+file(MAKE_DIRECTORY ${out})
+
+run(log ${prefix}/bin/glogview ${SOURCE_DIR}/examples/hello/hello.xml --png ${out}/hello.png)
+require_file(${out}/hello.png)
+run(log ${prefix}/bin/gallery --png-dir ${out}/gallery)
+file(GLOB_RECURSE pages ${out}/gallery/*.png)
+if(NOT pages)
+  message(FATAL_ERROR "the gallery wrote no pictures")
+endif()
+run(help ${prefix}/bin/glog-artwork --help)
+
+# The program and the libraries that it loads all come from the prefix.
+run(loaded ldd ${prefix}/bin/glogview)
+string(REGEX MATCHALL "libglog[a-z]+\\.so[^\n]*" lines "${loaded}")
+list(LENGTH lines count)
+if(NOT count EQUAL 3)
+  message(FATAL_ERROR "glogview loads:\n${loaded}")
+endif()
+foreach(line ${lines})
+  string(REGEX MATCH "=> ([^ ]+)" found "${line}")
+  get_filename_component(library "${CMAKE_MATCH_1}" ABSOLUTE)
+  string(FIND "${library}" "${prefix}/${LIBDIR}/" place)
+  if(NOT place EQUAL 0)
+    message(FATAL_ERROR "glogview loads ${line}")
+  endif()
+endforeach()
