@@ -1,0 +1,15 @@
+# Builds the reference into a directory of its own; a warning is an error.
+file(REMOVE_RECURSE ${OUTPUT_DIR})
+file(MAKE_DIRECTORY ${OUTPUT_DIR})
+file(READ ${SOURCE_DIR}/docs/Doxyfile settings)
+file(WRITE ${OUTPUT_DIR}/Doxyfile "${settings}\nOUTPUT_DIRECTORY = ${OUTPUT_DIR}\n")
+execute_process(COMMAND ${DOXYGEN} ${OUTPUT_DIR}/Doxyfile WORKING_DIRECTORY ${SOURCE_DIR} RESULT_VARIABLE result
+                OUTPUT_VARIABLE written ERROR_VARIABLE complaints)
+if(result OR complaints)
+  message(FATAL_ERROR "doxygen ended with ${result}:\n${written}${complaints}")
+endif()
+foreach(page classGlogPane.html classOvalButtonPane.html structglogRec.html classDesktop.html LoadGlog_8h.html)
+  if(NOT EXISTS ${OUTPUT_DIR}/html/${page})
+    message(FATAL_ERROR "the reference has no ${page}")
+  endif()
+endforeach()
