@@ -43,7 +43,7 @@ void SdlWindowSystem::UpdateScale(SdlWindow *window) {
 }
 
 std::unique_ptr<PlatformWindow> SdlWindowSystem::CreateWindow(WindowSpec const &spec) {
-    SdlWindow *neighbour = MainWindow();
+    SdlWindow *neighbour = spec.owner != nullptr ? static_cast<SdlWindow *>(spec.owner) : MainWindow();
     double scale = ScaleOf(neighbour != nullptr ? neighbour->Display() : 0);
     return std::make_unique<SdlWindow>(*this, spec, DeviceScale(scale));
 }
