@@ -5,7 +5,7 @@
 #include <pixman.h>
 
 class OSPath;
-typedef struct _cairo cairo_t;
+typedef struct _cairo cairo_t; // NOLINT(bugprone-reserved-identifier): Cairo's own name
 struct cairo_path;
 
 // Does not change once it is made, so that saved clips can share it. A clip that has been narrowed by several

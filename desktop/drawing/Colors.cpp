@@ -1,5 +1,6 @@
 #include "desktop/drawing/Colors.h"
 #include <algorithm>
+#include <cmath>
 
 namespace {
 
@@ -10,7 +11,7 @@ double Share(unsigned short component) { return static_cast<float>(component) / 
 
 unsigned short Component(double share) {
     double within = share > 0.0 ? std::min(share, 1.0) : 0.0;
-    return static_cast<unsigned short>(within * kWhole + 0.5);
+    return static_cast<unsigned short>(std::lround(within * kWhole));
 }
 
 } // namespace

@@ -14,6 +14,7 @@ namespace {
 constexpr int kWhitePercent = 100;
 
 // How much darker or lighter than the gray of a bevel its sides are, in percent of white.
+// A dark gray has less room below it.
 constexpr int kBevelShade = 22, kBevelLight = 14;
 
 // Strength of a list's inner shadow from its edge inwards, a value for each pixel.
@@ -21,7 +22,7 @@ constexpr double kShadowAlpha[] = {0.20, 0.11, 0.05, 0.02};
 constexpr int kShadowDepth = static_cast<int>(sizeof kShadowAlpha / sizeof kShadowAlpha[0]);
 
 // Text wells: how much the outline differs from the paper, and the shade below its upper edge.
-constexpr double kWellBorderAlpha = 0.36, kWellTopBorderAlpha = 0.10, kWellShadowAlpha = 0.06;
+constexpr double kWellBorderAlpha = 0.30, kWellTopBorderAlpha = 0.10, kWellShadowAlpha = 0.06;
 
 OS::RGBAColor Shade(double alpha) { return {0, 0, 0, alpha}; }
 
@@ -55,7 +56,7 @@ void Frame3DRect(Rect const *r, short depth, short gray) {
         return;
     int const level = ThemeColors::IsDark() ? kWhitePercent - gray : gray;
     OS::RGBAColor topLeft = ToRGBA(GrayOf(level + kBevelLight));
-    OS::RGBAColor bottomRight = ToRGBA(GrayOf(level - kBevelShade));
+    OS::RGBAColor bottomRight = ToRGBA(GrayOf(level - std::min(kBevelShade, level / 2)));
     if (depth < 0)
         std::swap(topLeft, bottomRight);
     Rect ring = *r;

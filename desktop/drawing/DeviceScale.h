@@ -1,6 +1,7 @@
 // How logical pixels become device pixels.
 #pragma once
 #include "host/Geometry.h"
+#include <cmath>
 #include <cstdint>
 
 // A rectangle in device pixels; right and bottom edges are outside it.
@@ -59,7 +60,7 @@ private:
     static int Thousandths(double factor) {
         if (!(factor >= kLeast)) // also true for what is not a number
             return factor < kLeast ? static_cast<int>(kLeast * kOne) : kOne;
-        return static_cast<int>((factor > kGreatest ? kGreatest : factor) * kOne + 0.5);
+        return static_cast<int>(std::lround((factor > kGreatest ? kGreatest : factor) * kOne));
     }
     std::int64_t Scaled(int logical) const { return static_cast<std::int64_t>(logical) * thousandths; }
     static int RoundedDown(std::int64_t dividend, int divisor) {

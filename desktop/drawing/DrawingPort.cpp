@@ -54,7 +54,7 @@ unsigned long NextSerial() {
 
 // Inside of the frame that the rectangle and the line width make, in device pixels; a line never vanishes.
 DeviceRect Inside(DeviceRect const &r, double lineWidth, DeviceScale scale) {
-    int line = std::max(1, static_cast<int>(lineWidth * scale.Factor() + 0.5));
+    int line = std::max(1, static_cast<int>(std::lround(lineWidth * scale.Factor())));
     return {r.left + line, r.top + line, r.right - line, r.bottom - line};
 }
 

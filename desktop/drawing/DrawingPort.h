@@ -15,7 +15,7 @@
 
 class ClipPath;
 class Surface;
-typedef struct _cairo cairo_t;
+typedef struct _cairo cairo_t; // NOLINT(bugprone-reserved-identifier): Cairo's own name
 
 // What drawing depends on beside the pixels; the savers keep copies of parts of it.
 struct GraphicsState {

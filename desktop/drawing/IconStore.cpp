@@ -70,7 +70,6 @@ void IconStore::FollowResources() {
     atlases.clear();
     sets.clear();
     outlines.clear();
-    latestScale = 0;
     latest = nullptr;
     try {
         for (std::string const &directory : resources.Directories())
@@ -109,7 +108,7 @@ IconSet &IconStore::Demand(DeviceScale scale) {
 
 IconSet &IconStore::ForScale(DeviceScale scale) {
     FollowResources();
-    if (latestScale != scale.Thousandths()) {
+    if (!latest || latestScale != scale.Thousandths()) {
         latest = &Demand(scale);
         latestScale = scale.Thousandths();
     }

@@ -40,7 +40,7 @@ private:
     std::vector<std::vector<std::pair<int, std::string>>>
         atlases;                                  // of each directory: scale in percent, path
     std::map<int, std::unique_ptr<IconSet>> sets; // by scale in thousandths
-    int latestScale = 0;                          // the set that was asked for last, or 0
-    IconSet *latest = nullptr;
+    IconSet *latest = nullptr;                    // the set that was asked for last
+    int latestScale = 0;                          // its scale, in thousandths
     std::map<std::pair<short, short>, OSRgn> outlines;
 };

@@ -26,7 +26,8 @@ OSRgn::~OSRgn() {
 }
 
 OSRgn &OSRgn::operator=(OSRgn const &other) {
-    pixman_region32_copy(&rep->region, &other.rep->region); // does nothing when both are the same
+    if (this != &other)
+        pixman_region32_copy(&rep->region, &other.rep->region);
     return *this;
 }
 

@@ -4,7 +4,7 @@
 #include "desktop/observe/JsonLine.h"
 
 class OSPath;
-typedef struct _cairo cairo_t;
+typedef struct _cairo cairo_t; // NOLINT(bugprone-reserved-identifier): Cairo's own name
 
 namespace PathDrawing {
 

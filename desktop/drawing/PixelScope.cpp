@@ -2,6 +2,7 @@
 #include "desktop/drawing/Surface.h"
 #include <algorithm>
 #include <array>
+#include <cmath>
 #include <cstring>
 
 namespace {
@@ -18,9 +19,13 @@ constexpr std::uint16_t kFadedAlpha = 0x6666;
 
 double Unit(double value) { return value > 0.0 ? std::min(value, 1.0) : 0.0; } // what is not a number gives 0
 
-std::uint32_t Component8(double value) { return static_cast<std::uint32_t>(Unit(value) * kLargest8 + 0.5); }
+std::uint32_t Component8(double value) {
+    return static_cast<std::uint32_t>(std::lround(Unit(value) * kLargest8));
+}
 
-std::uint16_t Component16(double value) { return static_cast<std::uint16_t>(Unit(value) * kLargest16 + 0.5); }
+std::uint16_t Component16(double value) {
+    return static_cast<std::uint16_t>(std::lround(Unit(value) * kLargest16));
+}
 
 pixman_color_t PremultipliedColor(OS::RGBAColor const &color) {
     double alpha = Unit(color.a);

@@ -8,7 +8,7 @@
 #include <vector>
 
 typedef union pixman_image pixman_image_t;
-typedef struct _cairo_surface cairo_surface_t;
+typedef struct _cairo_surface cairo_surface_t; // NOLINT(bugprone-reserved-identifier): Cairo's own name
 
 // Device pixels, 0xAARRGGBB premultiplied, rows from top to bottom without gaps. One block of memory that
 // pixman and Cairo share.
