@@ -13,8 +13,8 @@ void Draw1Icon(short family, short index, short h, short v);
 // Draws the icon into the rectangle: at its own size when the rectangle has that size, else stretched to it.
 void Draw1Icon(short family, short index, Rect const &);
 
-// Size of the family's icons, as a rectangle whose top left is (0, 0). Families of several sizes answer the
-// size of their first icon; an unknown family answers the size of the missing-icon mark.
+// Size of the family's icons, as a rectangle whose top left is (0, 0). Single icons may be of
+// another size than their family's. An unknown family answers the size of the missing-icon mark.
 Rect GetIconBounds(short family);
 // The icon's visible pixels, with its top left corner at (0, 0). The region stays the host's; a copy is
 // wanted for keeping or moving it.
