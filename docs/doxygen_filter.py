@@ -156,8 +156,9 @@ class Filter:
             before = self.comment_before(code, trailing)
             self.fresh = False
         self.scanner.read(code)
-        # In the first line of a body the comment is about what happens there.
-        after = [] if trailing is None or self.scanner.in_body() else self.trailing_lines(column, trailing)
+        # In the first line of a body the comment is about what happens there, and after a brace about what it closes.
+        is_prose = trailing is None or self.scanner.in_body() or code.lstrip().startswith("}")
+        after = [] if is_prose else self.trailing_lines(column, trailing)
         if after and TYPE.match(code) and not FORWARD.match(code):
             before, after = [text.replace("///<", "///") for text in after], []
         for declaration in one_by_one(code) if before or after else [code]:

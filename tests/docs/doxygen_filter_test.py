@@ -56,6 +56,9 @@ class FilterTest(unittest.TestCase):
         self.assertEqual(read("// File.\n\nint a(); // Goes\n         // on.")[3:],
                          ["int a(); ///< Goes", "         ///< on."])
 
+    def test_a_comment_after_a_closing_brace_belongs_to_nothing(self):
+        self.assertEqual(read("// File.\n\nnamespace a {\n} // namespace a")[3:], ["namespace a {", "}"])
+
     def test_slashes_in_a_string_are_no_comment(self):
         self.assertEqual(read('// File.\n\nauto a = "http://b";')[3:], ['auto a = "http://b";'])
 
