@@ -8,9 +8,9 @@ public:
     AutoSetActivityListener();
     virtual ~AutoSetActivityListener();
 
-    // The pane behind the provider is about to be used: a text field before each key that changes its text
-    // and before it takes a click, a pop-up menu before it opens. The source is the provider base of that
-    // pane, the same pointer that was subscribed to.
+    // The pane behind the provider is about to be used: a text field before each key that changes its text,
+    // before it takes a click and before text is pasted into it, a pop-up menu before it opens. The source is
+    // the provider base of that pane, the same pointer that was subscribed to.
     virtual void ListenToActivity(Provider<AutoSetActivityListener> *source) = 0;
 };
 

@@ -78,8 +78,9 @@ public:
                                     Dependent<T> *exclude);
 
     // For senders: false when there is surely nobody to tell, so that no message need be built. One pointer
-    // test. It stays true after the last dependent has left during a broadcast, until one is added and leaves
-    // again outside of a broadcast.
+    // test: it tells of the list, which may be empty. It stays true after the last dependent has left during
+    // a broadcast, or after a first AddDependent that ran out of memory, until one is added and leaves again
+    // outside of a broadcast; and for a copy that shares the list after the last one has left the other.
     bool HasDependents() const { return list.get() != nullptr; }
 
 private:
@@ -277,7 +278,7 @@ typename Provider<T>::Entry Provider<T>::Find(DependentList &list, Dependent<T> 
                         [dependent](Dependent<T> *entry) { return entry == dependent; });
 }
 
-// Thrown by hand: the text is part of the contract, and std::vector::at has its own.
+// Thrown by hand: the text is part of the interface, and std::vector::at has its own.
 template <class T> T *Provider<T>::EntryAt(DependentList const &list, std::size_t index) {
     if (index >= list.dependents.size())
         throw std::out_of_range("invalid vector<T> subscript");

@@ -14,6 +14,14 @@ template <class Function> std::size_t PlaceOf(Function function) {
     return (offset - 1) / sizeof(void *);
 }
 
+// What stands at a place of the table that the object begins with: the function that a call leads to. By the
+// same ABI the object's first word is the address of the table.
+template <class Object> void const *OperationAt(std::size_t place, Object const &object) {
+    void const *const *table = nullptr;
+    std::memcpy(&table, static_cast<void const *>(&object), sizeof table);
+    return table[place];
+}
+
 constexpr std::size_t kAfterDestructor = 2;
 
 // The operations stand side by side from the first place on.

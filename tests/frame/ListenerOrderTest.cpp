@@ -1,4 +1,4 @@
-// The operations of a listener follow those of its dependent, in the order of the contract.
+// The operations of a listener follow those of its dependent, in the order of the interface.
 #include "frame/AutoSetActivityListener.h"
 #include "frame/BoxSelectPaneListener.h"
 #include "frame/ButtonGroupPaneListener.h"
@@ -52,8 +52,13 @@ TEST(ListenerOrder, OfLists) {
     ExpectInOrder(kAfterDependent, &L::SelectionDone, &L::ClickOccured, &L::SelectOccured);
 }
 
-TEST(ListenerOrder, OfScrollBarsWhoseProviderDyingIsTheDependents) {
-    ExpectInOrder(kAfterDestructor, &OpenBarListener::ProviderDying, &OpenBarListener::ScrollBarPaneDying);
+TEST(ListenerOrder, OfScrollBars) { ExpectInOrder(kAfterDependent, &OpenBarListener::ScrollBarPaneDying); }
+
+TEST(ListenerOrder, OfScrollBarsReplacesTheProviderDyingOfTheDependent) {
+    ASSERT_EQ(PlaceOf(&OpenBarListener::ProviderDying), kAfterDestructor);
+    Dependent<ScrollBarPane_Listener> const dependent;
+    ScrollBarPane_Listener const listener;
+    EXPECT_NE(OperationAt(kAfterDestructor, listener), OperationAt(kAfterDestructor, dependent));
 }
 
 TEST(ListenerOrder, OfPopUpMenus) {

@@ -64,6 +64,33 @@ TEST_F(ProviderTest, OneRemovalUndoesAddingTwice) {
     EXPECT_EQ(log, Log());
 }
 
+TEST_F(ProviderTest, AddingTwiceIsRememberedOnceByTheDependent) {
+    Allocations::Counter once;
+    a.AddProvider(&mouth);
+    long const toRememberOnce = once.Count();
+    a.RemoveProvider(&mouth);
+    Allocations::Counter twice;
+    a.AddProvider(&mouth);
+    a.AddProvider(&mouth);
+    EXPECT_EQ(twice.Count(), toRememberOnce) << "a second entry needs a larger vector";
+    a.RemoveProvider(&mouth);
+    Allocations::Counter again;
+    a.AddProvider(&mouth);
+    EXPECT_EQ(again.Count(), toRememberOnce) << "an entry was left behind";
+    a.RemoveProvider(&mouth);
+}
+
+TEST_F(ProviderTest, ADependentThatWasAddedTwiceAndHasLeftMayOutliveTheProvider) {
+    std::unique_ptr<Listener> survivor(new Listener("s", log));
+    std::unique_ptr<Mouth> shortLived(new Mouth);
+    survivor->DependUpon(shortLived.get());
+    survivor->DependUpon(shortLived.get());
+    survivor->CancelDependency(shortLived.get());
+    shortLived.reset();
+    survivor.reset(); // would ask the dead provider if it still remembered it
+    EXPECT_EQ(log, Log());
+}
+
 TEST_F(ProviderTest, AddingAgainKeepsTheOldPlace) {
     AddAll();
     mouth.AddDependent(&a);

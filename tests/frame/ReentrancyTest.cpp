@@ -1,4 +1,5 @@
 // What dependents may do while a message goes round.
+#include "desktop/AssertionHandler.h"
 #include "tests/frame/Ears.h"
 #include <boost/weak_ptr.hpp>
 #include <gtest/gtest.h>
@@ -202,6 +203,13 @@ TEST_F(Reentrancy, ADependentThatJoinedIsCalledByANestedBroadcast) {
 
 namespace {
 
+struct BrokenPointer {};
+
+[[noreturn]] void ThrowBrokenPointer(char const *text) {
+    EXPECT_EQ(std::string(text).find("px != 0"), 0u) << text;
+    throw BrokenPointer();
+}
+
 // The walk over a list that the test can look into.
 class Walk : public testing::Test {
 protected:
@@ -295,6 +303,13 @@ TEST_F(Walk, AListThatBecameShorterIsReportedToTheSender) {
     }
     EXPECT_EQ(log, (Log{"a: w", "b: w"}));
     EXPECT_FALSE(list->broadcasting);
+}
+
+TEST_F(Walk, OfNoListFailsAnAssertion) {
+    list.reset();
+    SetAssertionHandler(ThrowBrokenPointer);
+    EXPECT_THROW(Broadcast(), BrokenPointer);
+    SetAssertionHandler(nullptr);
 }
 
 TEST_F(Walk, KeepsTheListAliveUntilItEnds) {
