@@ -37,8 +37,8 @@ bool GenericButtonTrackingLoop(bool reportInside, Rect const *rect, TransitionPr
     bool inside = true;
     ShowPress(proc, data);
 
-    // A wait that ends by timeout may leave the point alone: until the mouse moves, it is where it was
-    // pressed.
+    // A wait that ends by timeout may leave the point alone: until the mouse moves it counts as inside, by
+    // the corner that is.
     Point where = {rect->top, rect->left};
     // The hook and the wait may change port and clip, so each round of wait, procedure and hook has a saver
     // of its own.

@@ -99,9 +99,7 @@ void OvalButtonPane::DrawFace(Rect const &r) const {
 
 // Fills what the caps leave with whole pieces; the clip cuts the last one short, so that any width works.
 void OvalButtonPane::DrawMiddle(Rect const &r, short icon) const {
-    int const pieces = (r.right - r.left) / kPieceWidth - 1;
-    if (pieces <= 0)
-        return; // the caps meet or overlap
+    int const pieces = (r.right - r.left) / kPieceWidth - 1; // 0 or fewer where the caps meet or overlap
     Rect middle = r;
     middle.left = static_cast<short>(r.left + kPieceWidth);
     middle.right = static_cast<short>(r.right - kPieceWidth);

@@ -26,8 +26,7 @@ public:
 protected:
     OvalButtonPane();
     // Attach the pane in the mode given and set its box and label, the latter by its number in the string
-    // list. Where the pane lies in a layout, its item takes the layout properties of oval buttons from the
-    // glog's style sheet.
+    // list. The pane's layout item takes the layout properties of oval buttons from the glog's style sheet.
     OvalButtonPane *InitOvalButtonPane(glogRec *, gobResRec *);
     OvalButtonPane *InitOvalButtonPane(glogRec *, Point topLeft, short width, short textNum, short mode);
 

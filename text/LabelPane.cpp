@@ -162,8 +162,9 @@ void LabelPane::CalcBox() {
     Rect box;
     box.left = static_cast<short>(left - (extraWidth >> 1));
     box.top = static_cast<short>(baseline - info.ascent - (extraHeight >> 1));
-    box.right = static_cast<short>(left + width + ((extraWidth + 1) >> 1));
-    box.bottom = static_cast<short>(baseline + info.descent + ((extraHeight + 1) >> 1));
+    // The sums wrap before they are halved, as all coordinates do.
+    box.right = static_cast<short>(left + width + (static_cast<short>(extraWidth + 1) >> 1));
+    box.bottom = static_cast<short>(baseline + info.descent + (static_cast<short>(extraHeight + 1) >> 1));
 
     if (!IsInLayout()) {
         SetTextOrigin(Point{baseline, left});

@@ -126,7 +126,9 @@ void LabelPaneImplementation::CalcBox() {
     int const textLeft = box.left + (extraWidth >> 1);
     SetTextOrigin(
         Point{static_cast<short>(box.top + info.ascent + (extraHeight >> 1)), static_cast<short>(textLeft)});
-    box.right = static_cast<short>(textLeft + _StringWidthMethod() + ((extraWidth + 1) >> 1));
+    // The sum wraps before it is halved, as all coordinates do.
+    int const rightExtra = static_cast<short>(extraWidth + 1) >> 1;
+    box.right = static_cast<short>(textLeft + _StringWidthMethod() + rightExtra);
     box.bottom = static_cast<short>(box.top + extraHeight + info.ascent + info.descent);
     GlogPane::SetBox(&box);
 }
