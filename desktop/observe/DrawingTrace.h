@@ -1,4 +1,4 @@
-// Every drawing call of the contract, as it happens.
+// Every drawing call of the interface, as it happens.
 #pragma once
 #include <functional>
 #include <string>

@@ -1,4 +1,4 @@
-// The small values of the contract: what they are by default and what they are made of.
+// The small values of the interface: what they are by default and what they are made of.
 #include "host/CommandSpecifier.h"
 #include "host/DurationValue.h"
 #include "host/EventRecordAdapter.h"

@@ -1,4 +1,4 @@
-// The order of virtual operations is part of the contract: code that was compiled against it calls them by
+// The order of virtual operations is part of the interface: code that was compiled against it calls them by
 // place.
 #include "frame/Provider.h"
 #include "host/CallbackAPI.h"
