@@ -36,6 +36,19 @@ TEST(Clip, CurvesRespectTheSameClipAsPixels) {
     }
 }
 
+TEST(Clip, CurvesFollowEveryChangeOfTheClip) {
+    Canvas canvas(12, 12);
+    canvas.port.SetClip(OSRgn(Rect{0, 0, 2, 2}));
+    OSPort::Current().PaintRoundRect({-9, -9, 60, 60}, {1, 1});
+    canvas.port.SetClip(OSRgn(Rect{8, 8, 12, 12}));
+    OSPort::Current().PaintRoundRect({-9, -9, 60, 60}, {1, 1});
+    EXPECT_EQ(canvas.Count(Canvas::kBlack), 4 + 16);
+    OSPort::Current().NarrowClip({0, 0, 9, 9});
+    OSPort::Current().SetForeColor(OS::RGBAColor(1, 0, 0, 1));
+    OSPort::Current().PaintRoundRect({-9, -9, 60, 60}, {1, 1});
+    EXPECT_EQ(canvas.Count(Canvas::kRed), 1);
+}
+
 TEST(Clip, WhatIsSetIsCutToTheBoundary) {
     Canvas canvas(6, 6);
     canvas.port.SetBoundary(OSRgn(Rect{0, 0, 3, 3}));
@@ -204,6 +217,20 @@ TEST(Touched, BoxesCoverWhatWasDrawnAndNothingElseOnce) {
     EXPECT_EQ(touched[0].Width() * touched[0].Height(), 100);
     EXPECT_TRUE(touched[1].Contains({300, 300, 310, 310}));
     EXPECT_TRUE(canvas.port.TakeTouched().empty());
+}
+
+TEST(Touched, CurvesAndLinesCountToo) {
+    Canvas canvas(100, 100, 2);
+    OSPort::Current().PaintOval({10, 10, 5, 5});
+    std::vector<DeviceRect> touched = canvas.port.TakeTouched();
+    ASSERT_EQ(touched.size(), 1u);
+    EXPECT_TRUE(touched[0].Contains({20, 20, 30, 30}));
+    EXPECT_LT(touched[0].Width(), 20);
+    VelaDrawing::MoveTo(3, 4);
+    VelaDrawing::LineTo(8, 9);
+    touched = canvas.port.TakeTouched();
+    ASSERT_EQ(touched.size(), 1u);
+    EXPECT_TRUE(touched[0].Contains({6, 8, 18, 20}));
 }
 
 TEST(Touched, ManyPlacesAreMergedIntoAFewBoxes) {

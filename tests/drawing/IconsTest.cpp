@@ -96,13 +96,17 @@ TEST_F(Artwork, AtEveryScaleBothEdgesAreRoundedAndNothingIsScaled) {
     std::vector<double> const scales = {1, 1.25, 1.5, 2, 3};
     Open(scales);
     for (double factor : scales) {
-        for (short h = 0; h < 5; ++h) {
+        for (int place = 0; place < 25; ++place) {
+            short const h = static_cast<short>(place % 5), v = static_cast<short>(place / 5);
             Canvas canvas(20, 20, factor);
             canvas.Wipe(kGround);
-            Draw1Icon(kFamily, kSolid, h, static_cast<short>(h + 1));
-            DeviceRect const expected = canvas.scale.ToDevice(h, h + 1, h + 5, h + 6);
-            EXPECT_TRUE(BoxOf(canvas, kGround) == expected) << factor << " at " << h;
-            EXPECT_EQ(canvas.Count(kBlue), expected.Width() * expected.Height() - 2) << factor << " at " << h;
+            Draw1Icon(kFamily, kSolid, h, v);
+            DeviceRect const expected = canvas.scale.ToDevice(h, v, h + 5, v + 5);
+            EXPECT_TRUE(BoxOf(canvas, kGround) == expected) << factor << " at " << h << ", " << v;
+            EXPECT_EQ(canvas.At(expected.left, expected.top), Canvas::kWhite)
+                << factor << " at " << h << ", " << v;
+            EXPECT_EQ(canvas.Count(kBlue), expected.Width() * expected.Height() - 2)
+                << factor << " at " << h << ", " << v;
         }
     }
 }

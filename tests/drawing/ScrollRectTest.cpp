@@ -73,7 +73,8 @@ TEST_P(ScrollRectTest, MovesPixelsThroughAClipWithHoles) {
 INSTANTIATE_TEST_SUITE_P(Everywhere, ScrollRectTest,
                          testing::Values(Scroll{1, 5, 0}, Scroll{1, -5, 0}, Scroll{1, 0, 5}, Scroll{1, 0, -5},
                                          Scroll{1, 1, 1}, Scroll{1, -3, 7}, Scroll{1, 3, -7},
-                                         Scroll{1, 100, 0}, Scroll{1.5, 4, 0}, Scroll{1.5, -4, 2},
+                                         Scroll{1, 100, 0}, Scroll{1, 10, 0}, Scroll{1, -10, 0},
+                                         Scroll{1, 10, 3}, Scroll{1.5, 4, 0}, Scroll{1.5, -4, 2},
                                          Scroll{1.5, 0, -6}, Scroll{1.25, 0, 4}, Scroll{1.25, -8, 0},
                                          Scroll{2, 3, 0}, Scroll{2, -1, 1}, Scroll{2, 0, -9},
                                          Scroll{2, 0, 9}));

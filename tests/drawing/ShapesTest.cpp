@@ -157,6 +157,12 @@ TEST(Lines, DiagonalsHaveOnePixelPerStep) {
     EXPECT_EQ(shallow[2][4], '#');
 }
 
+TEST(Lines, APixelOfADiagonalIsTheOneNearestToTheIdealLine) {
+    Canvas canvas(7, 3);
+    Line(0, 0, 6, 2);
+    EXPECT_EQ(canvas.Picture(), (Rows{"##.....", "..###..", ".....##"}));
+}
+
 TEST(Lines, TheDirectionDoesNotMatter) {
     for (int i = 0; i < 200; ++i) {
         short const h = static_cast<short>(i * 7 % 23), v = static_cast<short>(i * 5 % 19);
