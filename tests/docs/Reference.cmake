@@ -2,6 +2,12 @@
 file(REMOVE_RECURSE ${OUTPUT_DIR})
 file(MAKE_DIRECTORY ${OUTPUT_DIR})
 file(READ ${SOURCE_DIR}/docs/Doxyfile settings)
+# A folder of panes that is not told of would be left out without a word.
+foreach(folder host frame buttons scrolling lists text menus tabs graphics)
+  if(IS_DIRECTORY ${SOURCE_DIR}/${folder} AND NOT settings MATCHES "\nINPUT[^\n]* ${folder}( |\n)")
+    message(FATAL_ERROR "INPUT in docs/Doxyfile lacks the folder ${folder}")
+  endif()
+endforeach()
 file(WRITE ${OUTPUT_DIR}/Doxyfile "${settings}\nOUTPUT_DIRECTORY = ${OUTPUT_DIR}\n")
 execute_process(COMMAND ${DOXYGEN} ${OUTPUT_DIR}/Doxyfile WORKING_DIRECTORY ${SOURCE_DIR} RESULT_VARIABLE result
                 OUTPUT_VARIABLE written ERROR_VARIABLE complaints)
