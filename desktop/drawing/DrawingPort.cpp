@@ -6,6 +6,8 @@
 #include "desktop/drawing/PixelScope.h"
 #include "desktop/drawing/PortDevice.h"
 #include "desktop/drawing/Region.h"
+#include "desktop/drawing/RoundCorners.h"
+#include "desktop/drawing/ShapeMask.h"
 #include "desktop/drawing/Surface.h"
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/observe/DrawingTrace.h"
@@ -52,9 +54,14 @@ unsigned long NextSerial() {
     return ++last;
 }
 
-// Inside of the frame that the rectangle and the line width make, in device pixels; a line never vanishes.
+// Width of a frame's line in device pixels; a line never vanishes.
+int LineWidth(double lineWidth, DeviceScale scale) {
+    return std::max(1, static_cast<int>(std::lround(lineWidth * scale.Factor())));
+}
+
+// Inside of the frame that the rectangle and the line width make.
 DeviceRect Inside(DeviceRect const &r, double lineWidth, DeviceScale scale) {
-    int line = std::max(1, static_cast<int>(std::lround(lineWidth * scale.Factor())));
+    int const line = LineWidth(lineWidth, scale);
     return {r.left + line, r.top + line, r.right - line, r.bottom - line};
 }
 
@@ -195,61 +202,78 @@ void DrawingPort::FrameRect(OS::RectBase<OS::RectTag> const &r) {
     pixels.FillFrame(outer, Inside(outer, state.lineWidth, scale), state.fore);
 }
 
+// Under a path as clip the edges of both have to be smooth, which only Cairo can do.
+void DrawingPort::DrawSmooth(Rect const &bounds, std::function<void(cairo_t *)> const &draw) {
+    if (clipPath) {
+        CairoScope const scope(*this, bounds);
+        if (scope.Context())
+            draw(scope.Context());
+        return;
+    }
+    PixelScope pixels(*this);
+    if (!pixels.CanDraw())
+        return;
+    DeviceRect const box = pixels.ToDevice(bounds).Intersected({0, 0, surface->Width(), surface->Height()});
+    if (box.Empty() || !pixels.Meets(box))
+        return;
+    ShapeMask const mask(box, [&](cairo_t *context) {
+        cairo_translate(context, -box.left, -box.top);
+        cairo_scale(context, scale.Factor(), scale.Factor());
+        cairo_translate(context, originH, originV);
+        cairo_set_line_width(context, state.lineWidth);
+        draw(context);
+    });
+    pixels.FillThrough(mask.Image(), 0, 0, box, state.fore);
+}
+
+// Outlines on whole device pixels keep the straight parts sharp at every scale.
+void DrawingPort::DrawRoundRect(Rect const &bounds, OS::Size const &corner, int line) {
+    double const radiusH = Radius(corner.width, scale), radiusV = Radius(corner.height, scale);
+    Rect const window = LocalToWindow(bounds);
+    DeviceRect const outer = scale.ToDevice(window.left, window.top, window.right, window.bottom);
+    if (!clipPath) {
+        PixelScope pixels(*this);
+        if (pixels.CanDraw())
+            RoundCorners{radiusH, radiusV, line}.Draw(pixels, outer, state.fore);
+        return;
+    }
+    DrawSmooth(bounds, [&](cairo_t *context) {
+        cairo_identity_matrix(context);
+        RoundCorners{radiusH, radiusV, line}.AppendPath(context, outer);
+        cairo_fill(context);
+    });
+}
+
 void DrawingPort::FrameRoundRect(OS::RectBase<OS::RectTag> const &r, OS::Size const &corner) {
     Trace("FrameRoundRect", r, corner);
-    Rect bounds = WholeRect(r);
-    CairoScope scope(*this, bounds);
-    if (!scope.Context())
-        return;
-    // Two outlines on whole device pixels keep the straight parts sharp at every scale.
-    Rect window = LocalToWindow(bounds);
-    DeviceRect outer = scale.ToDevice(window.left, window.top, window.right, window.bottom);
-    DeviceRect inner = Inside(outer, state.lineWidth, scale);
-    double radiusH = Radius(corner.width, scale), radiusV = Radius(corner.height, scale);
-    cairo_identity_matrix(scope.Context());
-    cairo_set_fill_rule(scope.Context(), CAIRO_FILL_RULE_EVEN_ODD);
-    PathDrawing::AppendRoundRect(scope.Context(), outer, radiusH, radiusV);
-    PathDrawing::AppendRoundRect(scope.Context(), inner, radiusH - (inner.left - outer.left),
-                                 radiusV - (inner.top - outer.top));
-    cairo_fill(scope.Context());
+    DrawRoundRect(WholeRect(r), corner, LineWidth(state.lineWidth, scale));
 }
 
 void DrawingPort::PaintRoundRect(OS::RectBase<OS::RectTag> const &r, OS::Size const &corner) {
     Trace("PaintRoundRect", r, corner);
-    Rect bounds = WholeRect(r);
-    CairoScope scope(*this, bounds);
-    if (!scope.Context())
-        return;
-    Rect window = LocalToWindow(bounds);
-    cairo_identity_matrix(scope.Context());
-    PathDrawing::AppendRoundRect(scope.Context(),
-                                 scale.ToDevice(window.left, window.top, window.right, window.bottom),
-                                 Radius(corner.width, scale), Radius(corner.height, scale));
-    cairo_fill(scope.Context());
+    DrawRoundRect(WholeRect(r), corner, 0);
 }
 
 void DrawingPort::PaintOval(OS::RectBase<OS::RectTag> const &r) {
     Trace("PaintOval", r);
     Rect bounds = WholeRect(r);
     VelaDrawing::InsetRect(&bounds, -1, -1); // the ellipse keeps its fractions, which rounding may have cut
-    CairoScope scope(*this, bounds);
-    if (!scope.Context())
-        return;
-    double left = FiniteCoordinate(std::min(r.origin.x, r.origin.x + r.size.width));
-    double top = FiniteCoordinate(std::min(r.origin.y, r.origin.y + r.size.height));
-    PathDrawing::AppendOval(scope.Context(), left, top, FiniteCoordinate(std::abs(r.size.width)),
-                            FiniteCoordinate(std::abs(r.size.height)));
-    cairo_fill(scope.Context());
+    double const left = FiniteCoordinate(std::min(r.origin.x, r.origin.x + r.size.width));
+    double const top = FiniteCoordinate(std::min(r.origin.y, r.origin.y + r.size.height));
+    DrawSmooth(bounds, [&](cairo_t *context) {
+        PathDrawing::AppendOval(context, left, top, FiniteCoordinate(std::abs(r.size.width)),
+                                FiniteCoordinate(std::abs(r.size.height)));
+        cairo_fill(context);
+    });
 }
 
 void DrawingPort::StrokePath(OSPath const &path) {
     if (DrawingTrace::On())
         DrawingTrace::Write(PathDrawing::Described("StrokePath", path));
-    CairoScope scope(*this, PathDrawing::Bounds(path, state.lineWidth * kFarthestMiter + 1));
-    if (!scope.Context())
-        return;
-    PathDrawing::Append(scope.Context(), path);
-    cairo_stroke(scope.Context());
+    DrawSmooth(PathDrawing::Bounds(path, state.lineWidth * kFarthestMiter + 1), [&](cairo_t *context) {
+        PathDrawing::Append(context, path);
+        cairo_stroke(context);
+    });
 }
 
 void DrawingPort::SetForeColor(OS::RGBAColor const &color) {

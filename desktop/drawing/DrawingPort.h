@@ -134,6 +134,10 @@ private:
 
     void ClipChanged();
     void CutClip(OSRgn const &);
+    // Draws a smooth shape that lies in the local rectangle; user space is local logical coordinates.
+    void DrawSmooth(Rect const &bounds, std::function<void(cairo_t *)> const &);
+    // `line` is the width of a frame in device pixels; 0 fills.
+    void DrawRoundRect(Rect const &bounds, OS::Size const &corner, int line);
     void MoveDevicePixels(OSRgn const &destination, int dh, int dv);
     static DrawingPort *current;
 

@@ -171,3 +171,15 @@ void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRec
     else
         compose(image.opaque ? PIXMAN_OP_SRC : PIXMAN_OP_OVER, image.pixels, nullptr);
 }
+
+void PixelScope::FillThrough(pixman_image_t *mask, int fromH, int fromV, DeviceRect const &box,
+                             OS::RGBAColor const &color) {
+    if (!mask || !Meets(box))
+        return;
+    SolidImage const solid(PremultipliedColor(port.state.darken != 0 ? port.Ink() : color));
+    ForEachVisible(box, [&](DeviceRect const &part) {
+        pixman_image_composite32(PIXMAN_OP_OVER, solid.Get(), mask, port.surface->PixmanImage(), 0, 0,
+                                 part.left - box.left + fromH, part.top - box.top + fromV, part.left,
+                                 part.top, part.Width(), part.Height());
+    });
+}

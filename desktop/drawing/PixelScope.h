@@ -63,6 +63,11 @@ public:
     // end when it is smaller than the box. Faded if the state says so and `fades` is true.
     void DrawImage(PixelImage const &, int left, int top, DeviceRect const &box, bool fades);
 
+    // In the given colour as far as the mask covers each pixel; the box's top left corner takes the mask's
+    // pixel at the given place. A null mask draws nothing.
+    void FillThrough(pixman_image_t *mask, int fromH, int fromV, DeviceRect const &box,
+                     OS::RGBAColor const &);
+
 private:
     void FillBox(DeviceRect const &, OS::RGBAColor const &);
     void FillPixels(DeviceRect const &, std::uint32_t pixel);
