@@ -7,7 +7,7 @@
 #include "host/Geometry.h"
 
 // What a tracking procedure is told.
-enum TransitionTo {
+enum TransitionTo : int {      // a procedure has to put up with further values
     kTransitionToIdle = 0,     // the mouse left the rectangle
     kTransitionToPressed = 1,  // the mouse is in the rectangle: sent first, and whenever it comes back
     kTransitionToReleased = 2, // released inside; the last call of a completed press

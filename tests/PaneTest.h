@@ -6,6 +6,7 @@
 #include "host/EventRecordAdapter.h"
 #include "host/GlogPane.h"
 #include "host/GlogStyleSheet.h"
+#include "host/PortSavers.h"
 #include "host/UString.h"
 #include "host/XMLLib.h"
 #include "host/glogRec.h"
@@ -27,6 +28,16 @@ inline std::ostream &operator<<(std::ostream &out, Rect const &r) {
 }
 inline std::ostream &operator<<(std::ostream &out, Point p) {
     return out << "{v " << p.v << ", h " << p.h << "}";
+}
+
+// The colours of a port, all components of both.
+inline bool operator==(SaveColorRec const &a, SaveColorRec const &b) {
+    return a.fore.red == b.fore.red && a.fore.green == b.fore.green && a.fore.blue == b.fore.blue &&
+           a.back.red == b.back.red && a.back.green == b.back.green && a.back.blue == b.back.blue;
+}
+inline std::ostream &operator<<(std::ostream &out, SaveColorRec const &c) {
+    return out << std::hex << "{" << c.fore.red << " " << c.fore.green << " " << c.fore.blue << " on "
+               << c.back.red << " " << c.back.green << " " << c.back.blue << "}" << std::dec;
 }
 
 // Makes the protected operations of a pane class callable: (pane.*&Opened<Pane>::DrawGuts)(nullptr).
@@ -90,6 +101,17 @@ protected:
     // The drawing calls of the whole pane.
     template <class Pane> Lines DrawingOf(Pane &pane) {
         return Traced(pane, [&] { (pane.*&Opened<Pane>::DrawGuts)(nullptr); });
+    }
+
+    // Draws the whole pane in a port with colours that it has no use for; true if they are back afterwards.
+    template <class Pane> bool KeepsColors(Pane &pane) {
+        SaveColorRec const tinted = {{0xC000, 0x1000, 0x2000}, {0x3000, 0xD000, 0x4000}};
+        pane.Prepare();
+        SetColors(&tinted);
+        (pane.*&Opened<Pane>::DrawGuts)(nullptr);
+        SaveColorRec after;
+        GetColors(&after);
+        return after == tinted;
     }
 
     // The calls of one name, such as "Draw1Icon".

@@ -1,8 +1,10 @@
 #include "buttons/ButtonTracking.h"
+#include "desktop/windows/SimulatedWindowSystem.h"
 #include "host/CallbackAPI.h"
 #include "host/Icons.h"
 #include "host/OSRgn.h"
 #include "host/PortSavers.h"
+#include "host/Services.h"
 #include "host/VelaDrawing.h"
 #include "tests/PaneTest.h"
 
@@ -130,6 +132,11 @@ protected:
 TEST_F(ButtonTracking, AShortClickIsToldPressedTickReleased) {
     EXPECT_TRUE(Track("click 30 20"));
     EXPECT_EQ(recorder.All(), (Transitions{kTransitionToPressed, kTransitionTick, kTransitionToReleased}));
+}
+
+TEST_F(ButtonTracking, TransitionsAreToldByTheirNumbers) {
+    Track("press 30 20\nwait 0.11\nmove 90 90\nmove 31 21\nrelease");
+    EXPECT_EQ(recorder.All(), (Transitions{1, 3, 0, 1, 3, 2}));
 }
 
 TEST_F(ButtonTracking, ThePressShowsForATenthOfASecond) {
@@ -260,18 +267,119 @@ TEST_F(ButtonTracking, AHookThatChangesThePortDoesNotHarmTheNextStep) {
         EXPECT_EQ(port, glog->GetPort());
 }
 
-TEST_F(ButtonTracking, TheStockProcedureDrawsTheIconOfTheTransition) {
-    IconTrackingRec rec = {7, 9, kFamily, 0, 3, 2};
-    for (int to = kTransitionToIdle; to <= kTransitionToReleased; ++to) {
-        short const icon = to == kTransitionToIdle ? 0 : to == kTransitionToPressed ? 3 : 2;
-        EXPECT_EQ(Traced(*pane, [&] { IconButtonTransitionProc(&rec, static_cast<TransitionTo>(to)); }),
-                  Traced(*pane, [&] { Draw1Icon(kFamily, icon, 9, 7); }));
+namespace {
+
+// A platform on which something else may have drawn whenever the application has waited.
+class MeddlingWindows : public SimulatedWindowSystem {
+public:
+    MeddlingWindows()
+        : SimulatedWindowSystem(1.0) {}
+    bool WaitEvent(InputEvent &event, double timeout, Waiter waiter, char const *what) override {
+        if (onWait)
+            onWait();
+        return SimulatedWindowSystem::WaitEvent(event, timeout, waiter, what);
     }
+    std::function<void()> onWait;
+};
+
+class MeddlingDesktop : public Desktop {
+public:
+    MeddlingDesktop()
+        : Desktop(DesktopOptions(), std::make_unique<MeddlingWindows>()) {}
+    MeddlingWindows &System() { return static_cast<MeddlingWindows &>(Windows()); }
+};
+
+// Leaves a narrow clip and another port behind in some of the waits of a press.
+class MeddledTracking : public testing::Test {
+protected:
+    struct Transition {
+        OSPort *port;
+        Rect clip;
+    };
+
+    MeddledTracking()
+        : glog(desktop.NewGlog(GlogOptions().Size(320, 200)))
+        , other(desktop.NewGlog(GlogOptions().Size(50, 50)))
+        , pane(new ClickedPane(glog)) {
+        desktop.FinishGlog(glog);
+        ShowGlog(glog, kShowGlog);
+        desktop.System().onWait = [this] {
+            if (!mayMeddle || !mayMeddle())
+                return;
+            ++meddled;
+            Rect const narrow = {0, 0, 1, 1};
+            VelaDrawing::ClipRect(&narrow);
+            SetPortToGlog(other);
+        };
+        pane->onClick = [this] {
+            start = TarnSystemTime::GetCurrentEventTime();
+            GenericButtonTrackingLoop(true, &kButton, Note, this);
+            return -1;
+        };
+    }
+
+    static void Note(void *data, enum TransitionTo) {
+        Transition seen = {nullptr, {}};
+        VelaDrawing::GetPort(&seen.port);
+        OSRgn clip;
+        VelaDrawing::GetClip(&clip);
+        seen.clip = CarbonUtils::GetRgnBounds(&clip);
+        static_cast<MeddledTracking *>(data)->seen.push_back(seen);
+    }
+
+    // Whether the press has been shown and nothing else yet.
+    bool Pressed() const { return seen.size() == 2; }
+    double SincePress() const { return TarnSystemTime::GetCurrentEventTime() - start; }
+
+    // Every transition of a press that was not moved finds the port and the clip of the first.
+    void ExpectUndisturbed(std::string const &script) {
+        desktop.System().Append(EventScript::Parse(script, "press"));
+        desktop.Run();
+        EXPECT_GT(meddled, 0);
+        ASSERT_EQ(seen.size(), 3u);
+        for (Transition const &transition : seen) {
+            EXPECT_EQ(transition.port, glog->GetPort());
+            EXPECT_EQ(transition.clip, seen.front().clip);
+        }
+    }
+
+    MeddlingDesktop desktop;
+    glogRec *glog, *other;
+    ClickedPane *pane;
+    std::function<bool()> mayMeddle;
+    int meddled = 0;
+    double start = 0;
+    std::vector<Transition> seen;
+};
+
+double const kShownFor = 0.1;
+
+} // namespace
+
+TEST_F(MeddledTracking, WhatDrawsWhileThePressShowsDoesNotHarmTheRelease) {
+    mayMeddle = [this] { return Pressed() && SincePress() < kShownFor; };
+    ExpectUndisturbed("click 30 20");
 }
 
-TEST_F(ButtonTracking, TheStockProcedureDrawsNothingForATick) {
+TEST_F(MeddledTracking, WhatDrawsDuringTheLastWaitDoesNotHarmTheRelease) {
+    mayMeddle = [this] { return Pressed() && SincePress() >= kShownFor; };
+    ExpectUndisturbed("press 30 20\nwait 0.12\nrelease");
+}
+
+TEST_F(ButtonTracking, TheStockProcedureDrawsTheIconOfTheTransition) {
     IconTrackingRec rec = {7, 9, kFamily, 0, 3, 2};
-    EXPECT_TRUE(Traced(*pane, [&] { IconButtonTransitionProc(&rec, kTransitionTick); }).empty());
+    short const icons[] = {0, 3, 2}; // by the number of the transition
+    for (int to = 0; to < 3; ++to)
+        EXPECT_EQ(Traced(*pane, [&] { IconButtonTransitionProc(&rec, static_cast<TransitionTo>(to)); }),
+                  Traced(*pane, [&] { Draw1Icon(kFamily, icons[to], 9, 7); }));
+}
+
+TEST_F(ButtonTracking, TheStockProcedureDrawsNothingForATickOrAnyOtherValue) {
+    IconTrackingRec rec = {7, 9, kFamily, 0, 3, 2};
+    for (int to : {3, 4, 255, -1})
+        EXPECT_TRUE(
+            Traced(*pane, [&] { IconButtonTransitionProc(&rec, static_cast<TransitionTo>(to)); }).empty())
+            << to;
 }
 
 TEST_F(ButtonTracking, AnIconRecordHasSixShortsInOrder) {
@@ -303,37 +411,48 @@ TEST_F(ButtonTracking, AnIconButtonReportsAReleaseOutside) {
     EXPECT_EQ(ResultOfClick("press 30 20\nwait 0.2\nmove 90 90\nwait 0.1\nrelease"), -1);
 }
 
-namespace {
-
-bool SameColor(RGBColor const &a, RGBColor const &b) {
-    return a.red == b.red && a.green == b.green && a.blue == b.blue;
+TEST_F(ButtonTracking, AnIconButtonReportsNoReleaseOutsideWhenNotAsked) {
+    pane->onClick = [] {
+        return TrackIconButton(false, &kButton, kFamily, 0, 3, 2, IconButtonTransitionProc) ? 1 : -1;
+    };
+    EXPECT_EQ(ResultOfClick("press 30 20\nwait 0.2\nmove 90 90\nwait 0.1\nrelease"), 1);
 }
 
-RGBColor const kReddish = {0xC000, 0x1000, 0x2000};
-RGBColor const kBlack = {0, 0, 0};
-RGBColor seenForeColor;
+TEST_F(ButtonTracking, ASpecialIconButtonReportsAReleaseOutside) {
+    IconTrackingRec rec = {kButton.top, kButton.left, kFamily, 0, 3, 2};
+    pane->onClick = [&] {
+        return TrackSpecialIconButton(true, &kButton, &rec, IconButtonTransitionProc) ? 1 : -1;
+    };
+    EXPECT_EQ(ResultOfClick("press 30 20\nwait 0.2\nmove 90 90\nwait 0.1\nrelease"), -1);
+}
 
-void NoteForeColor(void *, enum TransitionTo) { VelaDrawing::GetForeColor(&seenForeColor); }
+namespace {
+
+SaveColorRec const kTinted = {{0xC000, 0x1000, 0x2000}, {0x3000, 0xD000, 0x4000}};
+SaveColorRec const kBlackOnWhite = {{0, 0, 0}, {0xFFFF, 0xFFFF, 0xFFFF}};
+SaveColorRec seenColors;
+
+void NoteColors(void *, enum TransitionTo) { GetColors(&seenColors); }
 
 } // namespace
 
-TEST_F(ButtonTracking, IconButtonsDrawInBlackAndGiveTheColoursBack) {
+TEST_F(ButtonTracking, IconButtonsDrawBlackOnWhiteAndGiveTheColoursBack) {
     for (bool special : {false, true}) {
-        RGBColor after = kBlack;
-        seenForeColor = kReddish;
+        SaveColorRec after = kBlackOnWhite;
+        seenColors = kTinted;
         pane->onClick = [&] {
             IconTrackingRec rec = {kButton.top, kButton.left, kFamily, 0, 3, 2};
-            VelaDrawing::RGBForeColor(kReddish);
+            SetColors(&kTinted);
             if (special)
-                TrackSpecialIconButton(true, &kButton, &rec, NoteForeColor);
+                TrackSpecialIconButton(true, &kButton, &rec, NoteColors);
             else
-                TrackIconButton(true, &kButton, kFamily, 0, 3, 2, NoteForeColor);
-            VelaDrawing::GetForeColor(&after);
+                TrackIconButton(true, &kButton, kFamily, 0, 3, 2, NoteColors);
+            GetColors(&after);
             return -1;
         };
         desktop.Play("click 30 20");
-        EXPECT_TRUE(SameColor(seenForeColor, kBlack)) << "special: " << special;
-        EXPECT_TRUE(SameColor(after, kReddish)) << "special: " << special;
+        EXPECT_EQ(seenColors, kBlackOnWhite) << "special: " << special;
+        EXPECT_EQ(after, kTinted) << "special: " << special;
     }
 }
 
@@ -342,9 +461,11 @@ TEST_F(ButtonTracking, ASpecialIconButtonHasItsRectangleRedrawnAtTheEnd) {
     int redraws = 0;
     pane->onClick = [&] {
         pane->onDraw = [&] { ++redraws; };
-        bool const inside = TrackSpecialIconButton(true, &kButton, &rec, IconButtonTransitionProc);
+        // Nothing is drawn on the way, so that the damage alone is presented.
+        bool const inside = TrackSpecialIconButton(true, &kButton, &rec, NoteColors);
         EXPECT_EQ(redraws, 0);
-        UpdateGlog(glog);
+        desktop.TakePresented(glog);
+        EXPECT_EQ(Repainted(), std::vector<Rect>{kButton});
         return inside ? 1 : -1;
     };
     EXPECT_EQ(ResultOfClick("click 30 20"), 1);

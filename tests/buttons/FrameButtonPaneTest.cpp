@@ -1,8 +1,10 @@
 #include "buttons/FrameButtonPane.h"
+#include "host/CompoundPane.h"
 #include "host/EnumToStringMap.h"
 #include "host/Icons.h"
 #include "host/VelaDrawing.h"
 #include "tests/PaneTest.h"
+#include "tests/VirtualPlace.h"
 
 namespace {
 
@@ -55,11 +57,6 @@ public:
 };
 
 } // namespace
-
-TEST_F(FrameButton, ItsRecordHasEighteenBytes) {
-    EXPECT_EQ(sizeof(gfbResRec), 18u);
-    EXPECT_EQ(offsetof(gfbResRec, hiliteWhenDown), 16u);
-}
 
 TEST_F(FrameButton, ItsBoxIsTheFaceAndTheDownOffsetFromTheOrigin) {
     EXPECT_EQ(BoxOf(*New(kNoteFamily)), (Rect{40, 30, 40 + 3 + 16, 30 + 3 + 24}));
@@ -163,6 +160,46 @@ TEST_F(FrameButton, ASubclassDrawsItsFaceAtTheGutsOriginUnderTheIcon) {
     EXPECT_EQ(Only("Draw1Icon", DrawingOf(*button)),
               Traced(*button, [] { Draw1Icon(kTransportFamily, 2, 38, 41); }));
     EXPECT_EQ(button->faces, (std::vector<Point>{{41, 38}}));
+}
+
+TEST_F(FrameButton, TheFaceIsAnOperationBehindThoseOfTheBase) {
+    // The base's HandleClick, which answers for the pane, takes a place here as well.
+    ExpectInOrder(kAfterDestructor, &GlogButtonPane::Depress, &GlogButtonPane::Release,
+                  &GlogButtonPane::GetButtonText, &Opened<FrameButtonPane>::HandleClick,
+                  &FrameButtonPane::DoDrawButtonFace);
+    EXPECT_EQ(PlaceOf(&FrameButtonPane::Depress), PlaceOf(&GlogButtonPane::Depress));
+    EXPECT_EQ(PlaceOf(&FrameButtonPane::Release), PlaceOf(&GlogButtonPane::Release));
+}
+
+TEST_F(FrameButton, IsDrawnAtItsPlaceInALayoutWhereverItsBoxIs) {
+    // Leaves its box where it was.
+    class Unsettled : public FrameButtonPane {
+    public:
+        Unsettled(glogRec *owner, short family) {
+            gfbResRec record = RecordOf(family);
+            InitFrameButtonPane(owner, &record);
+        }
+        void UpdateLayoutRect() override {}
+    };
+    for (short family : {kNoteFamily, kTransportFamily}) {
+        Unsettled *const button = new Unsettled(glog, family);
+        CompoundPane *const column = new CompoundPane;
+        column->CompoundPaneInit(glog, 1);
+        Rect box = {0, 0, 200, 300};
+        column->SetBox(&box);
+        column->SetUseLayout(true);
+        column->Add(button, 0);
+        ASSERT_EQ(button->GetLayoutRect()->GetBorderRect(), (Rect{0, 0, 19, 27}));
+        ASSERT_EQ(BoxOf(*button), (Rect{40, 30, 59, 57}));
+        EXPECT_EQ(Only("Draw1Icon", DrawingOf<FrameButtonPane>(*button)), Traced(*button, [family] {
+                      if (family == kNoteFamily)
+                          Draw1Icon(kFaceFamily, 69, 0, 0);
+                      else
+                          Draw1Icon(family, 2, 8, 1);
+                      Draw1Icon(family, 2, 8, 1);
+                  }));
+        delete column;
+    }
 }
 
 TEST_F(FrameButton, ASubclassHasNoFaceToDrawWithTheStockFace) {

@@ -4,6 +4,7 @@
 #include "host/Services.h"
 #include "host/TarnError.h"
 #include "tests/PaneTest.h"
+#include "tests/VirtualPlace.h"
 #include <type_traits>
 
 namespace {
@@ -116,6 +117,11 @@ TEST_F(ButtonPane, IsAProviderFirstAndAPaneSecond) {
     EXPECT_EQ(static_cast<void *>(static_cast<Provider<GlogButtonPaneListener> *>(whole)),
               static_cast<void *>(whole));
     EXPECT_GT(reinterpret_cast<char *>(static_cast<GlogPane *>(whole)), reinterpret_cast<char *>(whole));
+}
+
+TEST_F(ButtonPane, AddsItsOperationsBehindThoseOfTheProvider) {
+    ExpectInOrder(kAfterDestructor, &GlogButtonPane::Depress, &GlogButtonPane::Release,
+                  &GlogButtonPane::GetButtonText);
 }
 
 TEST_F(ButtonPane, CannotBeAttachedToNoGlog) {
@@ -268,8 +274,10 @@ TEST_F(ButtonPane, FlashPressesTheButtonWithTheMouseUp) {
 }
 
 TEST_F(ButtonPane, FlashOfAButtonThatIsNotEnabledIsHandledAndDoesNothing) {
-    button->Disable();
-    EXPECT_EQ(button->Flash(0), -1);
+    for (unsigned char mode : {1, 2, 255}) {
+        button->SetMode(mode);
+        EXPECT_EQ(button->Flash(0), -1) << int(mode);
+    }
     EXPECT_TRUE(button->changes.empty());
     EXPECT_TRUE(listener.sources.empty());
 }
@@ -365,9 +373,11 @@ TEST_F(ButtonPane, TheModeOfTheProcedureVariableIsNarrowed) {
 TEST_F(ButtonPane, BtnFlashPressesAnEnabledButtonOnly) {
     btnFlash(button, 0);
     EXPECT_EQ(listener.sources.size(), 1u);
-    button->Disable();
     button->changes.clear();
-    btnFlash(button, 0);
+    for (unsigned char mode : {1, 2, 255}) {
+        button->SetMode(mode);
+        btnFlash(button, 0);
+    }
     EXPECT_TRUE(button->changes.empty());
     EXPECT_EQ(listener.sources.size(), 1u);
 }
@@ -467,6 +477,30 @@ TEST_F(ButtonPane, AnEnabledButtonInAMovedPlaceIsTrackedThere) {
     EXPECT_EQ(ResultOfClick("press 130 120\nwait 0.3\nmove 159 129\nrelease"), 1);
 }
 
+namespace {
+
+// Answers for its box what it likes, and is nowhere once it is pressed.
+class ElusiveButton : public ProbeButton {
+public:
+    explicit ElusiveButton(glogRec *owner) { InitGlogButtonPane(owner, kEnabled); }
+    void GetBox(Rect *out) override { *out = box; }
+    void Depress() override {
+        ProbeButton::Depress();
+        box = {0, 0, 0, 0};
+    }
+
+private:
+    Rect box = {100, 100, 120, 120};
+};
+
+} // namespace
+
+TEST_F(ButtonPane, TakesItsPlaceFromGetBoxOnceBeforeThePress) {
+    ElusiveButton *const elusive = new ElusiveButton(glog);
+    EXPECT_EQ(ResultOfClick("press 110 110\nwait 0.3\nmove 119 119\nmove 100 100\nrelease"), 1);
+    EXPECT_EQ(elusive->changes, (Changes{"depress", "release"}));
+}
+
 TEST_F(ButtonPane, FollowsTheMouseInItsOwnCoordinatesWhateverPortItIsLeftWith) {
     CompoundPane *const box = new CompoundPane;
     box->CompoundPaneInit(glog, 1);
@@ -531,13 +565,50 @@ TEST(ButtonPaneWithKeys, FlashWithAKeyThatIsDownLastsUntilTheKeyIsUp) {
     }
 }
 
+TEST(ButtonPaneWithKeys, BtnFlashWithAKeyThatIsDownLastsUntilTheKeyIsUp) {
+    HeldKeyDesktop desktop('x', 1.5);
+    ProbeButton *const button = ProbeButton::New(desktop.NewGlog(GlogOptions().Size(100, 100)));
+    desktop.Script("wait 1\nmove 5 5\nwait 0.5\nmove 6 6\nwait 9");
+    btnFlash(button, 'x');
+    EXPECT_DOUBLE_EQ(TarnSystemTime::GetCurrentEventTime(), 1.5);
+    EXPECT_EQ(button->changes, (Changes{"depress", "release"}));
+}
+
+namespace {
+
+// A pane that has a button pressed by a key while the mouse is held down on the pane.
+class KeyPresser : public GlogPane {
+public:
+    KeyPresser(glogRec *owner, ProbeButton &pressed)
+        : button(pressed) {
+        GlogPaneInit(owner, 0);
+        Rect box = {50, 50, 70, 70};
+        SetBox(&box);
+    }
+    std::vector<bool> results;
+
+protected:
+    int HandleClick(EventRecordAdapter *) override {
+        results.push_back(button.Track('x'));
+        return -1;
+    }
+    void DrawGuts(OSRgn *) override {}
+
+private:
+    ProbeButton &button;
+};
+
+} // namespace
+
 TEST(ButtonPaneWithKeys, TheMouseDoesNotCountWhileAKeyPresses) {
     HeldKeyDesktop desktop('x', 0.5);
     glogRec *const glog = desktop.NewGlog(GlogOptions().Size(100, 100));
     ProbeButton *const button = ProbeButton::New(glog);
+    KeyPresser *const presser = new KeyPresser(glog, *button);
     desktop.FinishGlog(glog);
     ShowGlog(glog, kShowGlog);
-    desktop.Script("wait 0.5\npress 90 90\nmove 95 95\nrelease");
-    EXPECT_EQ(button->Flash('x'), 1);
+    desktop.Script("press 60 60\nwait 0.3\nmove 90 90\nwait 0.3\nmove 95 95\nwait 0.1\nrelease");
+    desktop.Run();
+    EXPECT_EQ(presser->results, std::vector<bool>{true});
     EXPECT_EQ(button->changes, (Changes{"depress", "release"}));
 }

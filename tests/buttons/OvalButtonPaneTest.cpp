@@ -33,14 +33,16 @@ protected:
     }
     // The calls of a button at (20, 10) of that width.
     Lines Expected(OvalButtonPane &button, short width, bool down, RGBColor const &color) {
-        Rect const box = {10, 20, 29, static_cast<short>(20 + width)};
+        return Expected(button, Rect{10, 20, 29, static_cast<short>(20 + width)}, down, color);
+    }
+    Lines Expected(OvalButtonPane &button, Rect const &box, bool down, RGBColor const &color) {
         short const base = down ? 3 : 0;
         short const drop = down ? 1 : 0;
-        int const pieces = width / 16 - 1;
+        int const pieces = (box.right - box.left) / 16 - 1;
         return Traced(button, [&] {
             ClearColors();
             Draw1Icon(kFaceFamily, base, box.left, box.top);
-            if (pieces > 0) {
+            {
                 Rect const middle = {box.top, static_cast<short>(box.left + 16), box.bottom,
                                      static_cast<short>(box.right - 16)};
                 WithClipRect const clip(middle);
@@ -60,11 +62,6 @@ protected:
 };
 
 } // namespace
-
-TEST_F(OvalButton, ItsRecordHasTwelveBytes) {
-    EXPECT_EQ(sizeof(gobResRec), 12u);
-    EXPECT_EQ(offsetof(gobResRec, mode), 10u);
-}
 
 TEST_F(OvalButton, IsNineteenPixelsHighAndAsWideAsItsRecordSays) {
     EXPECT_EQ(BoxOf(*New(10, 20, 80)), (Rect{10, 20, 29, 100}));
@@ -94,7 +91,7 @@ TEST_F(OvalButton, KeepsTheLowByteOfTheRecordsMode) {
 }
 
 TEST_F(OvalButton, IsDrawnWithTwoCapsAndWholeMiddlePiecesAtAnyWidth) {
-    for (short width : {16, 20, 31, 32, 33, 47, 48, 50, 64, 80, 95, 200}) {
+    for (short width : {-50, -16, -10, 0, 15, 16, 20, 31, 32, 33, 47, 48, 50, 64, 80, 95, 200}) {
         OvalButtonPane *const button = New(10, 20, width);
         EXPECT_EQ(DrawingOf(*button), Expected(*button, width, false, kDialogButtonActiveTextColor)) << width;
         delete button;
@@ -115,6 +112,42 @@ TEST_F(OvalButton, IsDrawnWithThePressedFaceAndItsTextOnePixelLowerWhileDown) {
     EXPECT_EQ(DrawingOf(*button), Expected(*button, 80, true, kDialogButtonActiveTextColor));
 }
 
+TEST_F(OvalButton, IsDrawnPressedAtAnyWidth) {
+    for (short width : {-10, 16, 31, 33, 64, 95}) {
+        OvalButtonPane *const button = New(10, 20, width);
+        button->Depress();
+        EXPECT_EQ(DrawingOf(*button), Expected(*button, width, true, kDialogButtonActiveTextColor)) << width;
+        delete button;
+    }
+}
+
+TEST_F(OvalButton, AClipSurroundsTheMiddleEvenWhenItIsEmpty) {
+    OvalButtonPane *const button = New(10, 20, -10);
+    Lines const clips = Only("WithClipRect", DrawingOf(*button));
+    EXPECT_EQ(clips, Traced(*button, [] { WithClipRect const clip(Rect{10, 36, 29, -6}); }));
+    EXPECT_EQ(clips.size(), 1u);
+}
+
+TEST_F(OvalButton, IsDrawnAtItsPlaceInALayoutWhereverItsBoxIs) {
+    // Leaves its box where it was.
+    class Unsettled : public OvalButtonPane {
+    public:
+        explicit Unsettled(glogRec *owner) { InitOvalButtonPane(owner, Point{10, 20}, 80, 1, 0); }
+        void UpdateLayoutRect() override {}
+    };
+    Unsettled *const button = new Unsettled(glog);
+    CompoundPane *const column = new CompoundPane;
+    column->CompoundPaneInit(glog, 1);
+    Rect box = {0, 0, 200, 300};
+    column->SetBox(&box);
+    column->SetUseLayout(true);
+    column->Add(button, 0);
+    ASSERT_EQ(button->GetLayoutRect()->GetBorderRect(), (Rect{0, 0, 19, 80}));
+    ASSERT_EQ(BoxOf(*button), (Rect{10, 20, 29, 100}));
+    EXPECT_EQ(DrawingOf<OvalButtonPane>(*button),
+              Expected(*button, Rect{0, 0, 19, 80}, false, kDialogButtonActiveTextColor));
+}
+
 TEST_F(OvalButton, IsDrawnWithInactiveTextWhenDisabled) {
     OvalButtonPane *const button = New(10, 20, 80, 1);
     EXPECT_EQ(DrawingOf(*button), Expected(*button, 80, false, kDialogButtonInactiveTextColor));
@@ -125,17 +158,7 @@ TEST_F(OvalButton, OtherModesLookEnabled) {
     EXPECT_EQ(DrawingOf(*button), Expected(*button, 80, false, kDialogButtonActiveTextColor));
 }
 
-TEST_F(OvalButton, LeavesTheColoursOfThePortAsTheyWere) {
-    OvalButtonPane *const button = New(10, 20, 80);
-    RGBColor const reddish = {0xC000, 0x1000, 0x2000};
-    button->Prepare();
-    VelaDrawing::RGBForeColor(reddish);
-    (button->*&Opened<OvalButtonPane>::DrawGuts)(nullptr);
-    RGBColor after;
-    VelaDrawing::GetForeColor(&after);
-    EXPECT_EQ(after.red, reddish.red);
-    EXPECT_EQ(after.blue, reddish.blue);
-}
+TEST_F(OvalButton, LeavesTheColoursOfThePortAsTheyWere) { EXPECT_TRUE(KeepsColors(*New(10, 20, 80))); }
 
 TEST_F(OvalButton, AClickShowsThePressedFaceThenTheNormalOne) {
     New(10, 20, 80);

@@ -91,11 +91,11 @@ template <class L> void ExpectAtTheStart() {
 template <class... Ls> void ExpectAllAtTheStart() { (ExpectAtTheStart<Ls>(), ...); }
 
 TEST(Listeners, BeginWithTheirDependent) {
-    ExpectAllAtTheStart<
-        AutoSetActivityListener, BoxSelectPaneListener, ButtonGroupPaneListener, ButtonGroupPane_Listener,
-        DurationNotePane_Listener, GListPane_SelectionListener, GlogButtonPaneListener, PictPane_Listener,
-        PopUpMenuListener, ScrollBarPane_Listener, SearchFieldPane_Listener, SearchTextPane_Listener,
-        TabPane_Listener, TextEditPane_Listener, TextPaneListener, TrackSelectorButtonPane_Listener>();
+    ExpectAllAtTheStart<AutoSetActivityListener, BoxSelectPaneListener, ButtonGroupPaneListener,
+                        ButtonGroupPane_Listener, DurationNotePane_Listener, GListPane_SelectionListener,
+                        GlogButtonPaneListener, PictPane_Listener, PopUpMenuListener, ScrollBarPane_Listener,
+                        SearchFieldPane_Listener, SearchTextPane_Listener, TabPane_Listener,
+                        TextEditPane_Listener, TextPaneListener, TrackSelectorButtonPane_Listener>();
 }
 
 TEST(Listeners, OfAButtonGroupHearWhichButtonChanged) {
