@@ -1,4 +1,7 @@
 #include "text/LabelPane.h"
+#include "desktop/drawing/DrawingPort.h"
+#include "desktop/panes/PaneAccess.h"
+#include "desktop/type/FontFamilies.h"
 #include "host/CompoundPane.h"
 #include "host/NamedColors.h"
 #include "host/OSRgn.h"
@@ -7,6 +10,7 @@
 #include "host/TextLayout.h"
 #include "host/VelaDrawing.h"
 #include "tests/PaneTest.h"
+#include "tests/VirtualPlace.h"
 #include <type_traits>
 
 namespace {
@@ -29,6 +33,7 @@ public:
     using LabelPane::GetTextOrigin;
     using LabelPane::HandleClick;
     using LabelPane::SetFont;
+    using LabelPane::SetPortStyle;
     using LabelPane::SetTextOrigin;
 
     void Inval() override {
@@ -51,11 +56,42 @@ public:
         ForceStringWidth(kPlainWidth);
         LabelPaneImplementationInit(owner, 7, UString("Level", UString::kByteEncoding1));
     }
+    using LabelPaneImplementation::DrawGuts;
     using LabelPaneImplementation::GetTextOrigin;
-
-private:
     void DontMakeConcrete() override {}
 };
+
+// A pane's layout item that writes down what it is told.
+class WatchedItem : public GlogLayoutRectItem {
+public:
+    struct Told {
+        int attribute, value, type;
+        bool emptyText;
+        bool operator==(Told const &b) const {
+            return attribute == b.attribute && value == b.value && type == b.type && emptyText == b.emptyText;
+        }
+    };
+    typedef std::vector<Told> Tolds;
+
+    // Puts a new one in the place of the pane's own.
+    static WatchedItem &PutInto(GlogPane &pane) {
+        WatchedItem *const item = new WatchedItem;
+        PaneAccess::Rep(pane).layoutItem = RCPtr<GlogLayoutRectItem>(item);
+        return *item;
+    }
+    void SetAttribute(Attribute attribute, int value, CoordinateType type, UString const &text) override {
+        told.push_back({attribute, value, type, text.empty()});
+        GlogLayoutRectItem::SetAttribute(attribute, value, type, text);
+    }
+    Tolds told;
+};
+
+std::ostream &operator<<(std::ostream &out, WatchedItem::Told const &told) {
+    return out << "attribute " << told.attribute << " = " << told.value << " of type " << told.type;
+}
+
+// What layout items know natural sizes by.
+int const kNaturalWidth = 3, kNaturalHeight = 4, kInPixels = 1;
 
 class Label : public PaneTest {
 protected:
@@ -93,6 +129,9 @@ protected:
         return {LooseStringWidth(Text(text), 0.0f, 1.0f), info.ascent, info.descent};
     }
 
+    // A family that is not the one of dialog text.
+    static OS::Font::FamilyID OtherFamily() { return FontFamilies::Named("Another"); }
+
     ProbeLabel *label;
 };
 
@@ -104,6 +143,12 @@ TEST_F(Label, TheImplementationAloneCannotBeMade) {
     static_assert(std::is_abstract<LabelPaneImplementation>::value, "only with an empty hook");
     static_assert(!std::is_abstract<LabelPane>::value, "the pane to use");
     static_assert(std::is_base_of<GlogPane, LabelPaneImplementation>::value, "one base");
+}
+
+TEST_F(Label, TheHookThatKeepsTheImplementationFromBeingMadeStandsBehindThoseOfThePane) {
+    std::size_t const kPrivateHooks = 2; // of the pane, behind its drawing
+    std::size_t const drawing = PlaceOf(&Opened<PlainLabel>::DrawGuts);
+    EXPECT_EQ(PlaceOf(&PlainLabel::DontMakeConcrete), drawing + kPrivateHooks + 1);
 }
 
 TEST_F(Label, IsAttachedUnderItsNumberWithItsTextMeasured) {
@@ -234,6 +279,17 @@ TEST_F(Label, HalvesNegativeExtrasDownward) {
     EXPECT_EQ(label->BoxNow(), (Rect{103, 103, 112, 148}));
 }
 
+TEST_F(Label, ExtrasWrapBeforeTheyAreHalved) {
+    label->SetExtraWidth(32767);
+    label->SetExtraHeight(32767);
+    label->CalcBox();
+    EXPECT_EQ(label->BoxNow(), (Rect{-16383, -16383, 14 - 16384, 50 - 16384}));
+    PlainLabel *const plain = new PlainLabel(glog);
+    plain->SetExtraWidth(32767);
+    plain->CalcBox();
+    EXPECT_EQ(BoxOf(*plain).right, 16383 + 50 - 16384);
+}
+
 TEST_F(Label, ExtrasWaitForTheNextMeasuring) {
     Rect const before = label->BoxNow();
     label->SetExtraWidth(5);
@@ -354,9 +410,10 @@ TEST_F(Label, MeasuresTheWidthInThePortOfItsGlog) {
 
 TEST_F(Label, SetTextMeasuresAndRepaintsNothing) {
     label->ForgetForcedStringWidth();
+    Show();
     label->SetText(Text("A longer text"));
     EXPECT_EQ(label->BoxNow().right, Measure(0, "A longer text").width);
-    EXPECT_TRUE(label->invalidated.empty());
+    EXPECT_TRUE(Repainted().empty());
 }
 
 TEST_F(Label, SetTextWithInvalRepaintsTheFormerAndTheNewBox) {
@@ -390,13 +447,14 @@ TEST_F(Label, SetFaceAndSetSizeMeasureAndRepaintNothing) {
     label->ForgetForcedFontInfo();
     label->CalcBox();
     Rect const plain = label->BoxNow();
+    Show();
     label->SetSize(24);
     EXPECT_GT(label->BoxNow().right, plain.right);
     EXPECT_GT(label->BoxNow().bottom, plain.bottom);
     short const right = label->BoxNow().right;
     label->SetFace(1);
     EXPECT_NE(label->BoxNow().right, right);
-    EXPECT_TRUE(label->invalidated.empty());
+    EXPECT_TRUE(Repainted().empty());
 }
 
 TEST_F(Label, SetFontMeasuresOnlyWhenSomethingChanges) {
@@ -416,22 +474,37 @@ TEST_F(Label, SetFontMeasuresOnlyWhenSomethingChanges) {
     EXPECT_EQ(label->BoxNow().right, 31);
 }
 
+TEST_F(Label, AnotherFamilyAloneIsAChangeOfFont) {
+    fontSaveRec font = *GetIndVelaFont(0);
+    label->SetFont(font);
+    fontSaveRec const other = {OtherFamily(), font.face, font.size};
+    ASSERT_NE(other.family.GetOrderedFontID(), font.family.GetOrderedFontID());
+    label->ForceStringWidth(30);
+    label->SetFont(other);
+    EXPECT_EQ(label->BoxNow().right, 30);
+}
+
 TEST_F(Label, SetFontFSRIDTakesTheFontOfTheTable) {
     label->ForgetForcedStringWidth();
     label->ForgetForcedFontInfo();
+    Show();
     label->SetFontFSRID(9);
+    EXPECT_TRUE(Repainted().empty());
     EXPECT_EQ(label->GetFontFSRID(), 9);
     Measures const font = Measure(9, "Level");
     EXPECT_EQ(label->BoxNow(),
               (Rect{0, 0, static_cast<short>(font.ascent + font.descent), static_cast<short>(font.width)}));
-    EXPECT_TRUE(label->invalidated.empty());
 }
 
 TEST_F(Label, SettersOfAnchorAndOptionsRepaintNothing) {
-    label->SetOrigin({5, 5});
+    Show();
+    label->SetOrigin({25, 65});
     label->SetHOption(1);
     label->SetVOption(2);
-    EXPECT_TRUE(label->invalidated.empty());
+    EXPECT_FALSE(label->BoxNow() == (Rect{0, 0, 14, 50}));
+    EXPECT_TRUE(Repainted().empty());
+    label->Inval(); // so that the absence of damage means something
+    EXPECT_EQ(Repainted(), std::vector<Rect>{label->BoxNow()});
 }
 
 TEST_F(Label, SettersOfAnchorAndOptionsMoveTheBoxAtOnce) {
@@ -552,20 +625,54 @@ TEST_F(Label, SetsThePortsFontOnlyWhereItDiffers) {
     EXPECT_TRUE(Only("TextSize", lines).empty());
 }
 
-TEST_F(Label, LeavesFontAndColoursOfThePortAsTheyWere) {
-    RGBColor const reddish = {0xC000, 0x1000, 0x2000};
-    label->SetFontFSRID(9);
+TEST_F(Label, SetsThatPartOfThePortsFontAloneThatDiffers) {
+    fontSaveRec const own = {OtherFamily(), 1, 17};
+    label->SetFont(own);
+    struct Case {
+        char const *call;
+        fontSaveRec port;
+    } const cases[] = {{"TextFont", {OS::Font::FamilyID(), own.face, own.size}},
+                       {"TextFace", {own.family, 0, own.size}},
+                       {"TextSize", {own.family, own.face, 18}}};
+    for (Case const &c : cases) {
+        label->Prepare();
+        SetFontData(&c.port);
+        desktop.TakeDrawing();
+        label->SetPortStyle();
+        Lines const lines = desktop.TakeDrawing();
+        EXPECT_EQ(lines.size(), 1u) << c.call;
+        EXPECT_EQ(Only(c.call, lines).size(), 1u) << c.call;
+    }
+}
+
+TEST_F(Label, ComparesTheLowSixteenBitsOfThePortsFace) {
+    label->SetFont({OS::Font::FamilyID(), 1, 17});
     label->Prepare();
-    SetFontData(GetIndVelaFont(0));
-    VelaDrawing::RGBForeColor(reddish);
-    label->DrawGuts(nullptr);
+    label->SetPortStyle();
+    desktop.TakeDrawing();
+    GraphicsState &state = DrawingPort::CurrentPort()->State();
+    state.textFace = 0x30001;
+    label->SetPortStyle();
+    EXPECT_TRUE(desktop.TakeDrawing().empty());
+    state.textFace = 0x10000;
+    label->SetPortStyle();
+    EXPECT_EQ(Only("TextFace", desktop.TakeDrawing()).size(), 1u);
+}
+
+TEST_F(Label, LeavesFontAndColoursOfThePortAsTheyWere) {
+    fontSaveRec const former = {OS::Font::FamilyID(), 0, 18};
+    RGBColor const greenish = {0x1000, 0xE000, 0x2000}, bluish = {0x1000, 0x2000, 0xE000};
+    label->SetFont({OtherFamily(), 1, 17});
+    label->SetPaneForegroundColor(&greenish);
+    label->SetPaneBackgroundColor(&bluish);
+    label->Prepare();
+    SetFontData(&former);
+    EXPECT_TRUE(KeepsColors(*label));
     OSPort *port = nullptr;
     VelaDrawing::GetPort(&port);
-    EXPECT_EQ(VelaDrawing::GetPortTextSize(port), GetIndVelaFont(0)->size);
-    RGBColor after;
-    VelaDrawing::GetForeColor(&after);
-    EXPECT_EQ(after.red, reddish.red);
-    EXPECT_EQ(after.blue, reddish.blue);
+    EXPECT_EQ(VelaDrawing::GetPortTextFont(port).GetOrderedFontID(), former.family.GetOrderedFontID());
+    EXPECT_EQ(VelaDrawing::GetPortTextFace(port), former.face);
+    EXPECT_EQ(VelaDrawing::GetPortTextSize(port), former.size);
 }
 
 TEST_F(Label, IsNotDrawnWhileHidden) {
@@ -639,12 +746,13 @@ TEST_F(LabelInLayout, MeasuringChangesNeitherBoxNorTextOrigin) {
 }
 
 TEST_F(LabelInLayout, DrawsItsTextCentredInTheItem) {
+    // 40 pixels of room and a line of 14: baseline at 40 / 2 + 10 / 2.
+    Item().SetAttribute(GlogLayoutItem::kHeight, 40, GlogLayoutItem::kPixels, UString());
+    Item().SetAttribute(GlogLayoutItem::kInsetTop, 7, GlogLayoutItem::kPixels, UString());
+    Item().SetAttribute(GlogLayoutItem::kInsetLeft, 6, GlogLayoutItem::kPixels, UString());
     Show();
-    Rect const item = Item().GetItemRect();
-    ASSERT_GT(item.bottom - item.top, 0);
-    int const height = item.bottom - item.top;
-    int const drop = height > 14 ? 10 / 2 + height / 2 : 10;
-    EXPECT_EQ(Drawn(), Expected({static_cast<short>(item.top + drop), item.left}, kDialogActiveTextColor));
+    ASSERT_EQ(Item().GetItemRect(), (Rect{7, 6, 47, 56}));
+    EXPECT_EQ(Drawn(), Expected({7 + 25, 6}, kDialogActiveTextColor));
 }
 
 TEST_F(LabelInLayout, DrawsALineHigherThanTheItemFromTheItemsTop) {
@@ -669,6 +777,84 @@ TEST_F(LabelInLayout, DrawsALineInAHigherItemCentred) {
     Rect const item = Item().GetItemRect();
     ASSERT_EQ(item.bottom - item.top, 31);
     EXPECT_EQ(Drawn(), Expected({static_cast<short>(item.top + 5 + 15), item.left}, kDialogActiveTextColor));
+}
+
+TEST_F(LabelInLayout, ErasesItsBoxUnderTheText) {
+    RGBColor const bluish = {0x1000, 0x2000, 0xC000};
+    label->SetPaneBackgroundColor(&bluish);
+    label->EraseUnderneath(true);
+    label->SetLineSpacing(31);
+    Show();
+    ASSERT_EQ(label->BoxNow(), (Rect{0, 0, 31, 50}));
+    EXPECT_EQ(Drawn(), Traced(*label, [&] {
+                  SetBackgroundColor(bluish);
+                  Rect const box = {0, 0, 31, 50};
+                  VelaDrawing::EraseRect(&box);
+                  SetForegroundColor(kDialogActiveTextColor);
+                  DrawStringAtPoint(Text("Level"), {20, 0}, 50, TextSettings::kTruncateNone);
+              }));
+}
+
+TEST_F(Label, TellsItsLayoutItemANewWidthAndNothingElse) {
+    WatchedItem &item = WatchedItem::PutInto(*label);
+    label->ForceStringWidth(80);
+    label->CalcBox();
+    EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalWidth, 80, kInPixels, true}}));
+}
+
+TEST_F(Label, TellsItsLayoutItemANewHeightAndNothingElse) {
+    WatchedItem &item = WatchedItem::PutInto(*label);
+    label->SetExtraHeight(9);
+    label->CalcBox();
+    EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalHeight, 23, kInPixels, true}}));
+}
+
+TEST_F(Label, TellsItsLayoutItemNothingWhenItOnlyMoves) {
+    WatchedItem &item = WatchedItem::PutInto(*label);
+    label->SetOrigin({20, 30});
+    label->SetHOption(1);
+    label->SetText(Text("Gain"));
+    EXPECT_TRUE(item.told.empty());
+}
+
+TEST_F(Label, TellsItsLayoutItemTheWidthFirst) {
+    WatchedItem &item = WatchedItem::PutInto(*label);
+    label->ForceStringWidth(80);
+    label->SetExtraHeight(9);
+    label->CalcBox();
+    EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalWidth, 80, kInPixels, true},
+                                             {kNaturalHeight, 23, kInPixels, true}}));
+}
+
+TEST_F(Label, TellsItsLayoutItemNoHeightBesidesALineSpacing) {
+    WatchedItem &item = WatchedItem::PutInto(*label);
+    label->SetLineSpacing(20);
+    label->SetExtraHeight(9);
+    label->CalcBox();
+    EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalHeight, 20, kInPixels, true}}));
+}
+
+TEST_F(Label, ALineSpacingOfZeroIsToldAndFollowsTheFontFromThenOn) {
+    WatchedItem &item = WatchedItem::PutInto(*label);
+    label->SetLineSpacing(20);
+    label->SetLineSpacing(0);
+    label->SetExtraHeight(9);
+    label->CalcBox();
+    EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalHeight, 20, kInPixels, true},
+                                             {kNaturalHeight, 0, kInPixels, true},
+                                             {kNaturalHeight, 23, kInPixels, true}}));
+}
+
+TEST_F(LabelInLayout, TellsTheItemWhatDiffersFromTheBoxThatTheLayoutGave) {
+    Place({20, 30, 61, 130});
+    WatchedItem &item = WatchedItem::PutInto(*label);
+    label->CalcBox();
+    EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalWidth, 50, kInPixels, true},
+                                             {kNaturalHeight, 14, kInPixels, true}}));
+    Place({20, 30, 34, 80});
+    item.told.clear();
+    label->CalcBox();
+    EXPECT_TRUE(item.told.empty());
 }
 
 TEST_F(LabelInLayout, TellsTheLayoutItsNewWidth) {
@@ -724,12 +910,6 @@ gStringResRec RecordOf(unsigned char alignment, unsigned char font = 0) {
 
 } // namespace
 
-TEST_F(Label, ItsRecordHasTenBytes) {
-    EXPECT_EQ(sizeof(gStringResRec), 10u);
-    EXPECT_EQ(offsetof(gStringResRec, font), 6u);
-    EXPECT_EQ(offsetof(gStringResRec, alignment), 7u);
-}
-
 TEST_F(Label, IsMadeFromARecordUnderNumberZeroWithoutText) {
     gStringResRec record = RecordOf(0);
     LabelPane *const made = LabelPane::NewLabelPane(glog, &record);
@@ -737,6 +917,27 @@ TEST_F(Label, IsMadeFromARecordUnderNumberZeroWithoutText) {
     EXPECT_EQ(made->GetOrigin(), (Point{100, 200}));
     EXPECT_EQ(made->GetFontFSRID(), 0);
     EXPECT_EQ(BoxOf(*made).right, BoxOf(*made).left);
+}
+
+TEST_F(Label, ARecordWithTheFontThatItHasAlreadyLeavesTheBoxUntilTheTextComes) {
+    // The label starts in the plain dialog font of this size; a record that changes nothing measures nothing.
+    fontSaveRec const start = {OS::Font::FamilyID(), 0, 12};
+    int same = -1;
+    for (int index = 0; index <= 9 && same < 0; ++index) {
+        fontSaveRec const &font = *GetIndVelaFont(index);
+        if (font.family.GetOrderedFontID() == start.family.GetOrderedFontID() && font.face == start.face &&
+            font.size == start.size)
+            same = index;
+    }
+    ASSERT_GE(same, 0) << "no such font in the table";
+    gStringResRec record = RecordOf(0, static_cast<unsigned char>(same));
+    LabelPane *const made = LabelPane::NewLabelPane(glog, &record);
+    Measures const font = Measure(same, "Gain");
+    EXPECT_EQ(BoxOf(*made), (Rect{0, 0, static_cast<short>(font.ascent + font.descent), 0}));
+    made->SetText(Text("Gain"));
+    EXPECT_EQ(BoxOf(*made),
+              (Rect{static_cast<short>(100 - font.ascent), 200, static_cast<short>(100 + font.descent),
+                    static_cast<short>(200 + font.width)}));
 }
 
 TEST_F(Label, IsNotMadeFromARecordWithoutAGlog) {
