@@ -241,6 +241,9 @@ protected:
     void UseLayoutSubItemMode();
     // Appends the item of a part.
     void AddLayoutSubItem(RCPtr<GlogLayoutRectItem>);
+    // The pane has moved its parts together with its box: their items move by the same, right and down when
+    // positive, so that a later layout finds them where they lie in the box.
+    void OffsetLayoutSubItems(Point delta);
 
     // Null while the pane is in no glog; in no container.
     glogRec *glog;
