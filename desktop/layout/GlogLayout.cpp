@@ -137,17 +137,18 @@ void GlogLayoutGroup::MoveItem(RCPtr<GlogLayoutItem> const &item, int index) {
 }
 
 void GlogLayoutGroup::ReplaceItem(RCPtr<GlogLayoutItem> const &old, RCPtr<GlogLayoutItem> const &item) {
-    auto &children = LayoutEngine::Rep(*this).children;
-    for (std::size_t i = 0; i < children.size(); ++i) {
-        if (children[i].get() != old.get())
-            continue;
-        RCPtr<GlogLayoutItem> replaced = children[i]; // the parameter may be the very entry
-        RCPtr<GlogLayoutItem> added = item;
-        LayoutEngine::TakeOut(*replaced);
-        if (added.get())
-            LayoutEngine::Append(*this, added, static_cast<int>(i));
+    RCPtr<GlogLayoutItem> const replaced = old, added = item; // the parameters may be the very entries
+    if (!replaced.get() || LayoutEngine::Rep(*replaced).parent != this || added.get() == replaced.get())
         return;
-    }
+    if (added.get())
+        LayoutEngine::TakeOut(*added);
+    auto const &children = LayoutEngine::Rep(*this).children;
+    std::size_t index = 0;
+    while (children[index].get() != replaced.get())
+        ++index;
+    LayoutEngine::TakeOut(*replaced);
+    if (added.get())
+        LayoutEngine::Append(*this, added, static_cast<int>(index));
 }
 
 RCPtr<GlogLayoutItem> GlogLayoutGroup::FindItemByID(int id) {

@@ -1,6 +1,7 @@
 #include "desktop/layout/LayoutEngine.h"
 #include <algorithm>
 #include "desktop/panes/Glog.h"
+#include "desktop/panes/HostCall.h"
 #include "desktop/panes/PaneAccess.h"
 #include "host/CompoundPane.h"
 
@@ -44,6 +45,9 @@ RCPtr<GlogLayoutGroup> LayoutEngine::MakeForContainer(CompoundPane *owner) {
 }
 
 void LayoutEngine::Append(GlogLayoutGroup &group, RCPtr<GlogLayoutItem> const &item, int index) {
+    for (GlogLayoutItem *outer = &group; outer; outer = Rep(*outer).parent)
+        if (outer == item.get())
+            return; // a group cannot lie in itself
     TakeOut(*item);
     auto &children = Rep(group).children;
     auto position = index < 0 || index > static_cast<int>(children.size()) ? children.end() : children.begin() + index;
@@ -221,12 +225,17 @@ void LayoutEngine::Settle(glogRec *record) {
     Glog &glog = Glog::From(record);
     if (!glog.layoutInvalid || glog.settlingLayout)
         return;
-    glog.settlingLayout = true;
+    // Also when a pane throws while it is placed, the next change is settled again.
+    struct Settling {
+        explicit Settling(Glog &glog_) : glog(glog_) { glog.settlingLayout = true; }
+        ~Settling() { glog.settlingLayout = false; }
+        Glog &glog;
+    } settling(glog);
+    HostCall const call;
     for (int round = 0; round < kMaxRounds && glog.layoutInvalid; ++round) {
         glog.layoutInvalid = false;
         for (std::size_t i = 0; i < glog.Items().size(); ++i)
             SettleInside(*glog.Items()[i]);
     }
     glog.layoutInvalid = false;
-    glog.settlingLayout = false;
 }

@@ -68,8 +68,6 @@ short CompoundPane::Add(GlogPane *pane, short position) {
     if (index < 0)
         return index;
     pane->SetContainer(this);
-    if (GetLayout().get() && pane->GetLayoutRect().get())
-        LayoutEngine::Append(*GetLayout(), pane->GetLayoutRect(), -1); // wherever the pane itself came
     pane->ContainmentChanged();
     pane->PanePositionChanged();
     pane->SetActive();
@@ -78,8 +76,13 @@ short CompoundPane::Add(GlogPane *pane, short position) {
 }
 
 short CompoundPane::AddGuts(GlogPane *pane, short position) {
-    if (!pane || pane == this || NumSubpanes() == 32767)
+    if (!pane || NumSubpanes() == 32767)
         return -1;
+    for (CompoundPane *outer = this; outer; outer = outer->container)
+        if (outer == pane)
+            return -1; // a pane cannot lie in itself
+    if (pane->GetLayoutRect().get())
+        LayoutEngine::TakeOut(*pane->GetLayoutRect());
     if (PaneAccess::Container(*pane))
         PaneAccess::TakeOut(*pane);
     else if (pane->GetGlog())
@@ -91,6 +94,9 @@ short CompoundPane::AddGuts(GlogPane *pane, short position) {
     auto &list = compoundRep->subpanes;
     short const index = position < 0 || position > NumSubpanes() ? NumSubpanes() : position;
     list.insert(list.begin() + index, pane);
+    PaneAccess::JoinLayout(*pane);
+    if (glog)
+        Glog::From(glog).NotePanesAdded();
     return index;
 }
 

@@ -45,6 +45,7 @@ Desktop::Desktop(DesktopOptions const &options, std::unique_ptr<WindowSystem> wi
 }
 
 Desktop::~Desktop() {
+    rep->CloseGlogs(); // while panes can still reach the desktop
     rep.reset();
     ApplicationHooks::Remove();
     MessageTrace::SetSink(nullptr);

@@ -1,11 +1,20 @@
 #include "desktop/panes/DesktopRep.h"
 #include <algorithm>
 #include "desktop/panes/Glog.h"
+#include "desktop/panes/HostCall.h"
+
+namespace {
+// A pane that damages itself whenever it is drawn must not keep the program from waiting.
+int const kMostUpdateRounds = 4;
+}
 
 DesktopRep::DesktopRep(Desktop &desktop, DesktopOptions const &options_, std::unique_ptr<WindowSystem> windows_)
     : options(options_), windows(std::move(windows_)), loop(new EventLoop(desktop, *windows)) {}
 
-DesktopRep::~DesktopRep() {
+DesktopRep::~DesktopRep() {}
+
+void DesktopRep::CloseGlogs() {
+    HostCall const call; // so that what a pane disposes of while it dies waits for its turn here
     while (!glogs.empty()) {
         Glog *const last = glogs.back();
         glogs.pop_back();
@@ -38,7 +47,7 @@ void DesktopRep::Dispose(Glog *glog) {
         return;
     glog->disposed = true;
     glog->Hide();
-    if (!loop->HandlingEvents())
+    if (!HostCall::Running())
         DeleteDisposed();
 }
 
@@ -59,8 +68,15 @@ void DesktopRep::DeleteDisposed() {
 }
 
 void DesktopRep::UpdateAll() {
-    for (std::size_t i = 0; i < glogs.size(); ++i)
-        glogs[i]->Update();
+    // Drawing may damage again, and updating may show, hide or bring glogs to the front.
+    for (int round = 0; round < kMostUpdateRounds; ++round) {
+        std::vector<Glog *> const snapshot = glogs;
+        for (Glog *glog : snapshot)
+            if (std::find(glogs.begin(), glogs.end(), glog) != glogs.end())
+                glog->Update();
+        if (std::none_of(glogs.begin(), glogs.end(), [](Glog *glog) { return glog->NeedsUpdate(); }))
+            return;
+    }
 }
 
 void DesktopRep::DamageAll() {
@@ -69,6 +85,8 @@ void DesktopRep::DamageAll() {
 }
 
 void DesktopRep::Idle() {
-    for (std::size_t i = 0; i < glogs.size(); ++i)
-        glogs[i]->Idle();
+    std::vector<Glog *> const snapshot = glogs;
+    for (Glog *glog : snapshot)
+        if (std::find(glogs.begin(), glogs.end(), glog) != glogs.end())
+            glog->Idle();
 }

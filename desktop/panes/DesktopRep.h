@@ -24,6 +24,7 @@ public:
     void CameToFront(Glog *);
     void Dispose(Glog *);                 // at once, or when no event is being handled any more
     void DeleteDisposed();
+    void CloseGlogs(); // all of them, before the desktop goes
     void UpdateAll();
     void Idle();
     void DamageAll();

@@ -4,12 +4,16 @@
 #include "desktop/drawing/ThemeColors.h"
 #include "desktop/layout/LayoutEngine.h"
 #include "desktop/panes/DesktopRep.h"
+#include "desktop/panes/HostCall.h"
 #include "desktop/panes/PaneAccess.h"
 #include "desktop/panes/PaneEvents.h"
+#include "desktop/panes/PortKeeper.h"
 #include "desktop/resources/Utf.h"
 #include "desktop/windows/HelpTagWindow.h"
 #include "host/CompoundPane.h"
 #include "host/NamedColors.h"
+#include "host/Services.h"
+#include "host/PortSavers.h"
 
 namespace {
 
@@ -40,10 +44,11 @@ EventRecordAdapter RecordOf(InputEvent const &event, unsigned short what) {
     return record;
 }
 
-// The low byte is the character where there is one, else the key; the next sixteen bits are the key's code.
+// The low byte is the ASCII character where there is one, else a named key; the next sixteen bits are the key's code. Other characters
+// leave the byte 0, since their low bytes would pass for keys.
 unsigned long long KeyMessage(InputEvent const &event) {
     std::u16string_view const units = Utf::View(event.text);
-    unsigned long long character = static_cast<unsigned long long>(event.key) & 0xFF;
+    unsigned long long character = event.key < 0x80 ? static_cast<unsigned long long>(event.key) : 0;
     if (units.size() == 1 && units[0] < 0x80)
         character = units[0];
     return character | static_cast<unsigned long long>(event.key) << 8;
@@ -63,6 +68,9 @@ Glog::Glog(Desktop &desktop_, GlogOptions const &options_)
 }
 
 Glog::~Glog() {
+    HostCall const call;
+    if (window)
+        Tell(&TarnOSWindow::OSWindow_PlatformWindowListener::PlatformWindow_Closing);
     current = nullptr;
     while (!items.empty())
         delete items.back();
@@ -72,19 +80,36 @@ Glog::~Glog() {
         loop->WindowGone(window.get());
 }
 
+void Glog::Tell(void (TarnOSWindow::OSWindow_PlatformWindowListener::*what)(TarnOSWindow::OSWindow &)) {
+    typedef TarnOSWindow::OSWindow_PlatformWindowListener Listener;
+    class WindowMsg : public DependentCastMessenger<Listener> {
+    public:
+        WindowMsg(Glog &glog_, void (Listener::*what_)(OSWindow &)) : glog(glog_), what(what_) {}
+        void BroadcastChange(Listener *listener) override { (listener->*what)(glog); }
+
+    private:
+        Glog &glog;
+        void (Listener::*what)(OSWindow &);
+    };
+    if (Provider<Listener>::HasDependents())
+        Provider<Listener>::BroadcastChange(WindowMsg(*this, what), nullptr);
+}
+
 RGBColor Glog::GetContentColor() { return kWindowBackgroundColor; }
 
 // Panes
 
-void Glog::AddItem(GlogPane *pane) { items.push_back(pane); }
+void Glog::AddItem(GlogPane *pane) {
+    items.push_back(pane);
+    NotePanesAdded();
+}
 
 void Glog::RemoveItem(GlogPane *pane) { items.erase(std::remove(items.begin(), items.end(), pane), items.end()); }
 
 void Glog::PaneGone(GlogPane *pane) {
     if (current == pane)
         current = nullptr;
-    if (EventLoop *loop = EventLoop::Open())
-        loop->HelpTags().Hide();
+    HelpTagWindow::HideAny();
 }
 
 bool Glog::DescribedBox(int id, Rect &box) const {
@@ -96,13 +121,16 @@ bool Glog::DescribedBox(int id, Rect &box) const {
 }
 
 void Glog::StartPanes() {
+    HostCall const call;
     started = true;
+    hasNewPanes = false;
     LayoutEngine::Settle(this);
     for (std::size_t i = 0; i < items.size(); ++i)
         PaneAccess::Start(*items[i]);
 }
 
 void Glog::SetCurItem(GlogPane *pane) {
+    HostCall const call;
     GlogPane *const former = current;
     if (former && former != pane && former->IsSelected())
         former->Select(false);
@@ -145,6 +173,7 @@ void Glog::MakeSurface() {
 void Glog::Show() {
     if (shown || disposed)
         return;
+    HostCall const call;
     if (!started)
         StartPanes();
     DesktopRep &rep = DesktopRep::Of(desktop);
@@ -161,6 +190,9 @@ void Glog::Show() {
         window->SetSizeLimits(minWidth, minHeight, maxWidth, maxHeight);
         scale = DeviceScale(window->Scale());
         MakeSurface();
+        Tell(&TarnOSWindow::OSWindow_PlatformWindowListener::PlatformWindow_Opened);
+        if (disposed)
+            return;
     }
     shown = true;
     rep.CameToFront(this);
@@ -171,9 +203,10 @@ void Glog::Show() {
 void Glog::Hide() {
     if (!shown)
         return;
+    HostCall const call;
     shown = false;
     if (EventLoop *loop = EventLoop::Open())
-        loop->HelpTags().OwnerGone(window.get());
+        loop->WindowHidden(window.get());
     window->Hide();
     if (active)
         Activation(false);
@@ -197,6 +230,7 @@ void Glog::Resized(int w, int h) {
     h = std::clamp(h, 1, kMaxSide);
     if (w == width && h == height)
         return;
+    HostCall const call;
     Point const delta{Coordinate16(h - height), Coordinate16(w - width)};
     width = w;
     height = h;
@@ -230,8 +264,11 @@ void Glog::DamageWindowRect(Rect const &r) {
 }
 
 void Glog::Update() {
+    if (started && hasNewPanes)
+        StartPanes();
     if (!shown || !surface || updateRegion)
         return;
+    HostCall const call;
     LayoutEngine::Settle(this);
     std::vector<DeviceRect> shownBoxes = port.TakeTouched();
     OSRgn region = port.TakeDamage();
@@ -246,38 +283,31 @@ void Glog::Update() {
         Present(shownBoxes);
 }
 
+bool Glog::NeedsUpdate() const { return shown && (layoutInvalid || !Region::IsEmpty(port.GetDamage())); }
+
 void Glog::DrawDamage(OSRgn const &region) {
-    // The region is the glog's for the time of the update, also when a pane throws.
+    // The region is the glog's for the time of the update. When a pane throws, what it left undrawn stays damaged.
     struct Updating {
-        Updating(Glog &glog_, OSRgn const &region_) : glog(glog_), current(DrawingPort::CurrentPort()) {
-            glog.updateRegion = &region_;
-        }
+        Updating(Glog &glog_, OSRgn const &region_) : glog(glog_) { glog.updateRegion = &region_; }
         ~Updating() {
+            if (!done)
+                glog.port.DamageWindow(*glog.updateRegion);
             glog.updateRegion = nullptr;
-            DrawingPort::MakeCurrent(current);
         }
         Glog &glog;
-        DrawingPort *current;
+        bool done = false;
     };
-    int const originH = port.OriginH(), originV = port.OriginV();
-    OSRgn const boundary = port.Boundary();
-    ClipState const clip = port.GetClipState();
-    GraphicsState const state = port.State();
-    {
-        Updating updating(*this, region);
-        port.SetOrigin(0, 0);
-        port.SetBoundary(region);
-        port.FillClip(ToRGBA(GetContentColor()));
-        OSRgn local(region);
-        std::vector<GlogPane *> const snapshot = items;
-        for (GlogPane *pane : snapshot)
-            if (std::find(items.begin(), items.end(), pane) != items.end())
-                PaneAccess::Draw(*pane, &local);
-    }
-    port.SetOrigin(originH, originV);
-    port.SetBoundary(boundary);
-    port.SetClipState(clip);
-    port.State() = state;
+    PortKeeper const keeper(port);
+    Updating updating(*this, region);
+    port.SetOrigin(0, 0);
+    port.SetBoundary(region);
+    port.FillClip(ToRGBA(GetContentColor()));
+    OSRgn local(region);
+    std::vector<GlogPane *> const snapshot = items;
+    for (GlogPane *pane : snapshot)
+        if (std::find(items.begin(), items.end(), pane) != items.end())
+            PaneAccess::Draw(*pane, &local);
+    updating.done = true;
 }
 
 void Glog::Present(std::vector<DeviceRect> const &rects) { window->Present(*surface, rects.data(), rects.size()); }
@@ -303,6 +333,7 @@ void Glog::ReportHit(int value) {
 }
 
 void Glog::Click(InputEvent const &event) {
+    HostCall const call;
     EventRecordAdapter record = RecordOf(event, kMouseDownEvent);
     GlogPane *const pane = TopmostAt(record.where);
     if (current && current != pane && current->GetVisibility()) {
@@ -314,7 +345,17 @@ void Glog::Click(InputEvent const &event) {
     // The confirmation can have changed everything.
     if (!pane || std::find(items.begin(), items.end(), pane) == items.end())
         return;
-    hitNoted = false;
+    // A nested loop may handle further clicks in this glog; each has its own hit.
+    struct OwnHit {
+        explicit OwnHit(Glog &glog_) : glog(glog_), item(glog.hitItem), noted(glog.hitNoted) { glog.hitNoted = false; }
+        ~OwnHit() {
+            glog.hitItem = item;
+            glog.hitNoted = noted;
+        }
+        Glog &glog;
+        int item;
+        bool noted;
+    } const ownHit(*this);
     int const value = event.button == 1   ? PaneEvents::Click(*pane, record)
                       : event.button == 2 ? PaneEvents::SecondaryClick(*pane, record)
                                           : 0;
@@ -342,42 +383,58 @@ bool Glog::DispatchKey(EventRecordAdapter &record, InputEvent const &event) {
 }
 
 void Glog::KeyDown(InputEvent const &event) {
+    HostCall const call;
     EventRecordAdapter record = RecordOf(event, event.repeat ? kAutoKeyEvent : kKeyDownEvent);
     record.message = KeyMessage(event);
     DispatchKey(record, event);
 }
 
-void Glog::TabOrder(GlogPane &pane, std::vector<GlogPane *> &order) const {
+void Glog::AddToTabOrder(GlogPane &pane, std::vector<GlogPane *> &order) const {
     if (!PaneAccess::OwnVisibility(pane))
         return;
     order.push_back(&pane);
     if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
         for (short i = 0; i < container->NumSubpanes(); ++i)
-            TabOrder(*container->Get(i), order);
+            AddToTabOrder(*container->Get(i), order);
 }
 
-bool Glog::OfferTab(char direction) {
+std::vector<GlogPane *> Glog::TabOrder(char direction) const {
     std::vector<GlogPane *> order;
     for (GlogPane *pane : items)
-        TabOrder(*pane, order);
+        AddToTabOrder(*pane, order);
     if (direction < 0)
         std::reverse(order.begin(), order.end());
-    std::size_t first = 0;
-    if (current) {
-        if (PaneEvents::Tab(*current, direction) != 1)
+    return order;
+}
+
+// Every Tab may remove panes, the next one on the list among them, so that the list is made anew after each.
+bool Glog::OfferTab(char direction) {
+    std::vector<GlogPane *> order = TabOrder(direction);
+    std::size_t next = 0;
+    auto standAfter = [&](GlogPane *pane) {
+        order = TabOrder(direction);
+        auto const found = std::find(order.begin(), order.end(), pane);
+        if (found != order.end())
+            next = static_cast<std::size_t>(found - order.begin()) + 1;
+    };
+    if (GlogPane *const from = current) {
+        standAfter(from);
+        if (PaneEvents::Tab(*from, direction) != 1)
             return true;
-        auto found = std::find(order.begin(), order.end(), current);
-        first = found == order.end() ? 0 : static_cast<std::size_t>(found - order.begin()) + 1;
+        standAfter(from);
     }
-    for (std::size_t i = 0; i < order.size(); ++i) {
-        GlogPane *const pane = order[(first + i) % order.size()];
+    for (std::size_t offers = order.size(); offers > 0 && !order.empty() && !disposed; --offers) {
+        GlogPane *const pane = order[next % order.size()];
         if (PaneEvents::Tab(*pane, direction) == 0)
             return true;
+        next = next % order.size() + 1;
+        standAfter(pane);
     }
     return false;
 }
 
 void Glog::Wheel(InputEvent const &event) {
+    HostCall const call;
     struct Axis {
         double delta;
         int number;
@@ -392,9 +449,10 @@ void Glog::Wheel(InputEvent const &event) {
 }
 
 void Glog::PointerMoved(Point p) {
+    HostCall const call;
     GlogPane *const pane = TopmostAt(p);
-    if (!pane || !pane->DispatchCursor(p))
-        DesktopRep::Of(desktop).windows->SetCursor(Cursors::kArrow);
+    if (WithCursorDispatchingDisabled::fgCount == 0 && (!pane || !pane->DispatchCursor(p)))
+        CrsrMain(Cursors::kArrow);
     EventLoop::Instance().HelpTags().PointerAt(*this, p);
 }
 
@@ -403,6 +461,7 @@ void Glog::PointerLeft() { EventLoop::Instance().HelpTags().Hide(); }
 void Glog::Activation(bool on) {
     if (on == active)
         return;
+    HostCall const call;
     active = on;
     if (on)
         DesktopRep::Of(desktop).CameToFront(this);
@@ -415,9 +474,12 @@ void Glog::Activation(bool on) {
 void Glog::Idle() {
     if (!active || !shown || idling)
         return; // a pane that waits in its Idle is not called again meanwhile
-    idling = true;
+    struct Idling {
+        explicit Idling(bool &idling_) : idling(idling_) { idling = true; }
+        ~Idling() { idling = false; }
+        bool &idling;
+    } const guard(idling);
+    HostCall const call;
     for (std::size_t i = 0; i < items.size(); ++i)
-        if (PaneAccess::OwnVisibility(*items[i]))
-            items[i]->Idle();
-    idling = false;
+        PaneAccess::Idle(*items[i]);
 }

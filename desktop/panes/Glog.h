@@ -44,6 +44,7 @@ public:
     void DescribeItem(int id, Rect const &box) { described[id] = box; }
     bool DescribedBox(int id, Rect &box) const;
     void StartPanes();
+    void NotePanesAdded() { hasNewPanes = true; } // they are started before the next update
     // A pane of that number answered a click with something; the innermost one comes first and counts.
     void NoteHit(int item);
 
@@ -64,6 +65,7 @@ public:
     void Update();
     void DamageAll();
     void DamageWindowRect(Rect const &);
+    bool NeedsUpdate() const;          // something visible waits to be redrawn
     OSRgn const *UpdateRegion() const { return updateRegion; } // in window coordinates; null outside an update
     void PresentAll();
     void SetScale(DeviceScale);
@@ -90,7 +92,9 @@ private:
     void MakeSurface();
     void ReportHit(int value);
     bool OfferTab(char direction);
-    void TabOrder(GlogPane &, std::vector<GlogPane *> &) const;
+    std::vector<GlogPane *> TabOrder(char direction) const;
+    void AddToTabOrder(GlogPane &, std::vector<GlogPane *> &) const;
+    void Tell(void (TarnOSWindow::OSWindow_PlatformWindowListener::*what)(TarnOSWindow::OSWindow &));
     bool DispatchKey(EventRecordAdapter &, InputEvent const &);
 
     Desktop &desktop;
@@ -112,6 +116,7 @@ private:
     bool active = false;
     bool activatedByMouseDown = false;
     bool idling = false;
+    bool hasNewPanes = false;
     bool placed = false;
     Rect screenPlace{0, 0, 0, 0};
 };

@@ -6,6 +6,7 @@
 #include "desktop/panes/PaneEvents.h"
 #include "desktop/resources/DefaultHelpTagHelper.h"
 #include "desktop/windows/EventLoop.h"
+#include "desktop/windows/HelpTagWindow.h"
 #include "host/CompoundPane.h"
 #include "host/CustomEventHandler.h"
 #include "host/MouseTask.h"
@@ -31,9 +32,9 @@ GlogPane::~GlogPane() {
 // Attachment
 
 GlogPane *GlogPane::GlogPaneInit(glogRec *glog_, short id) {
+    rep->id = id;
     if (!glog_)
         return nullptr;
-    rep->id = id;
     glog = glog_;
     rep->layoutItem = LayoutEngine::MakeForPane(this);
     for (RCPtr<GlogLayoutRectItem> const &part : rep->subItems)
@@ -51,17 +52,13 @@ GlogPane *GlogPane::GlogPaneInit(glogRec *glog_, short id) {
 void GlogPane::SetGlog(glogRec *glog_) {
     if (glog_ == glog)
         return;
-    if (glog) {
+    if (glog)
         Glog::From(glog).RemoveItem(this);
-        Glog::From(glog).PaneGone(this);
-    }
     PaneAccess::Adopt(*this, glog_);
-    if (!glog_)
-        return;
-    if (!rep->layoutItem.get())
-        rep->layoutItem = LayoutEngine::MakeForPane(this);
-    if (!container)
+    if (glog_ && !container)
         Glog::From(glog).AddItem(this);
+    ContainmentChanged();
+    SetActive();
 }
 
 glogRec *GlogPane::GetGlog() { return glog; }
@@ -112,6 +109,10 @@ void GlogPane::SetBox(Rect *box) {
     if (CanUpdateLayoutRect())
         LayoutIsNowInvalid();
     PanePositionChanged();
+    short const dh = static_cast<short>((box->right - box->left) - (old.right - old.left));
+    short const dv = static_cast<short>((box->bottom - box->top) - (old.bottom - old.top));
+    if (dh != 0 || dv != 0)
+        PaneAccess::ResizeSubpanes(*this, {dv, dh});
 }
 
 void GlogPane::Offset(Point delta) {
@@ -164,9 +165,9 @@ void GlogPane::GlogOffset(Point *p) {
 
 void GlogPane::PanePositionChanged() {}
 
-// A growing window takes along the panes at its top level that grow; those in a layout follow the layout.
+// A growing window or container takes along the panes in it that grow; those in a layout follow the layout.
 void GlogPane::Resize(Point delta) {
-    if (container || !rep->layoutItem.get())
+    if (IsInLayout() || !rep->layoutItem.get())
         return;
     GlogLayoutItem::Rep const &item = LayoutEngine::Rep(*rep->layoutItem);
     if (!item.growWidth && !item.growHeight)
@@ -226,6 +227,8 @@ void GlogPane::SetVisibility(unsigned char visible) {
     if (on == rep->visible)
         return;
     rep->visible = on;
+    if (!on)
+        HelpTagWindow::HideAny();
     if (IsInLayout())
         LayoutIsNowInvalid();
 }
@@ -405,6 +408,7 @@ char GlogPane::AdjustCursorAndDisplayHelp(Point) {
 // Help tags
 
 void GlogPane::SetHelpTag(LocalizedStrings::HelpTag const *tag) {
+    HelpTagWindow::HideAny();
     rep->help.reset(tag ? new DefaultHelpTagHelper(tag) : nullptr);
 }
 
@@ -415,7 +419,10 @@ bool GlogPane::GetHelpTagForPoint(Point p, LocalizedStrings::HelpTag const *&tag
 
 HelpTagHelper *GlogPane::GetHelpTagHelper() const { return rep->help.get(); }
 
-void GlogPane::SetHelpTagHelper(AutoPtr<HelpTagHelper> helper) { rep->help.reset(helper.release()); }
+void GlogPane::SetHelpTagHelper(AutoPtr<HelpTagHelper> helper) {
+    HelpTagWindow::HideAny();
+    rep->help.reset(helper.release());
+}
 
 bool GlogPane::UsesNonVLHelpTagSystem() const { return rep->help != nullptr; }
 

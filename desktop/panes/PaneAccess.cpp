@@ -3,6 +3,7 @@
 #include "desktop/drawing/Region.h"
 #include "desktop/layout/LayoutEngine.h"
 #include "desktop/panes/Glog.h"
+#include "desktop/panes/PortKeeper.h"
 
 namespace {
 
@@ -16,31 +17,6 @@ Rect Common(Rect const &a, Rect const &b) {
                  std::min(a.right, b.right)};
     return r.bottom <= r.top || r.right <= r.left ? Rect{0, 0, 0, 0} : r;
 }
-
-// Puts back what a pane's drawing may leave changed, also when it throws.
-class PortKeeper {
-public:
-    explicit PortKeeper(DrawingPort &port_)
-        : port(port_), current(DrawingPort::CurrentPort()), h(port.OriginH()), v(port.OriginV()),
-          boundary(port.Boundary()), clip(port.GetClipState()), state(port.State()) {}
-    ~PortKeeper() {
-        DrawingPort::MakeCurrent(current);
-        port.SetOrigin(h, v);
-        port.SetBoundary(boundary);
-        port.SetClipState(clip);
-        port.State() = state;
-    }
-    PortKeeper(PortKeeper const &) = delete;
-    PortKeeper &operator=(PortKeeper const &) = delete;
-
-private:
-    DrawingPort &port;
-    DrawingPort *current;
-    int h, v;
-    OSRgn boundary;
-    ClipState clip;
-    GraphicsState state;
-};
 
 }
 
@@ -93,16 +69,57 @@ void PaneAccess::PlacedByLayout(GlogPane &pane) {
     pane.Inval();
 }
 
+void PaneAccess::ResizeSubpanes(GlogPane &pane, Point delta) {
+    CompoundPane *const container = dynamic_cast<CompoundPane *>(&pane);
+    if (!container)
+        return;
+    std::vector<GlogPane *> const snapshot = container->compoundRep->subpanes;
+    for (GlogPane *inside : snapshot)
+        if (container->Find(inside) >= 0)
+            inside->Resize(delta);
+}
+
 void PaneAccess::TakeOut(GlogPane &pane) {
     auto &siblings = pane.container->compoundRep->subpanes;
     siblings.erase(std::remove(siblings.begin(), siblings.end(), &pane), siblings.end());
 }
 
 void PaneAccess::Adopt(GlogPane &pane, glogRec *glog) {
+    if (pane.glog && pane.glog != glog)
+        Glog::From(pane.glog).PaneGone(&pane);
     pane.glog = glog;
+    if (glog)
+        EnsureLayoutItems(pane);
     if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
         for (GlogPane *inside : container->compoundRep->subpanes)
             Adopt(*inside, glog);
+}
+
+void PaneAccess::EnsureLayoutItems(GlogPane &pane) {
+    if (!pane.rep->layoutItem.get()) {
+        pane.rep->layoutItem = LayoutEngine::MakeForPane(&pane);
+        LayoutEngine::Rep(*pane.rep->layoutItem).made = pane.rep->box;
+    }
+    CompoundPane *const container = dynamic_cast<CompoundPane *>(&pane);
+    if (container && !container->compoundRep->layout.get())
+        container->compoundRep->layout = LayoutEngine::MakeForContainer(container);
+    JoinLayout(pane);
+}
+
+void PaneAccess::JoinLayout(GlogPane &pane) {
+    if (!pane.container || !pane.container->compoundRep->layout.get() || !pane.rep->layoutItem.get())
+        return;
+    if (!LayoutEngine::Rep(*pane.rep->layoutItem).parent)
+        LayoutEngine::Append(*pane.container->compoundRep->layout, pane.rep->layoutItem, -1);
+}
+
+void PaneAccess::Idle(GlogPane &pane) {
+    if (!pane.rep->visible)
+        return;
+    CompoundPane *const container = dynamic_cast<CompoundPane *>(&pane);
+    for (short i = 0; container && i < container->NumSubpanes(); ++i)
+        Idle(*container->Get(i));
+    pane.Idle(); // last, since it may delete the pane
 }
 
 void PaneAccess::Start(GlogPane &pane) {
@@ -110,6 +127,7 @@ void PaneAccess::Start(GlogPane &pane) {
         pane.rep->started = true;
         pane.PanePositionChanged();
         pane.GlogItemInit();
+        pane.SetActive();
     }
     if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
         for (short i = 0; i < container->NumSubpanes(); ++i)

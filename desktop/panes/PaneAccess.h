@@ -33,14 +33,22 @@ public:
     static void PlacedByLayout(GlogPane &);
     static void MoveTo(GlogPane &, Rect const &box);
 
+    // The pane has grown: tells its subpanes, if it is a container.
+    static void ResizeSubpanes(GlogPane &, Point delta);
+
     // What drawing of the pane may reach, in window coordinates: its rectangles, cut by all its containers.
     static Rect VisiblePart(GlogPane &);
     // Window coordinates of the pane's coordinate origin.
     static Point Origin(GlogPane &);
 
+    // Makes the layout items that the pane still lacks.
+    static void EnsureLayoutItems(GlogPane &);
+    // Puts the pane's item at the end of its container's group, unless it lies in a group already.
+    static void JoinLayout(GlogPane &);
     // Takes the pane out of its container's list; its layout item stays where it is.
     static void TakeOut(GlogPane &);
     // Marks the pane and all its subpanes as belonging to the glog, or to none.
     static void Adopt(GlogPane &, glogRec *);
+    static void Idle(GlogPane &);  // visible panes, subpanes too
     static void Start(GlogPane &); // PanePositionChanged and GlogItemInit, once, subpanes too
 };

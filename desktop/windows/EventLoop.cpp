@@ -3,6 +3,8 @@
 #include "desktop/Desktop.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
+#include "desktop/panes/HostCall.h"
+#include "desktop/panes/PortKeeper.h"
 #include "desktop/windows/HelpTagWindow.h"
 
 namespace {
@@ -15,18 +17,6 @@ double const kActivatingPressWindow = 0.25;
 bool IsRelease(InputEvent const &event) { return event.kind == InputEvent::kMouseUp && event.button == 1; }
 
 bool Drags(InputEvent const &event) { return event.kind == InputEvent::kMouseMove || IsRelease(event); }
-
-// Counts the loops and handlers on the stack, also when they are left by an exception.
-class Nesting {
-public:
-    explicit Nesting(int &depth_) : depth(depth_) { ++depth; }
-    ~Nesting() { --depth; }
-    Nesting(Nesting const &) = delete;
-    Nesting &operator=(Nesting const &) = delete;
-
-private:
-    int &depth;
-};
 
 }
 
@@ -48,15 +38,28 @@ void EventLoop::Quit(int status_) {
 
 double EventLoop::LastEventTime() const { return windows.Now(); }
 
+// What an application does between events. It may prepare other panes, close windows, or end the loop.
+void EventLoop::RunIdleWork() {
+    HostCall const call;
+    PortKeeper const keeper;
+    double const now = windows.Now();
+    chores.Run(now);
+    helpTags->Tick(now);
+    DesktopRep::Of(desktop).Idle();
+    DesktopRep::Of(desktop).UpdateAll();
+}
+
+// Nothing can come that the main loop would have to wait for.
+bool EventLoop::MainLoopIsOver(double deadline) const {
+    return quitting || !DesktopRep::Of(desktop).AnyVisible() || (deadline < 0 && windows.AtEnd());
+}
+
 bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter waiter, char const *what) {
     for (;;) {
-        double const now = windows.Now();
-        chores.Run(now);
-        helpTags->Tick(now);
-        DesktopRep::Of(desktop).Idle();
-        DesktopRep::Of(desktop).UpdateAll();
-        if (waiter == WindowSystem::Waiter::kMainLoop && deadline < 0 && windows.AtEnd())
+        RunIdleWork();
+        if (waiter == WindowSystem::Waiter::kMainLoop && MainLoopIsOver(deadline))
             return false;
+        double const now = windows.Now();
         double limit = deadline < 0 ? -1 : std::max(0.0, deadline - now);
         for (double next : {chores.UntilNext(now), helpTags->UntilNext(now)})
             if (next >= 0 && (limit < 0 || next < limit))
@@ -65,6 +68,9 @@ bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter wa
             return true;
         if (quitting || (deadline >= 0 && windows.Now() >= deadline))
             return false;
+        // A drag ends with its window, which something that ran here may have closed.
+        if (waiter == WindowSystem::Waiter::kTracking && !heldWindow)
+            return false;
     }
 }
 
@@ -72,24 +78,23 @@ bool EventLoop::Run(double seconds) {
     double const deadline = seconds < 0 ? -1 : windows.Now() + seconds;
     while (!quitting) {
         InputEvent event;
+        bool taken = true;
         if (!deferred.empty()) {
             event = deferred.front();
             deferred.pop_front();
-        } else if (!Take(event, deadline, WindowSystem::Waiter::kMainLoop, "the main loop")) {
-            break;
+        } else {
+            taken = Take(event, deadline, WindowSystem::Waiter::kMainLoop, "the main loop");
         }
-        {
-            Nesting nesting(depth);
+        if (taken) {
+            HostCall const call;
             Handle(event);
         }
-        if (depth == 0) {
+        if (!HostCall::Running())
             DesktopRep::Of(desktop).DeleteDisposed();
-            if (!DesktopRep::Of(desktop).AnyVisible())
-                break;
-        }
-        if (deadline >= 0 && deferred.empty() && windows.Now() > deadline)
+        if (!taken || !DesktopRep::Of(desktop).AnyVisible())
             break;
     }
+    RunIdleWork(); // what the last event changed shows
     return !quitting && DesktopRep::Of(desktop).AnyVisible();
 }
 
@@ -194,11 +199,17 @@ void EventLoop::HandlePress(Glog &glog, InputEvent const &event) {
         TakeDeferredDrag();
         windows.CaptureMouse(event.window);
     }
+    // What a pane leaves of the drag, the release before all, is the main loop's, even when the pane throws.
+    struct Rest {
+        ~Rest() {
+            loop.deferred.insert(loop.deferred.begin(), loop.pointer.begin(), loop.pointer.end());
+            loop.pointer.clear();
+            glog.SetActivatedByMouseDown(false);
+        }
+        EventLoop &loop;
+        Glog &glog;
+    } const rest{*this, glog};
     glog.Click(event);
-    glog.SetActivatedByMouseDown(false);
-    // What a pane left of the drag, the release before all, is the main loop's.
-    deferred.insert(deferred.begin(), pointer.begin(), pointer.end());
-    pointer.clear();
 }
 
 void EventLoop::ReleasePointer() {
@@ -208,15 +219,24 @@ void EventLoop::ReleasePointer() {
     windows.CaptureMouse(nullptr);
 }
 
+void EventLoop::WindowHidden(PlatformWindow *window) {
+    if (!window)
+        return;
+    auto isHidden = [=](InputEvent const &event) { return event.window == window; };
+    pointer.erase(std::remove_if(pointer.begin(), pointer.end(), isHidden), pointer.end());
+    if (heldWindow == window)
+        ReleasePointer(); // which ends the drag
+    helpTags->OwnerGone(window);
+}
+
 void EventLoop::WindowGone(PlatformWindow *window) {
+    if (!window)
+        return;
+    WindowHidden(window);
     auto isGone = [=](InputEvent const &event) { return event.window == window; };
     deferred.erase(std::remove_if(deferred.begin(), deferred.end(), isGone), deferred.end());
-    pointer.erase(std::remove_if(pointer.begin(), pointer.end(), isGone), pointer.end());
-    if (heldWindow == window)
-        ReleasePointer();
     if (activatedWindow == window)
         activatedWindow = nullptr;
-    helpTags->OwnerGone(window);
 }
 
 PlatformWindow *EventLoop::WindowOf(DrawingPort &port) const {
@@ -229,6 +249,7 @@ PlatformWindow *EventLoop::WindowOf(DrawingPort &port) const {
 // Nested loops
 
 void EventLoop::Sort(InputEvent const &event) {
+    PortKeeper const keeper;
     if (HandleWindowEvent(event))
         return;
     // What follows the release belongs to the next press, which waits too.
@@ -259,7 +280,7 @@ void EventLoop::TakeDeferredDrag() {
 bool EventLoop::NextDragPoint(double limit, Point &where, double &when, bool &timedOut) {
     timedOut = false;
     double const deadline = limit < 0 ? -1 : windows.Now() + limit;
-    Nesting nesting(depth);
+    HostCall const call;
     while (heldWindow) {
         if (pointer.empty()) {
             InputEvent event;
@@ -267,7 +288,7 @@ bool EventLoop::NextDragPoint(double limit, Point &where, double &when, bool &ti
                 Sort(event);
                 continue;
             }
-            if (quitting)
+            if (quitting || !heldWindow)
                 break;
             timedOut = true;
             where = lastPoint;
@@ -296,25 +317,25 @@ bool EventLoop::NextDragPoint(double limit, Point &where, double &when, bool &ti
 }
 
 bool EventLoop::ButtonStillDown() {
-    if (!heldWindow)
-        return false;
-    Nesting nesting(depth);
+    HostCall const call;
+    auto released = [this] { return std::any_of(pointer.begin(), pointer.end(), IsRelease); };
     InputEvent event;
-    while (Take(event, windows.Now(), WindowSystem::Waiter::kPause, "the state of the mouse button"))
+    while (heldWindow && !released() &&
+           Take(event, windows.Now(), WindowSystem::Waiter::kTracking, "the state of the mouse button"))
         Sort(event);
-    return heldWindow && std::none_of(pointer.begin(), pointer.end(), IsRelease);
+    return heldWindow && !released();
 }
 
 void EventLoop::Pause(double seconds) {
     double const deadline = windows.Now() + std::max(0.0, seconds);
-    Nesting nesting(depth);
+    HostCall const call;
     InputEvent event;
     while (!quitting && Take(event, deadline, WindowSystem::Waiter::kPause, "a pause"))
         Sort(event);
 }
 
 void EventLoop::PauseUntilKeyUp(int key) {
-    Nesting nesting(depth);
+    HostCall const call;
     InputEvent event;
     while (!quitting && windows.IsKeyPressed(key) &&
            Take(event, -1, WindowSystem::Waiter::kTracking, "the release of a key"))

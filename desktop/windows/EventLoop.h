@@ -31,6 +31,7 @@ public:
 
     // Tracking. Points are in the window of the press, in window coordinates.
     bool IsTracking() const { return heldWindow != nullptr; }
+    PlatformWindow *HeldWindow() const { return heldWindow; }
     // Blocks until the pointer has moved or the button is up; true while it is down. A negative limit is none.
     bool NextDragPoint(double limit, Point &where, double &when, bool &timedOut);
     bool ButtonStillDown();
@@ -41,7 +42,7 @@ public:
 
     double LastEventTime() const;
     bool LastPressWasDouble() const { return lastPressClicks == 2; }
-    bool HandlingEvents() const { return depth > 0; }
+    void WindowHidden(PlatformWindow *);
     void WindowGone(PlatformWindow *);
 
     WindowSystem &Windows() { return windows; }
@@ -49,6 +50,8 @@ public:
     HelpTagWindow &HelpTags() { return *helpTags; }
 
 private:
+    void RunIdleWork();
+    bool MainLoopIsOver(double deadline) const;
     // Takes one event, or none when the time is over. Draws what is damaged before it blocks.
     bool Take(InputEvent &, double deadline, WindowSystem::Waiter, char const *what);
     // In a nested loop: window events are handled, pointer events go to `pointer`, everything else waits for the main loop.
@@ -70,7 +73,6 @@ private:
     double activatedAt = -1000;
     PlatformWindow *activatedWindow = nullptr;
     int lastPressClicks = 0;
-    int depth = 0;
     bool quitting = false;
     int status = 0;
 };

@@ -1,10 +1,12 @@
 #include "desktop/windows/HelpTagWindow.h"
 #include <algorithm>
+#include <stdexcept>
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/ThemeColors.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/PaneAccess.h"
 #include "desktop/resources/HelpTag.h"
+#include "desktop/windows/EventLoop.h"
 #include "host/CompoundPane.h"
 #include "host/TextSettings.h"
 #include "host/VelaDrawing.h"
@@ -45,6 +47,7 @@ bool HelpTagWindow::Find(GlogPane &pane, Point p, Found &found) {
     if (!pane.GetHelpTagForPoint(p, found.tag, found.part, found.placement, found.delay) || !found.tag)
         return false;
     found.part = Moved(found.part, PaneAccess::Origin(pane));
+    found.text = found.tag->Text();
     return true;
 }
 
@@ -67,6 +70,11 @@ void HelpTagWindow::PointerAt(Glog &over, Point p) {
     due = windows.Now() + std::max(0.0, found.delay);
 }
 
+void HelpTagWindow::HideAny() {
+    if (EventLoop *loop = EventLoop::Open())
+        loop->HelpTags().Hide();
+}
+
 void HelpTagWindow::Hide() {
     due = -1;
     glog = nullptr;
@@ -79,7 +87,12 @@ void HelpTagWindow::Hide() {
 void HelpTagWindow::Tick(double now) {
     if (due >= 0 && now >= due) {
         due = -1;
-        Show();
+        // A window that cannot be had for it takes the tag's place away, and nothing else.
+        try {
+            Show();
+        } catch (std::runtime_error const &) {
+            Hide();
+        }
     }
 }
 
@@ -111,11 +124,15 @@ Rect HelpTagWindow::ChoosePlace(int width, int height) const {
 }
 
 void HelpTagWindow::Show() {
-    UString const &text = wanted.tag->Text();
+    UString const text = wanted.text;
     UpdateTextLayout(layout, text, kFont, TextSettings::kAlignLeft, TextSettings::kTruncateNone, 1, 0, 0, 0, 0.0f, 1.0f,
                      1.0f);
-    int const width = std::min(static_cast<int>(layout.GetWidth()) + 2 * kPadH, kWidest);
-    place = ChoosePlace(width, kLineHeight + 2 * kPadV);
+    int const textWidth = static_cast<int>(layout.GetWidth());
+    int const width = std::min(textWidth + 2 * kPadH, kWidest);
+    // Lines break at words and are not filled to the end, so that some room for one more is kept from the second line on.
+    int const room = kWidest - 2 * kPadH;
+    int const lines = textWidth <= room ? 1 : (textWidth + textWidth / 8) / room + 1;
+    place = ChoosePlace(width, lines * kLineHeight + 2 * kPadV);
     WindowSpec spec;
     spec.popup = true;
     spec.placed = true;
@@ -148,6 +165,6 @@ void HelpTagWindow::Draw() {
     Rect inside = all;
     VelaDrawing::InsetRect(&inside, kPadH, kPadV);
     VelaDrawing::RGBForeColor(ThemeColors::kTooltipTextColor);
-    DrawTextLayoutInRect(layout, wanted.tag->Text(), inside, kFont, TextSettings::kAlignLeft, TextSettings::kTruncateNone,
-                         1, 0, 0, 0, 0.0f, 1.0f, 1.0f);
+    DrawTextLayoutInRect(layout, wanted.text, inside, kFont, TextSettings::kAlignLeft, TextSettings::kTruncateNone,
+                         1, inside.bottom - inside.top > kLineHeight, 0, 0, 0.0f, 1.0f, 1.0f);
 }

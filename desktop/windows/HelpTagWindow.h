@@ -17,6 +17,7 @@ public:
     ~HelpTagWindow();
     void PointerAt(Glog &, Point window);
     void Hide();
+    static void HideAny();              // of the open desktop, if there is one
     void Tick(double now);              // shows what is due
     double UntilNext(double now) const; // negative when nothing is due
     void OwnerGone(PlatformWindow *);
@@ -28,7 +29,8 @@ public:
 
 private:
     struct Found {
-        LocalizedStrings::HelpTag const *tag = nullptr;
+        LocalizedStrings::HelpTag const *tag = nullptr; // only to be compared: it may be gone
+        UString text;
         Rect part{0, 0, 0, 0}; // window coordinates
         OS::Help::Placement placement = OS::Help::kPlacementForParts;
         double delay = 0;

@@ -20,6 +20,8 @@ private:
         CIdleChore *chore;
         double interval; // seconds
         double due;
+        bool running; // waits in its own DoIdle
     };
+    Entry *Find(CIdleChore *); // null when it is not assigned
     std::vector<Entry> entries;
 };

@@ -9,21 +9,29 @@
 
 namespace {
 
-Point LocalToPort(Point window) {
+// A place in one window, in the coordinates of the current port, which may be another window's.
+Point LocalToPort(Point place, PlatformWindow const *window) {
     DrawingPort *port = DrawingPort::CurrentPort();
     if (!port)
-        return window;
-    return {static_cast<short>(window.v - port->OriginV()), static_cast<short>(window.h - port->OriginH())};
+        return place;
+    PlatformWindow const *const target = EventLoop::Instance().WindowOf(*port);
+    int h = place.h - port->OriginH(), v = place.v - port->OriginV();
+    if (window && target && window != target) {
+        h += window->ScreenPlace().h - target->ScreenPlace().h;
+        v += window->ScreenPlace().v - target->ScreenPlace().v;
+    }
+    return {static_cast<short>(v), static_cast<short>(h)};
 }
 
 bool NextPoint(double limit, Point *where, double *when, bool &timedOut) {
     Point place;
     double time = 0;
+    PlatformWindow const *const window = EventLoop::Instance().HeldWindow();
     if (!EventLoop::Instance().NextDragPoint(limit, place, time, timedOut))
         return false;
     // With no movement the position stays what the caller has.
     if (where && !timedOut)
-        *where = LocalToPort(place);
+        *where = LocalToPort(place, window);
     if (when)
         *when = time;
     return true;
@@ -38,7 +46,7 @@ void OS::Services::GetMouse(::Point *where) {
     DrawingPort *port = DrawingPort::CurrentPort();
     PlatformWindow *window = port ? loop.WindowOf(*port) : nullptr;
     if (window)
-        *where = LocalToPort(loop.Windows().MousePlace(*window));
+        *where = LocalToPort(loop.Windows().MousePlace(*window), window);
 }
 
 bool OS::Services::ScrollArrowsTogetherAtEnd() { return PlatformConventions::scrollArrowsTogetherAtEnd; }

@@ -22,7 +22,9 @@ std::unique_ptr<PlatformWindow> SimulatedWindowSystem::CreateWindow(WindowSpec c
         placed.h = kFirstPlace.h;
         placed.v = kFirstPlace.v;
     }
-    return std::unique_ptr<PlatformWindow>(new SimulatedWindow(*this, placed, scale));
+    std::unique_ptr<SimulatedWindow> window(new SimulatedWindow(*this, placed, scale));
+    all.push_back(window.get());
+    return window;
 }
 
 void SimulatedWindowSystem::WindowShown(SimulatedWindow *window) {
@@ -45,6 +47,7 @@ void SimulatedWindowSystem::WindowHidden(SimulatedWindow *window) {
 }
 
 void SimulatedWindowSystem::WindowGone(SimulatedWindow *window) {
+    all.erase(std::remove(all.begin(), all.end(), window), all.end());
     if (std::find(windows.begin(), windows.end(), window) != windows.end())
         WindowHidden(window);
 }
@@ -252,13 +255,18 @@ void SimulatedWindowSystem::Perform(ScriptStep const &step) {
     }
 }
 
-Point SimulatedWindowSystem::MousePlace(PlatformWindow const &) const {
-    return {static_cast<short>(state.PointerV()), static_cast<short>(state.PointerH())};
+Point SimulatedWindowSystem::MousePlace(PlatformWindow const &window) const {
+    int h = state.PointerH(), v = state.PointerV();
+    if (PlatformWindow const *const over = state.PointerWindow()) {
+        h += over->ScreenPlace().h - window.ScreenPlace().h;
+        v += over->ScreenPlace().v - window.ScreenPlace().v;
+    }
+    return {static_cast<short>(v), static_cast<short>(h)};
 }
 
 void SimulatedWindowSystem::ForceScale(double factor) {
     scale = factor;
-    for (SimulatedWindow *window : windows)
+    for (SimulatedWindow *window : all)
         window->SetScaleFactor(scale);
 }
 

@@ -62,7 +62,8 @@ private:
     bool stepTimed = false;
     std::deque<InputEvent> queue;
     InputState state;
-    std::vector<SimulatedWindow *> windows;
+    std::vector<SimulatedWindow *> all;     // hidden ones too
+    std::vector<SimulatedWindow *> windows; // the shown ones
     SimulatedWindow *active = nullptr;
     PlatformWindow *captured = nullptr;
     CommandHandler commandHandler;

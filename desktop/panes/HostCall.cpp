@@ -1,0 +1,3 @@
+#include "desktop/panes/HostCall.h"
+
+int HostCall::depth = 0;
