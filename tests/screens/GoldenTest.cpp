@@ -1,0 +1,105 @@
+// How pages and buttons look, in both themes and at two scales.
+#include "desktop/SimulatedDesktop.h"
+#include "desktop/drawing/Surface.h"
+#include "desktop/panes/Glog.h"
+#include "dialogs/LoadGlog.h"
+#include "host/glogRec.h"
+#include "tests/resources/TemporaryDirectory.h"
+#include "tests/screens/GalleryPages.h"
+#include "tests/screens/GoldenPicture.h"
+#include <gtest/gtest.h>
+#include <memory>
+#include <tuple>
+
+namespace {
+
+struct Look {
+    std::string theme;
+    int scale;
+    std::string Name() const { return theme + '-' + std::to_string(scale) + 'x'; }
+};
+Look const kLooks[] = {{"light", 1}, {"light", 2}, {"dark", 1}, {"dark", 2}};
+
+void PrintTo(Look const &look, std::ostream *out) { *out << look.Name(); }
+
+DesktopOptions OptionsFor(Look const &look) { return DesktopOptions().Theme(look.theme).Scale(look.scale); }
+
+typedef std::tuple<PageFile, Look> PageLook;
+
+class GoldenPage : public testing::TestWithParam<PageLook> {};
+
+TEST_P(GoldenPage, LooksAsItDid) {
+    auto const &[page, look] = GetParam();
+    SimulatedDesktop desktop(OptionsFor(look));
+    glogRec *const glog = LoadGlog(page.path);
+    ShowGlog(glog, kShowGlog);
+    EXPECT_TRUE(GoldenPicture::Matches(*Glog::From(glog).Pixels(), page.name + '-' + look.Name()));
+}
+
+INSTANTIATE_TEST_SUITE_P(Gallery, GoldenPage,
+                         testing::Combine(testing::ValuesIn(GalleryFiles().Pages()),
+                                          testing::ValuesIn(kLooks)),
+                         [](testing::TestParamInfo<PageLook> const &info) {
+                             return AsTestName(std::get<0>(info.param).name + '-' +
+                                               std::get<1>(info.param).Name());
+                         });
+
+// Something held down, as a script has it.
+struct Press {
+    char const *name;
+    char const *script;
+};
+Press const kPresses[] = {{"rest", ""},
+                          {"oval-pressed", "press 40 24\n"},
+                          {"stud-pressed", "press 40 56\n"},
+                          {"frame-pressed", "press 20 88\n"},
+                          {"oval-slid-off", "press 40 24\nmove 230 100\n"},
+                          {"disabled-refused", "press 160 24\n"}};
+
+void PrintTo(Press const &press, std::ostream *out) { *out << press.name; }
+
+typedef std::tuple<Press, Look> PressLook;
+
+class GoldenPress : public testing::TestWithParam<PressLook> {};
+
+TEST_P(GoldenPress, LooksAsItDid) {
+    auto const &[press, look] = GetParam();
+    TemporaryDirectory directory;
+    std::string const picture = directory.Path() + "/picture.png";
+    SimulatedDesktop desktop(OptionsFor(look));
+    ShowGlog(LoadGlog(TreeDirectory() + "/tests/screens/push-button-states.xml"), kShowGlog);
+    desktop.Play(std::string(press.script) + "wait 0.5\nsnapshot " + picture);
+    std::string error;
+    std::unique_ptr<Surface> const actual = Surface::ReadPng(picture, error);
+    ASSERT_TRUE(actual) << error;
+    EXPECT_TRUE(
+        GoldenPicture::Matches(*actual, std::string("push-button-") + press.name + '-' + look.Name()));
+}
+
+INSTANTIATE_TEST_SUITE_P(Buttons, GoldenPress,
+                         testing::Combine(testing::ValuesIn(kPresses), testing::ValuesIn(kLooks)),
+                         [](testing::TestParamInfo<PressLook> const &info) {
+                             return AsTestName(std::string(std::get<0>(info.param).name) + '-' +
+                                               std::get<1>(info.param).Name());
+                         });
+
+TEST(GoldenPicture, FailsForAPictureThatIsNotThere) {
+    EXPECT_FALSE(GoldenPicture::Compared(Surface(4, 4), "no-such-picture"));
+}
+
+TEST(GoldenPicture, FailsForOneOtherPixelAndForAnotherSize) {
+    std::string error;
+    std::unique_ptr<Surface> const kept =
+        Surface::ReadPng(TreeDirectory() + "/tests/screens/golden/push-button-rest-light-1x.png", error);
+    ASSERT_TRUE(kept) << error;
+    EXPECT_FALSE(
+        GoldenPicture::Matches(Surface(kept->Width(), kept->Height() + 1), "push-button-rest-light-1x"));
+    kept->Row(3)[5] ^= 1;
+    testing::AssertionResult const result = GoldenPicture::Compared(*kept, "push-button-rest-light-1x");
+    EXPECT_FALSE(result);
+    EXPECT_NE(std::string(result.message()).find("1 pixels of push-button-rest-light-1x differ"),
+              std::string::npos)
+        << result.message();
+}
+
+} // namespace
