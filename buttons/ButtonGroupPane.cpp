@@ -313,6 +313,10 @@ bool ButtonGroupPane::IsOn(short index) const {
     return index >= 0 && index < CountButtons() && buttons[static_cast<std::size_t>(index)].value;
 }
 
+bool ButtonGroupPane::IsEnabled(short index) const {
+    return index >= 0 && index < CountButtons() && buttons[static_cast<std::size_t>(index)].enabled;
+}
+
 void ButtonGroupPane::TurnOnQuietly(short index) {
     if (index >= 0 && index < CountButtons())
         buttons[static_cast<std::size_t>(index)].value = true;

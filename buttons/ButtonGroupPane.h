@@ -60,6 +60,10 @@ public:
     void AddButtonText(short dh, short dv, UString const &text);
     // How many buttons there are.
     int CountButtons() const { return static_cast<int>(buttons.size()); }
+    // How many labels there are.
+    int CountButtonTexts() const { return static_cast<int>(texts.size()); }
+    // Whether the button is enabled; false for an index that does not exist.
+    bool IsEnabled(short index) const;
     // Writes the rectangle of the button and of the last of its labels. The index must exist.
     void GetButtonBounds(short index, Rect *out);
     // Writes a label's text. Here and below `n` counts labels, not buttons, and must exist.

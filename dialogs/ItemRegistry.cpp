@@ -5,6 +5,7 @@
 
 ItemRegistry::ItemRegistry() {
     AddButtonItems(*this);
+    AddChoiceItems(*this);
     AddLabelItems(*this);
     AddGroupItems(*this);
 }

@@ -5,5 +5,6 @@ class ItemRegistry;
 
 // Each also tells the tree dump what its panes show.
 void AddButtonItems(ItemRegistry &); // OvalButton, StudButton, FrameButton
+void AddChoiceItems(ItemRegistry &); // CheckBox, RadioButton
 void AddLabelItems(ItemRegistry &);  // Label
 void AddGroupItems(ItemRegistry &);  // Group, Spacer

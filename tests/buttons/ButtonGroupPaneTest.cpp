@@ -443,6 +443,18 @@ TEST_F(ButtonGroup, EnablingIsToldByTheSecondMessageOnly) {
     EXPECT_EQ(listener.sources, (std::vector<ButtonGroupPane *>{group}));
 }
 
+TEST_F(ButtonGroup, TellsWhichButtonsAreEnabledAndHowManyLabelsThereAre) {
+    CheckBoxPane *const group = ThreeBoxes();
+    group->SetOneEnable(1, false);
+    EXPECT_TRUE(group->IsEnabled(0));
+    EXPECT_FALSE(group->IsEnabled(1));
+    EXPECT_FALSE(group->IsEnabled(-1));
+    EXPECT_FALSE(group->IsEnabled(3));
+    group->AddSpecialButton(0, 0, 0);
+    EXPECT_EQ(group->CountButtonTexts(), 3);
+    EXPECT_EQ(group->CountButtons(), 4);
+}
+
 TEST_F(ButtonGroup, SetAllEnableTellsOfThoseThatChangeInOrder) {
     CheckBoxPane *const group = ThreeBoxes();
     group->SetOneEnable(1, false);

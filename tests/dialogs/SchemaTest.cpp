@@ -44,7 +44,8 @@ std::set<std::string> KeysOfStockTypes() {
     std::set<std::string> names = {"Items"};
     for (std::string const &key : CommonKeys::List().Names())
         names.insert(key);
-    for (char const *type : {"OvalButton", "StudButton", "FrameButton", "Label", "Group", "Spacer"}) {
+    for (char const *type :
+         {"OvalButton", "StudButton", "FrameButton", "CheckBox", "RadioButton", "Label", "Group", "Spacer"}) {
         for (std::string const &key : ItemRegistry::Instance().Find(type)->keys.Names())
             names.insert(key);
     }
@@ -54,7 +55,7 @@ std::set<std::string> KeysOfStockTypes() {
 TEST(Schema, KnowsTheKeysOfTheStockTypesAndNoOthers) {
     XmlFile const schema = XmlFile::Read(kSchema);
     std::set<std::string> known;
-    for (char const *group : {"EveryItem", "SeveralTypes", "Buttons", "Labels", "Groups"})
+    for (char const *group : {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Labels", "Groups"})
         CollectElements(*Named(schema.Root(), "xs:group", group), known);
     EXPECT_EQ(known, KeysOfStockTypes());
 }
@@ -73,8 +74,8 @@ TEST(Schema, KnowsTheStockTypes) {
     std::set<std::string> known;
     for (XmlNode const &value : list.children)
         known.insert(*value.Attribute("value"));
-    EXPECT_EQ(known,
-              (std::set<std::string>{"OvalButton", "StudButton", "FrameButton", "Label", "Group", "Spacer"}));
+    EXPECT_EQ(known, (std::set<std::string>{"OvalButton", "StudButton", "FrameButton", "CheckBox",
+                                            "RadioButton", "Label", "Group", "Spacer"}));
     for (std::string const &name : known)
         EXPECT_NE(ItemRegistry::Instance().Find(name), nullptr) << name;
 }
