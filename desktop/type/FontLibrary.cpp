@@ -62,9 +62,10 @@ cairo_font_options_t *NewFontOptions() {
 }
 
 PangoFontDescription *NewDescription(FontSpec const &spec) {
-    // The dialog family stands in for families that are not there.
-    std::string const &family = FontFamilies::NameOf(spec.family);
-    std::string families = family + ',' + FontFamilies::NameOf(0u);
+    // The dialog family stands in for families that are not there. It is not named twice: Pango measures
+    // lines in the family that it found, which then has the same description and is not looked up once more.
+    std::string const &family = FontFamilies::NameOf(spec.family), &standIn = FontFamilies::NameOf(0u);
+    std::string families = family == standIn ? family : family + ',' + standIn;
     if (spec.face & FontFace::kCondensed)
         families = family + " Condensed," + families;
     PangoFontDescription *description = pango_font_description_new();
@@ -77,23 +78,32 @@ PangoFontDescription *NewDescription(FontSpec const &spec) {
     return description;
 }
 
-int WidestCharacter(PangoContext *context, PangoFontDescription const *description) {
-    PangoFont *font = pango_context_load_font(context, description);
-    if (!font)
-        return 0;
-    cairo_font_extents_t extents;
-    cairo_scaled_font_extents(pango_cairo_font_get_scaled_font(PANGO_CAIRO_FONT(font)), &extents);
-    g_object_unref(font);
-    return static_cast<int>(std::clamp(std::ceil(extents.max_x_advance), 0.0, 32767.0));
+// The font that the layouts have looked up too: asking for it in another way would look it up once more, in
+// threads, and Pango's own metrics shape a sample of the language.
+cairo_font_extents_t ExtentsOf(PangoContext *context, PangoFontDescription const *description) {
+    constexpr unsigned int kAnyLetter = 'n';
+    cairo_font_extents_t extents = {};
+    PangoFontset *set = pango_context_load_fontset(context, description, pango_context_get_language(context));
+    if (!set)
+        return extents;
+    if (PangoFont *font = pango_fontset_get_font(set, kAnyLetter)) {
+        cairo_scaled_font_extents(pango_cairo_font_get_scaled_font(PANGO_CAIRO_FONT(font)), &extents);
+        g_object_unref(font);
+    }
+    g_object_unref(set);
+    return extents;
 }
 
+// Rounded as Pango rounds the places of lines.
+int WholePixels(double height) { return PANGO_PIXELS_CEIL(pango_units_from_double(height)); }
+
 FontMetrics Measure(PangoContext *context, PangoFontDescription const *description) {
-    PangoFontMetrics *found = pango_context_get_metrics(context, description, nullptr);
+    constexpr double kWidest = 32767.0;
+    cairo_font_extents_t const extents = ExtentsOf(context, description);
     FontMetrics metrics;
-    metrics.ascent = PANGO_PIXELS_CEIL(pango_font_metrics_get_ascent(found));
-    metrics.descent = PANGO_PIXELS_CEIL(pango_font_metrics_get_descent(found));
-    metrics.maxWidth = WidestCharacter(context, description);
-    pango_font_metrics_unref(found);
+    metrics.ascent = WholePixels(extents.ascent);
+    metrics.descent = WholePixels(extents.descent);
+    metrics.maxWidth = static_cast<int>(std::clamp(std::ceil(extents.max_x_advance), 0.0, kWidest));
     return metrics;
 }
 
@@ -143,6 +153,7 @@ void FontLibrary::Refresh() {
 void FontLibrary::Open() {
     config = FcConfigCreate();
     FcConfigSetCurrent(config);
+    LoadFace(0); // while there is no map yet: a map starts threads whenever its fonts change
     map = pango_cairo_font_map_new_for_font_type(CAIRO_FONT_TYPE_FT);
     context = pango_font_map_create_context(map);
     pango_context_set_language(context, pango_language_from_string(kShapingLanguage));
@@ -150,7 +161,6 @@ void FontLibrary::Open() {
     cairo_font_options_t *options = NewFontOptions();
     pango_cairo_context_set_font_options(context, options);
     cairo_font_options_destroy(options);
-    LoadFace(0);
     if (!FcConfigGetFonts(config, FcSetApplication))
         AddSystemFonts(); // better any text than none
 }
@@ -180,7 +190,7 @@ void FontLibrary::LoadFace(int faceBits) {
         if (file.face == faceBits && FcConfigAppFontAddFile(config, FcText(file.path)))
             added = true;
     }
-    if (added)
+    if (added && map)
         pango_fc_font_map_config_changed(PANGO_FC_FONT_MAP(map));
 }
 

@@ -8,12 +8,18 @@ namespace {
 // A few windows full of labels.
 constexpr std::size_t kMaxTexts = 512;
 constexpr std::size_t kMaxTextUnits = 1 << 17;
+// As many as a window that is being made measures before it draws them.
+constexpr std::size_t kMaxMeasured = 256;
+constexpr std::size_t kMaxMeasuredUnits = 1 << 15;
 // Widths are small, and a list measures more strings than it shows.
 constexpr std::size_t kMaxWidths = 8192;
 constexpr std::size_t kMaxWidthUnits = 1 << 19;
 
 struct Caches {
     TextLru<std::unique_ptr<ShapedText>> texts{kMaxTexts, kMaxTextUnits};
+    // Shaped for their widths alone. Those that are drawn soon after, as labels are, move to the texts; the
+    // thousands that a list measures do not drive those out.
+    TextLru<std::unique_ptr<ShapedText>> measured{kMaxMeasured, kMaxMeasuredUnits};
     TextLru<int> widths{kMaxWidths, kMaxWidthUnits};
     unsigned int generation = 0;
 };
@@ -24,6 +30,7 @@ Caches &CurrentCaches() {
     static Caches caches;
     if (caches.generation != generation) {
         caches.texts.Clear();
+        caches.measured.Clear();
         caches.widths.Clear();
         caches.generation = generation;
     }
@@ -33,9 +40,12 @@ Caches &CurrentCaches() {
 } // namespace
 
 ShapedText const &ShapedTextCache::Get(std::u16string_view text, TextShape const &shape) {
-    if (std::unique_ptr<ShapedText> const *kept = CurrentCaches().texts.Find(text, shape))
+    Caches &caches = CurrentCaches();
+    if (std::unique_ptr<ShapedText> const *kept = caches.texts.Find(text, shape))
         return **kept;
-    auto shaped = std::make_unique<ShapedText>(text, shape);
+    std::unique_ptr<ShapedText> shaped = caches.measured.Take(text, shape);
+    if (!shaped)
+        shaped = std::make_unique<ShapedText>(text, shape);
     // Asked for again: shaping may have added fonts.
     return *CurrentCaches().texts.Add(text, shape, std::move(shaped));
 }
@@ -50,8 +60,16 @@ ShapedText const &ShapedTextCache::GetFitted(std::u16string_view text, TextShape
 }
 
 int ShapedTextCache::Width(std::u16string_view text, TextShape const &shape) {
-    if (int const *kept = CurrentCaches().widths.Find(text, shape))
+    Caches &caches = CurrentCaches();
+    if (int const *kept = caches.widths.Find(text, shape))
         return *kept;
-    int const width = ShapedText(text, shape).Width();
-    return CurrentCaches().widths.Add(text, shape, width);
+    if (std::unique_ptr<ShapedText> const *shown = caches.texts.Find(text, shape))
+        return caches.widths.Add(text, shape, (*shown)->Width());
+    auto shaped = std::make_unique<ShapedText>(text, shape);
+    int const width = shaped->Width();
+    // Asked for again: shaping may have added fonts.
+    Caches &present = CurrentCaches();
+    present.measured.Take(text, shape); // its width was forgotten before it
+    present.measured.Add(text, shape, std::move(shaped));
+    return present.widths.Add(text, shape, width);
 }

@@ -3,6 +3,7 @@
 #include "desktop/type/ShapedText.h"
 #include <cstddef>
 #include <functional>
+#include <iterator>
 #include <list>
 #include <string>
 #include <string_view>
@@ -33,8 +34,19 @@ public:
         index.emplace(entry.GetKey(), entries.begin());
         units += text.size();
         while (entries.size() > 1 && (entries.size() > maxEntries || units > maxUnits))
-            DropLast();
+            Drop(std::prev(entries.end()));
         return entry.value;
+    }
+
+    // Gives the value away, which is not kept any more; a default one when there is none.
+    Value Take(std::u16string_view text, TextShape const &shape) {
+        auto const found = index.find(Key{text, &shape});
+        if (found == index.end())
+            return Value();
+        auto const entry = found->second;
+        Value value = std::move(entry->value);
+        Drop(entry);
+        return value;
     }
 
     void Clear() {
@@ -69,11 +81,10 @@ private:
         Key GetKey() const { return {text, &shape}; }
     };
 
-    void DropLast() {
-        Entry const &last = entries.back();
-        units -= last.text.size();
-        index.erase(last.GetKey());
-        entries.pop_back();
+    void Drop(typename std::list<Entry>::iterator entry) {
+        units -= entry->text.size();
+        index.erase(entry->GetKey());
+        entries.erase(entry);
     }
 
     std::size_t maxEntries, maxUnits, units = 0;

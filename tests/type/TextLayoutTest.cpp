@@ -9,6 +9,7 @@
 #include "tests/type/Canvas.h"
 #include <chrono>
 #include <gtest/gtest.h>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -193,6 +194,19 @@ TEST(TextLru, DropsTheLeastRecentlyUsed) {
     lru.Add(u"c", shape, 3);
     EXPECT_NE(lru.Find(u"a", shape), nullptr);
     EXPECT_EQ(lru.Find(u"b", shape), nullptr);
+}
+
+TEST(TextLru, GivesAwayAValueAndTheRoomThatItTook) {
+    TextLru<std::unique_ptr<int>> lru(100, 10);
+    TextShape const shape;
+    lru.Add(u"123456", shape, std::make_unique<int>(1));
+    std::unique_ptr<int> const taken = lru.Take(u"123456", shape);
+    ASSERT_NE(taken, nullptr);
+    EXPECT_EQ(*taken, 1);
+    EXPECT_EQ(lru.Take(u"123456", shape), nullptr);
+    lru.Add(u"abcdef", shape, std::make_unique<int>(2));
+    lru.Add(u"ghij", shape, std::make_unique<int>(3));
+    EXPECT_EQ(lru.Size(), 2u);
 }
 
 TEST(TextLru, IsBoundedByTheLengthOfItsTextsToo) {
