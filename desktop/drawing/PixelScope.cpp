@@ -1,19 +1,13 @@
 #include "desktop/drawing/PixelScope.h"
 #include "desktop/drawing/Surface.h"
 #include <algorithm>
-#include <array>
 #include <cmath>
-#include <cstring>
+#include <cwchar>
 
 namespace {
 
 constexpr std::uint32_t kFullAlpha = 0xFF;
 constexpr double kLargest8 = 255.0, kLargest16 = 65535.0;
-constexpr int kBitsPerPixel = 32;
-// Rows this short are filled faster here than by a call into the library, single rows up to the second
-// number.
-constexpr int kShortRow = 16, kShortSingleRow = 512;
-constexpr std::uintptr_t kStoreBytes = 16;
 // What is left of an icon that is drawn as disabled.
 constexpr std::uint16_t kFadedAlpha = 0x6666;
 
@@ -33,15 +27,11 @@ pixman_color_t PremultipliedColor(OS::RGBAColor const &color) {
             Component16(Unit(color.b) * alpha), Component16(alpha)};
 }
 
+// The C library fills wide characters as fast as the machine can, and a pixel is as large as one.
+static_assert(sizeof(wchar_t) == sizeof(std::uint32_t), "a pixel and a wide character have the same size");
 void FillRow(std::uint32_t *row, int width, std::uint32_t pixel) {
-    for (; width > 0 && reinterpret_cast<std::uintptr_t>(row) % kStoreBytes != 0; --width)
-        *row++ = pixel;
-    std::array<std::uint32_t, kShortRow> block; // copied as a whole, which becomes a few wide stores
-    block.fill(pixel);
-    for (; width >= kShortRow; width -= kShortRow, row += kShortRow)
-        std::memcpy(__builtin_assume_aligned(row, kStoreBytes), block.data(), sizeof block);
-    for (int x = 0; x < width; ++x)
-        row[x] = pixel;
+    std::wmemset(reinterpret_cast<wchar_t *>(row), static_cast<wchar_t>(pixel),
+                 static_cast<std::size_t>(width));
 }
 
 // One colour everywhere.
@@ -108,11 +98,6 @@ template <class Draw> void PixelScope::ForEachVisible(DeviceRect const &r, Draw 
 void PixelScope::FillPixels(DeviceRect const &r, std::uint32_t pixel) {
     Surface &surface = *port.surface;
     int const width = r.Width();
-    if (width > (r.Height() == 1 ? kShortSingleRow : kShortRow)) {
-        pixman_fill(surface.Pixels(), surface.Width(), kBitsPerPixel, r.left, r.top, width, r.Height(),
-                    pixel);
-        return;
-    }
     std::uint32_t *row = surface.Row(r.top) + r.left;
     for (int y = r.top; y < r.bottom; ++y, row += surface.Width())
         FillRow(row, width, pixel);

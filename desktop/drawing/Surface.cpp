@@ -5,6 +5,8 @@
 #include <cstring>
 #include <fstream>
 #include <pixman.h>
+#include <sys/mman.h>
+#include <unistd.h>
 
 namespace {
 
@@ -16,6 +18,32 @@ constexpr std::uint32_t kLongestPngSide = 8192;
 constexpr std::array<unsigned char, 16> kPngStart = {0x89, 'P', 'N', 'G', '\r', '\n', 0x1A, '\n',
                                                      0,    0,   0,   13,  'I',  'H',  'D',  'R'};
 constexpr std::size_t kPngSizeBytes = 8;
+
+// The system gives fresh memory page by page, at the first touch of each, which for a window's pixels takes
+// several times as long as getting them all at once. Where it cannot do that, nothing is lost.
+void GetPages(void *start, std::size_t bytes) {
+#ifdef MADV_POPULATE_WRITE
+    constexpr std::size_t kWorthwhile = std::size_t(256) << 10;
+    if (bytes < kWorthwhile)
+        return;
+    std::uintptr_t const page = static_cast<std::uintptr_t>(sysconf(_SC_PAGESIZE));
+    std::uintptr_t const address = reinterpret_cast<std::uintptr_t>(start);
+    std::uintptr_t const first = (address + page - 1) / page * page, end = (address + bytes) / page * page;
+    madvise(static_cast<char *>(start) + (first - address), end - first, MADV_POPULATE_WRITE);
+#else
+    static_cast<void>(start);
+    static_cast<void>(bytes);
+#endif
+}
+
+std::vector<std::uint32_t> NewPixels(int width, int height) {
+    std::size_t const count = static_cast<std::size_t>(width) * static_cast<std::size_t>(height);
+    std::vector<std::uint32_t> pixels;
+    pixels.reserve(count);
+    GetPages(pixels.data(), count * sizeof(std::uint32_t));
+    pixels.assign(count, kOpaqueBlack);
+    return pixels;
+}
 
 struct CairoSurfaceFree {
     void operator()(cairo_surface_t *surface) const { cairo_surface_destroy(surface); }
@@ -55,7 +83,7 @@ bool PngSizeIsSane(std::string const &path, std::string &error) {
 Surface::Surface(int width_, int height_)
     : width(std::max(width_, 1))
     , height(std::max(height_, 1))
-    , pixels(static_cast<std::size_t>(width) * static_cast<std::size_t>(height), kOpaqueBlack)
+    , pixels(NewPixels(width, height))
     , image(pixman_image_create_bits_no_clear(PIXMAN_a8r8g8b8, width, height, pixels.data(),
                                               width * static_cast<int>(sizeof(std::uint32_t))))
     , cairo(nullptr) {
