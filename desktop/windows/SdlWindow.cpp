@@ -98,7 +98,14 @@ void SdlWindow::CorrectPlace() {
         SetPlace(placeH, placeV);
 }
 
-void SdlWindow::Show() { SDL_ShowWindow(window); }
+// The picture goes out at once: it would otherwise wait for the exposure, and so for all events before it.
+// SDL refuses one that has not the window's size.
+void SdlWindow::Show() {
+    SDL_ShowWindow(window);
+    if (keptHidden)
+        SDL_UpdateWindowSurface(window);
+    keptHidden = false;
+}
 
 void SdlWindow::Hide() { SDL_HideWindow(window); }
 
@@ -149,8 +156,6 @@ static void CopyPixels(Surface const &from, DeviceRect const &rect, SDL_Surface 
 // A rectangle that lies wholly outside the window would be refused by the X server, which ends the program:
 // nothing but what both have goes there. They differ between a resize and the surface that answers it.
 void SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
-    if ((SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) != 0)
-        return; // what is hidden is exposed when it is shown
     SDL_Surface *screen = SDL_GetWindowSurface(window);
     if (screen == nullptr)
         return; // the server is out of memory for pictures: the next exposure tries again
@@ -163,7 +168,8 @@ void SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::si
         CopyPixels(surface, rect, *screen);
         updated.push_back({rect.left, rect.top, rect.Width(), rect.Height()});
     }
-    if (!updated.empty())
+    keptHidden = (SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) != 0;
+    if (!updated.empty() && !keptHidden)
         SDL_UpdateWindowSurfaceRects(window, updated.data(), static_cast<int>(updated.size()));
 }
 

@@ -73,5 +73,6 @@ private:
     SizeLimits limits;
     bool placePending; // `placeH` and `placeV` wait for the frame
     int placeH, placeV;
+    bool keptHidden = false;       // SDL has a picture of ours that could not be shown yet
     std::vector<SDL_Rect> updated; // of one Present; kept for its memory
 };
