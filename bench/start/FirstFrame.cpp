@@ -1,8 +1,8 @@
 // Reports when the first frame is on the screen, as one line on standard output: the monotonic clock and the
 // processor time of the process, both in nanoseconds.
 //
-// It stands between the program and SDL: the linker finds this function before the library's. So two programs
-// that know nothing of it are timed at the very same point.
+// It stands between the program and SDL: the linker finds these functions before the library's. So two
+// programs that know nothing of them are timed at the very same point.
 #include <SDL.h>
 #include <cstdio>
 #include <cstdlib>
@@ -11,8 +11,6 @@
 
 namespace {
 
-typedef int (*UpdateFunction)(SDL_Window *, SDL_Rect const *, int);
-
 long long Nanoseconds(clockid_t clock) {
     constexpr long long kPerSecond = 1000000000;
     timespec now = {};
@@ -20,13 +18,14 @@ long long Nanoseconds(clockid_t clock) {
     return static_cast<long long>(now.tv_sec) * kPerSecond + now.tv_nsec;
 }
 
-UpdateFunction FindUpdate() {
-    void *const found = dlsym(RTLD_NEXT, "SDL_UpdateWindowSurfaceRects");
+// The function of that name in the next library.
+template <class Function> Function *Next(char const *name) {
+    void *const found = dlsym(RTLD_NEXT, name);
     if (!found) {
-        std::fputs("SDL_UpdateWindowSurfaceRects is not in any library\n", stderr);
+        std::fprintf(stderr, "%s is not in any library\n", name);
         std::exit(EXIT_FAILURE);
     }
-    return reinterpret_cast<UpdateFunction>(found);
+    return reinterpret_cast<Function *>(found);
 }
 
 void ReportOnce() {
@@ -41,10 +40,17 @@ void ReportOnce() {
 
 } // namespace
 
-// SDL waits for the server before it returns from this call.
+// SDL waits for the server before it returns from either call.
 extern "C" int SDL_UpdateWindowSurfaceRects(SDL_Window *window, SDL_Rect const *rects, int count) {
-    static UpdateFunction const update = FindUpdate();
+    static auto *const update = Next<decltype(SDL_UpdateWindowSurfaceRects)>("SDL_UpdateWindowSurfaceRects");
     int const result = update(window, rects, count);
+    ReportOnce();
+    return result;
+}
+
+extern "C" int SDL_UpdateWindowSurface(SDL_Window *window) {
+    static auto *const update = Next<decltype(SDL_UpdateWindowSurface)>("SDL_UpdateWindowSurface");
+    int const result = update(window);
     ReportOnce();
     return result;
 }
