@@ -8,8 +8,10 @@ class Surface;
 namespace GoldenPicture {
 
 // Compares with golden/NAME.png. A difference fails and writes expected, actual and difference side by side
-// into the test output. With GLOG_UPDATE_GOLDEN=1 in the environment the picture is written instead, and that
-// fails as well: a run that makes its own expectations has shown nothing.
+// into the test output.
+testing::AssertionResult Compared(Surface const &actual, std::string const &name);
+// The same; but with GLOG_UPDATE_GOLDEN=1 in the environment the picture is written anew, and that fails as
+// well: a run that makes its own expectations has shown nothing.
 testing::AssertionResult Matches(Surface const &actual, std::string const &name);
 
 } // namespace GoldenPicture
