@@ -268,8 +268,11 @@ TEST_F(Mouse, LosingTheActivationToNobodyReleasesTheButton) {
     PointAt(*window, 20, 20);
     Do("mousedown 1");
     Await(InputEvent::kMouseDown);
-    RunBeside("xdotool windowfocus $(xwininfo -root -int | awk '/Window id/ { print $4 }')");
-    Drain();
+    // The window manager gives the focus to what was pressed, at a time of its own: it can take the focus back once.
+    for (int tries = 0; tries < 20 && System().IsMouseDown(); ++tries) {
+        RunBeside("xdotool windowfocus $(xwininfo -root -int | awk '/Window id/ { print $4 }')");
+        Drain();
+    }
     EXPECT_FALSE(System().IsMouseDown());
     Do("mouseup 1");
     EXPECT_TRUE(Drain(InputEvent::kMouseUp).empty());
