@@ -94,13 +94,14 @@ void GlogLayoutItem::SetAttributeFromString(Attribute attribute, UString const &
 Rect GlogLayoutItem::GetBorderRect() {
     LayoutEngine::SettleFor(*this);
     if (rep->isPart && rep->pane && rep->pane->IsInLayout()) {
-        // A part keeps its place in its pane: it moves with the pane's rectangle.
+        // A part keeps its place in its pane: it moves with the pane's rectangle. A size that it was told replaces its own.
         Rect const pane = rep->pane->GetLayoutRect()->GetBorderRect();
         Rect const made = LayoutEngine::Rep(*rep->pane->GetLayoutRect()).made;
-        return {static_cast<short>(rep->made.top + pane.top - made.top),
-                static_cast<short>(rep->made.left + pane.left - made.left),
-                static_cast<short>(rep->made.bottom + pane.top - made.top),
-                static_cast<short>(rep->made.right + pane.left - made.left)};
+        int const top = rep->made.top + pane.top - made.top, left = rep->made.left + pane.left - made.left;
+        int const height = rep->height > 0 ? rep->height : rep->made.bottom - rep->made.top;
+        int const width = rep->width > 0 ? rep->width : rep->made.right - rep->made.left;
+        return {static_cast<short>(top), static_cast<short>(left), static_cast<short>(top + height),
+                static_cast<short>(left + width)};
     }
     return rep->hasPlace ? rep->place : rep->made;
 }

@@ -119,6 +119,16 @@ LayoutEngine::Extent LayoutEngine::MeasurePane(GlogLayoutItem::Rep &rep) {
     CompoundPane *compound = rep.isPart ? nullptr : dynamic_cast<CompoundPane *>(rep.pane);
     if (compound && compound->UsesLayout())
         natural = Measure(*compound->GetLayout());
+    if (rep.isPart || !rep.pane)
+        return natural;
+    // A part that was told a larger size than it was made with makes its pane larger.
+    for (RCPtr<GlogLayoutRectItem> const &item : PaneAccess::Rep(*rep.pane).subItems) {
+        GlogLayoutItem::Rep const &part = Rep(*item);
+        if (part.width > 0)
+            natural.width = std::max(natural.width, part.made.left - rep.made.left + part.width);
+        if (part.height > 0)
+            natural.height = std::max(natural.height, part.made.top - rep.made.top + part.height);
+    }
     return natural;
 }
 

@@ -736,6 +736,19 @@ TEST_F(ButtonGroup, InALayoutALabelIsCentredInItsLine) {
     EXPECT_NE(drawn.find(at), std::string::npos) << drawn << " should stand at " << pen;
 }
 
+TEST_F(ButtonGroup, InALayoutANewNameWidensItsLabelAndThePane) {
+    CheckBoxPane *const group = ThreeBoxes();
+    PutIntoLayout(group, 100);
+    char const name[] = "A name that is much longer than all the others";
+    short const width = WidthOf(name);
+    group->SetNthButtonName(1, Text(name));
+    EXPECT_EQ(BoundsOf(*group, 1).right, 18 + width);
+    EXPECT_EQ(group->GetLayoutRect()->GetBorderRect().right, 18 + width);
+    group->SetNthButtonName(1, Text("i"));
+    EXPECT_EQ(BoundsOf(*group, 1).right, 18 + WidthOf("i"));
+    EXPECT_GE(group->GetLayoutRect()->GetBorderRect().right, BoundsOf(*group, 2).right);
+}
+
 TEST_F(ButtonGroup, InALayoutCalcBoxDoesNothing) {
     CheckBoxPane *const group = ThreeBoxes();
     PutIntoLayout(group, 100);
