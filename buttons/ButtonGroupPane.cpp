@@ -265,7 +265,8 @@ void ButtonGroupPane::GetNthButtonName(int n, UString &out) {
 
 void ButtonGroupPane::SetNthButtonName(int n, UString const &text) {
     ButtonTextRec &label = texts[static_cast<std::size_t>(n)];
-    UString const copy = text; // the caller's may be the very string that is freed
+    // The caller's may be the very string that is freed.
+    UString const copy = text; // NOLINT(performance-unnecessary-copy-initialization)
     StringMgr::Instance().Free(label.stringKey);
     label.stringKey = StringMgr::Instance().Store(copy);
     // In whatever font the port has: setting the label's would be one more change to the port.
@@ -524,7 +525,7 @@ bool ButtonGroupPane::TrackButton(short index, short) {
     rec.v = Short(icon.top + kIconDrop);
     rec.h = icon.left;
     rec.family = kButtonFamily;
-    rec.idleIcon = button.value ? onIcon : offIcon;
+    rec.idleIcon = IconOf(button);
     rec.pressedIcon = Short(rec.idleIcon + 1);
     rec.releaseIcon = GetReleaseIcon(button.value);
     // Over the label the button stays pressed too.

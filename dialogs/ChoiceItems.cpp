@@ -165,7 +165,7 @@ UString ReadText(RecordBytes &bytes) {
 }
 
 Container ReadString(RecordBytes &bytes) {
-    Container const item = XMLLib::CreateContainer(ResourceKey(kStringKey));
+    Container item = XMLLib::CreateContainer(ResourceKey(kStringKey));
     AddOrigin(*item, bytes.ReadPoint());
     item->AddSIntItem(ResourceKey("FSRID"), bytes.Short());
     item->AddUStringItem(ResourceKey("Text"), ReadText(bytes));
@@ -173,7 +173,7 @@ Container ReadString(RecordBytes &bytes) {
 }
 
 Container ReadButton(RecordBytes &bytes) {
-    Container const item = XMLLib::CreateContainer(ResourceKey(kButtonKey));
+    Container item = XMLLib::CreateContainer(ResourceKey(kButtonKey));
     AddOrigin(*item, bytes.ReadPoint());
     item->AddSIntItem(ResourceKey("HitExtension"), bytes.Short());
     Container const strings = XMLLib::CreateContainer(ResourceKey(kStringsKey));
@@ -184,7 +184,7 @@ Container ReadButton(RecordBytes &bytes) {
 }
 
 Container ReadRecord(RecordBytes &bytes) {
-    Container const item = XMLLib::CreateContainer(ResourceKey("Item"));
+    Container item = XMLLib::CreateContainer(ResourceKey("Item"));
     bytes.Short(); // the kind
     item->AddSIntItem(ResourceKey("Flags"), bytes.Short());
     item->AddSIntItem(ResourceKey("LineSpacing"), bytes.Short());
