@@ -13,10 +13,18 @@ struct glogRec;
 // How a desktop is opened; every setting has a default.
 class DesktopOptions {
 public:
-    DesktopOptions &Theme(std::string const &name) { return theme = name, *this; }         // "light" (default) or "dark"
-    DesktopOptions &Scale(double factor) { return scale = factor, *this; }                 // device pixels per pixel, 0.5 to 4; 0 (default): the display's
-    DesktopOptions &Language(std::string const &code) { return language = code, *this; }   // "en" (default), "de"
-    DesktopOptions &Artwork(std::string const &path) { return artwork = path, *this; }     // default: beside the library
+    DesktopOptions &Theme(std::string const &name) {
+        return theme = name, *this;
+    } // "light" (default) or "dark"
+    DesktopOptions &Scale(double factor) {
+        return scale = factor, *this;
+    } // device pixels per pixel, 0.5 to 4; 0 (default): the display's
+    DesktopOptions &Language(std::string const &code) {
+        return language = code, *this;
+    } // "en" (default), "de"
+    DesktopOptions &Artwork(std::string const &path) {
+        return artwork = path, *this;
+    } // default: beside the library
 
     // What was set.
     std::string theme = "light";
@@ -32,7 +40,9 @@ public:
     GlogOptions &Size(int w, int h) { return width = w, height = h, *this; } // content in pixels, 1 to 16000
     GlogOptions &Growable(bool on) { return growable = on, *this; }          // by the user; default: not
     // The glog's own style sheet; the glog takes it over. Default: none.
-    GlogOptions &StyleSheet(std::shared_ptr<GlogStyleSheet> sheet) { return styleSheet = std::move(sheet), *this; }
+    GlogOptions &StyleSheet(std::shared_ptr<GlogStyleSheet> sheet) {
+        return styleSheet = std::move(sheet), *this;
+    }
 
     // What was set.
     std::string title;
@@ -41,8 +51,9 @@ public:
     std::shared_ptr<GlogStyleSheet> styleSheet;
 };
 
-// Opens the window system and the resources; closes all glogs and both when it goes. One at a time: a second one throws
-// std::logic_error. The constructor throws std::runtime_error with the reason when there is no display or no artwork.
+// Opens the window system and the resources; closes all glogs and both when it goes. One at a time: a second
+// one throws std::logic_error. The constructor throws std::runtime_error with the reason when there is no
+// display or no artwork.
 class Desktop {
 public:
     explicit Desktop(DesktopOptions const & = DesktopOptions()); // real windows
@@ -51,31 +62,37 @@ public:
     Desktop &operator=(Desktop const &) = delete;
     static Desktop *Current(); // null while there is none
 
-    // A new, invisible glog without panes. The desktop owns it until DisposeGlog; a closed window disposes of its glog.
+    // A new, invisible glog without panes. The desktop owns it until DisposeGlog; a closed window disposes of
+    // its glog.
     glogRec *NewGlog(GlogOptions const &);
-    // Calls GlogItemInit on every pane; for glogs made in code, once all panes stand. ShowGlog calls it if nobody did.
+    // Calls GlogItemInit on every pane; for glogs made in code, once all panes stand. ShowGlog calls it if
+    // nobody did.
     void FinishGlog(glogRec *);
 
-    int Run();                          // handles events until the last visible glog closes or Quit; the exit status
+    int Run(); // handles events until the last visible glog closes or Quit; the exit status
     bool ProcessEvents(double seconds); // handles what comes within the time; false once Run would have ended
     void Quit(int status = 0);          // ends Run, which answers the status
 
-    // Both redraw everything. Unknown themes and scales out of range throw std::invalid_argument and change nothing.
+    // Both redraw everything. Unknown themes and scales out of range throw std::invalid_argument and change
+    // nothing.
     void SetTheme(std::string const &);
     std::string const &Theme() const;
     void SetScale(double);
 
-    // What a hit item does: called with the glog, the item's number and the value that HandleClick or Key gave.
+    // What a hit item does: called with the glog, the item's number and the value that HandleClick or Key
+    // gave.
     typedef std::function<void(glogRec *, int item, int value)> HitHandler;
     void SetHitHandler(HitHandler);
 
-    // One line of JSON for every message, and for what HandleClick, Key and Tab returned. An empty function ends it.
+    // One line of JSON for every message, and for what HandleClick, Key and Tab returned. An empty function
+    // ends it.
     typedef std::function<void(std::string const &line)> LineSink;
     void WatchMessages(LineSink);
     void WatchDrawing(LineSink);
     std::string DumpTree(glogRec *) const; // JSON: every pane with class, id, box and state
 
-    // Writes what the glog's window shows, in device pixels; throws std::runtime_error when the file cannot be written.
+    // Writes what the glog's window shows, in device pixels; throws std::runtime_error when the file cannot
+    // be written.
     void Snapshot(glogRec *, std::string const &pngPath);
 
     // What shows the windows and supplies events and time.

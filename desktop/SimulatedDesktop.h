@@ -1,21 +1,22 @@
 // A desktop without display: events from a script, time that only waiting moves, windows in memory.
 #pragma once
+#include "desktop/Desktop.h"
+#include "host/Geometry.h"
 #include <stdexcept>
 #include <string>
 #include <vector>
-#include "desktop/Desktop.h"
-#include "host/Geometry.h"
 
 class Surface;
 
 // A script that cannot be read or cannot go on; the message names script and line.
 class ScriptError : public std::runtime_error {
 public:
-    explicit ScriptError(std::string const &what) : std::runtime_error(what) {}
+    explicit ScriptError(std::string const &what)
+        : std::runtime_error(what) {}
 };
 
-// Drives and photographs dialogs. Script steps, one a line, `#` starts a comment; places are window coordinates, h then v; any of
-// shift, command, option and control may follow the place:
+// Drives and photographs dialogs. Script steps, one a line, `#` starts a comment; places are window
+// coordinates, h then v; any of shift, command, option and control may follow the place:
 //
 //     press 120 40 shift      move 130 44       release
 //     click 120 40            doubleclick 120 40     rightclick 120 40
@@ -25,8 +26,8 @@ public:
 //     menu 3                  # answers the next pop-up menu
 //     print list.pdf          snapshot a.png    dump a.json
 //
-// Steps are taken when something waits for events, nested loops too; `wait` lets virtual time pass first. When the script has ended,
-// a tracking loop gets its release and Run returns.
+// Steps are taken when something waits for events, nested loops too; `wait` lets virtual time pass first.
+// When the script has ended, a tracking loop gets its release and Run returns.
 class SimulatedDesktop : public Desktop {
 public:
     explicit SimulatedDesktop(DesktopOptions const & = DesktopOptions());

@@ -112,8 +112,8 @@ public:
     virtual void AutoResize(short dh, short dv);
     // A last chance to take a press of the mouse that no pane wanted. By default false.
     virtual unsigned char TryMouseControl(Point);
-    // Called each time the application is about to wait, for visible panes at the top level of the active glog.
-    // By default nothing.
+    // Called each time the application is about to wait, for visible panes at the top level of the active
+    // glog. By default nothing.
     virtual void Idle();
     // Whether the current item may lose the keyboard. By default true.
     virtual char CanDeselect();

@@ -1,9 +1,9 @@
 #include "host/GlogLayout.h"
-#include <algorithm>
 #include "desktop/layout/LayoutEngine.h"
 #include "desktop/resources/Utf.h"
 #include "host/GlogPane.h"
 #include "host/GlogStyleSheet.h"
+#include <algorithm>
 
 namespace {
 
@@ -13,11 +13,16 @@ struct LayoutKey {
     GlogLayoutItem::Attribute attribute;
 };
 LayoutKey const kLayoutKeys[] = {
-    {"InsetTop", GlogLayoutItem::kInsetTop},       {"InsetLeft", GlogLayoutItem::kInsetLeft},
-    {"InsetBottom", GlogLayoutItem::kInsetBottom}, {"InsetRight", GlogLayoutItem::kInsetRight},
-    {"Width", GlogLayoutItem::kWidth},             {"Height", GlogLayoutItem::kHeight},
-    {"GrowWidth", GlogLayoutItem::kGrowWidth},     {"GrowHeight", GlogLayoutItem::kGrowHeight},
-    {"Alignment", GlogLayoutItem::kAlignment},     {"MinWidth", GlogLayoutItem::kMinWidth},
+    {"InsetTop", GlogLayoutItem::kInsetTop},
+    {"InsetLeft", GlogLayoutItem::kInsetLeft},
+    {"InsetBottom", GlogLayoutItem::kInsetBottom},
+    {"InsetRight", GlogLayoutItem::kInsetRight},
+    {"Width", GlogLayoutItem::kWidth},
+    {"Height", GlogLayoutItem::kHeight},
+    {"GrowWidth", GlogLayoutItem::kGrowWidth},
+    {"GrowHeight", GlogLayoutItem::kGrowHeight},
+    {"Alignment", GlogLayoutItem::kAlignment},
+    {"MinWidth", GlogLayoutItem::kMinWidth},
     {"MinHeight", GlogLayoutItem::kMinHeight},
 };
 
@@ -60,9 +65,10 @@ int *FieldOf(GlogLayoutItem::Attribute attribute, GlogLayoutItem::Rep &rep) {
     return nullptr;
 }
 
-}
+} // namespace
 
-GlogLayoutItem::GlogLayoutItem() : rep(new Rep) {}
+GlogLayoutItem::GlogLayoutItem()
+    : rep(new Rep) {}
 
 GlogLayoutItem::~GlogLayoutItem() {
     for (RCPtr<GlogLayoutItem> const &child : rep->children)
@@ -94,7 +100,8 @@ void GlogLayoutItem::SetAttributeFromString(Attribute attribute, UString const &
 Rect GlogLayoutItem::GetBorderRect() {
     LayoutEngine::SettleFor(*this);
     if (rep->isPart && rep->pane && rep->pane->IsInLayout()) {
-        // A part keeps its place in its pane: it moves with the pane's rectangle. A size that it was told replaces its own.
+        // A part keeps its place in its pane: it moves with the pane's rectangle. A size that it was told
+        // replaces its own.
         Rect const pane = rep->pane->GetLayoutRect()->GetBorderRect();
         Rect const made = LayoutEngine::Rep(*rep->pane->GetLayoutRect()).made;
         int const top = rep->made.top + pane.top - made.top, left = rep->made.left + pane.left - made.left;
@@ -122,9 +129,10 @@ void GlogLayoutRectItem::ReadLayoutProperties(int, GlogStyleSheet *sheet) {
         return;
     for (LayoutKey const &known : kLayoutKeys)
         if (layout->GetSInt32Item(Key(known.key)))
-            SetAttribute(known.attribute,
-                         static_cast<int>(std::clamp(layout->GetSIntItemValue(Key(known.key)), -32768LL, 32767LL)),
-                         kPixels, UString());
+            SetAttribute(
+                known.attribute,
+                static_cast<int>(std::clamp(layout->GetSIntItemValue(Key(known.key)), -32768LL, 32767LL)),
+                kPixels, UString());
 }
 
 GlogLayoutGroup::GlogLayoutGroup(bool vertical) {
@@ -195,14 +203,16 @@ RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect place, int id, int index
     return item;
 }
 
-RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect inner, Rect outer, int id, int index, char const *name) {
+RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect inner, Rect outer, int id, int index,
+                                                   char const *name) {
     RCPtr<GlogLayoutRectItem> item = MakeRectItem(outer, id, index, name);
     LayoutEngine::Rep(*item).inner = inner;
     LayoutEngine::Rep(*item).hasInner = true;
     return item;
 }
 
-WithPerformLayoutRectUpdate::WithPerformLayoutRectUpdate(GlogPane *pane_) : pane(pane_) {
+WithPerformLayoutRectUpdate::WithPerformLayoutRectUpdate(GlogPane *pane_)
+    : pane(pane_) {
     if (pane->GetGlog())
         LayoutEngine::Settle(pane->GetGlog());
 }

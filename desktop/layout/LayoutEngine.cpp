@@ -1,9 +1,9 @@
 #include "desktop/layout/LayoutEngine.h"
-#include <algorithm>
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/HostCall.h"
 #include "desktop/panes/PaneAccess.h"
 #include "host/CompoundPane.h"
+#include <algorithm>
 
 namespace {
 
@@ -30,7 +30,7 @@ struct Along {
     int Room(Rect const &r) const { return vertical ? Height(r) : Width(r); }
 };
 
-}
+} // namespace
 
 RCPtr<GlogLayoutRectItem> LayoutEngine::MakeForPane(GlogPane *pane) {
     RCPtr<GlogLayoutRectItem> item = GlogLayout::MakeRectItem({0, 0, 0, 0}, -1, 0, "");
@@ -50,7 +50,8 @@ void LayoutEngine::Append(GlogLayoutGroup &group, RCPtr<GlogLayoutItem> const &i
             return; // a group cannot lie in itself
     TakeOut(*item);
     auto &children = Rep(group).children;
-    auto position = index < 0 || index > static_cast<int>(children.size()) ? children.end() : children.begin() + index;
+    auto position =
+        index < 0 || index > static_cast<int>(children.size()) ? children.end() : children.begin() + index;
     children.insert(position, item);
     Rep(*item).parent = &group;
     Invalidate(group);
@@ -203,7 +204,8 @@ void LayoutEngine::PlaceGroup(GlogLayoutItem::Rep &group) {
         else if (rep.alignment == 2)
             side += room - width;
         position += along.Before(rep);
-        Place(*child, group.vertical ? MakeRect(side, position, width, length) : MakeRect(position, side, length, width));
+        Place(*child, group.vertical ? MakeRect(side, position, width, length)
+                                     : MakeRect(position, side, length, width));
         position += length + along.After(rep) + group.spacing;
     }
 }
@@ -237,7 +239,10 @@ void LayoutEngine::Settle(glogRec *record) {
         return;
     // Also when a pane throws while it is placed, the next change is settled again.
     struct Settling {
-        explicit Settling(Glog &glog_) : glog(glog_) { glog.settlingLayout = true; }
+        explicit Settling(Glog &glog_)
+            : glog(glog_) {
+            glog.settlingLayout = true;
+        }
         ~Settling() { glog.settlingLayout = false; }
         Glog &glog;
     } settling(glog);

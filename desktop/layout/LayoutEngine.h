@@ -7,8 +7,8 @@ class CompoundPane;
 class GlogPane;
 struct glogRec;
 
-// Sizes are settled bottom up, places top down. Lazy: a change only marks the glog; Settle does the work, before the next drawing or
-// the next question for a place.
+// Sizes are settled bottom up, places top down. Lazy: a change only marks the glog; Settle does the work,
+// before the next drawing or the next question for a place.
 class LayoutEngine {
 public:
     static GlogLayoutItem::Rep &Rep(GlogLayoutItem &item) { return *item.rep; }

@@ -1,19 +1,19 @@
 // What a layout item knows.
 #pragma once
+#include "host/GlogLayout.h"
 #include <string>
 #include <vector>
-#include "host/GlogLayout.h"
 
 class CompoundPane;
 class GlogPane;
 
-// Lengths are pixels. An item is the rectangle of a pane, a part of a pane (a sub-item), or a group of items; which of them the
-// pointers tell.
+// Lengths are pixels. An item is the rectangle of a pane, a part of a pane (a sub-item), or a group of items;
+// which of them the pointers tell.
 struct GlogLayoutItem::Rep {
-    GlogPane *pane = nullptr;           // whose rectangle or part this is; null once the pane is gone
-    bool isPart = false;                // a sub-item of `pane`
-    CompoundPane *owner = nullptr;      // of the outermost group of a pane
-    GlogLayoutItem *parent = nullptr;   // the group that holds the item
+    GlogPane *pane = nullptr;         // whose rectangle or part this is; null once the pane is gone
+    bool isPart = false;              // a sub-item of `pane`
+    CompoundPane *owner = nullptr;    // of the outermost group of a pane
+    GlogLayoutItem *parent = nullptr; // the group that holds the item
     bool isGroup = false;
 
     int id = -1;

@@ -1,8 +1,8 @@
 #include "desktop/observe/JsonLine.h"
+#include "desktop/resources/Utf.h"
 #include <cmath>
 #include <cstdio>
 #include <cstdlib>
-#include "desktop/resources/Utf.h"
 
 namespace {
 
@@ -28,7 +28,8 @@ void AppendEscaped(std::string &out, std::string const &utf8) {
         default:
             if (static_cast<unsigned char>(c) < 0x20) {
                 char code[8];
-                std::snprintf(code, sizeof code, "\\u%04x", static_cast<unsigned>(static_cast<unsigned char>(c)));
+                std::snprintf(code, sizeof code, "\\u%04x",
+                              static_cast<unsigned>(static_cast<unsigned char>(c)));
                 out += code;
             } else {
                 out += c;
@@ -38,7 +39,7 @@ void AppendEscaped(std::string &out, std::string const &utf8) {
     out += '"';
 }
 
-}
+} // namespace
 
 void JsonLine::Key(char const *key) {
     text += text.empty() ? '{' : ',';
@@ -86,8 +87,8 @@ JsonLine &JsonLine::Flag(char const *key, bool value) {
 
 JsonLine &JsonLine::Box(char const *key, Rect const &r) {
     Key(key);
-    text += '[' + std::to_string(r.top) + ',' + std::to_string(r.left) + ',' + std::to_string(r.bottom) + ',' +
-            std::to_string(r.right) + ']';
+    text += '[' + std::to_string(r.top) + ',' + std::to_string(r.left) + ',' + std::to_string(r.bottom) +
+            ',' + std::to_string(r.right) + ']';
     return *this;
 }
 

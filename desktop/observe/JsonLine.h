@@ -1,10 +1,11 @@
 // One line of JSON, built field by field.
 #pragma once
-#include <string>
 #include "host/Geometry.h"
 #include "host/UString.h"
+#include <string>
 
-// {"op":"Draw1Icon","family":1002}: fields in the order in which they are added. Strings are UTF-8 and are escaped.
+// {"op":"Draw1Icon","family":1002}: fields in the order in which they are added. Strings are UTF-8 and are
+// escaped.
 class JsonLine {
 public:
     // Each appends a field and answers the line.

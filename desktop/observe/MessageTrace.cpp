@@ -1,9 +1,9 @@
 #include "desktop/observe/MessageTrace.h"
+#include "host/GlogPane.h"
+#include "host/Services.h"
 #include <cstdlib>
 #include <cxxabi.h>
 #include <utility>
-#include "host/GlogPane.h"
-#include "host/Services.h"
 
 namespace {
 MessageTrace::Sink theSink;

@@ -1,9 +1,9 @@
 #include "desktop/observe/TreeDump.h"
-#include <vector>
 #include "desktop/observe/MessageTrace.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/PaneAccess.h"
 #include "host/CompoundPane.h"
+#include <vector>
 
 namespace {
 
@@ -21,7 +21,9 @@ std::string Joined(std::vector<std::string> const &entries, std::string const &i
 
 std::string PaneJson(GlogPane &pane, std::string const &indent) {
     JsonLine line;
-    line.Text("class", MessageTrace::ClassName(pane)).Integer("id", pane.GetID()).Box("box", pane.GetDrawRectangle());
+    line.Text("class", MessageTrace::ClassName(pane))
+        .Integer("id", pane.GetID())
+        .Box("box", pane.GetDrawRectangle());
     line.Flag("visible", PaneAccess::OwnVisibility(pane)).Flag("active", pane.IsActive());
     line.Flag("selected", pane.IsSelected());
     for (auto i = Describers().rbegin(); i != Describers().rend(); ++i)
@@ -36,7 +38,7 @@ std::string PaneJson(GlogPane &pane, std::string const &indent) {
     return line.Finish();
 }
 
-}
+} // namespace
 
 void TreeDump::AddDescriber(Describer describer) { Describers().push_back(std::move(describer)); }
 

@@ -31,7 +31,7 @@ public:
 DefaultFoundation theFoundation;
 DefaultInternal theInternal;
 
-}
+} // namespace
 
 VelaFoundationCallbackAPI *VelaFoundationCallbackAPI::gInstance = nullptr;
 InternalCallbackAPI *InternalCallbackAPI::gInstance = nullptr;

@@ -1,11 +1,11 @@
 #include "host/CompoundPane.h"
-#include <algorithm>
 #include "desktop/drawing/Region.h"
 #include "desktop/layout/LayoutEngine.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/PaneAccess.h"
 #include "desktop/panes/PaneEvents.h"
 #include "host/VelaDrawing.h"
+#include <algorithm>
 
 namespace {
 
@@ -15,7 +15,8 @@ Point ToContent(CompoundPane &pane, Point p) {
     return p;
 }
 
-// Calls an operation on every subpane. The list may change meanwhile: what was removed is not called, what was added may be.
+// Calls an operation on every subpane. The list may change meanwhile: what was removed is not called, what
+// was added may be.
 template <class Operation> void ForEach(std::vector<GlogPane *> const &subpanes, Operation operation) {
     std::vector<GlogPane *> const snapshot = subpanes;
     for (GlogPane *pane : snapshot)
@@ -30,9 +31,11 @@ GlogPane *TopmostAt(std::vector<GlogPane *> const &subpanes, Point p) {
     return nullptr;
 }
 
-}
+} // namespace
 
-CompoundPane::CompoundPane() : usesLayout(false), compoundRep(new CompoundRep) {}
+CompoundPane::CompoundPane()
+    : usesLayout(false)
+    , compoundRep(new CompoundRep) {}
 
 CompoundPane::~CompoundPane() {
     // A subpane's destructor takes it out of the list.
@@ -53,12 +56,14 @@ CompoundPane *CompoundPane::CompoundPaneInit(glogRec *glog_, short id) {
 // Subpanes
 
 GlogPane *CompoundPane::Get(short index) const {
-    return index >= 0 && index < NumSubpanes() ? compoundRep->subpanes[static_cast<std::size_t>(index)] : nullptr;
+    return index >= 0 && index < NumSubpanes() ? compoundRep->subpanes[static_cast<std::size_t>(index)]
+                                               : nullptr;
 }
 
 short CompoundPane::Find(GlogPane *pane) {
     auto found = std::find(compoundRep->subpanes.begin(), compoundRep->subpanes.end(), pane);
-    return found == compoundRep->subpanes.end() ? short(-1) : static_cast<short>(found - compoundRep->subpanes.begin());
+    return found == compoundRep->subpanes.end() ? short(-1)
+                                                : static_cast<short>(found - compoundRep->subpanes.begin());
 }
 
 short CompoundPane::NumSubpanes() const { return static_cast<short>(compoundRep->subpanes.size()); }
@@ -215,7 +220,9 @@ void CompoundPane::UpdateLayoutRect() { GlogPane::UpdateLayoutRect(); }
 // The places of the subpanes follow the box.
 bool CompoundPane::CanUpdateLayoutRect() const { return usesLayout; }
 
-bool CompoundPane::DoesLayoutNeedToBeUpdated() const { return usesLayout && GlogPane::DoesLayoutNeedToBeUpdated(); }
+bool CompoundPane::DoesLayoutNeedToBeUpdated() const {
+    return usesLayout && GlogPane::DoesLayoutNeedToBeUpdated();
+}
 
 void CompoundPane::LayoutIsNowInvalid() { GlogPane::LayoutIsNowInvalid(); }
 
@@ -250,7 +257,8 @@ void CompoundPane::DrawGuts(OSRgn *region) {
         content = *region;
         Region::Translate(content, shift.h, shift.v);
     }
-    ForEach(compoundRep->subpanes, [&](GlogPane &pane) { PaneAccess::Draw(pane, region ? &content : nullptr); });
+    ForEach(compoundRep->subpanes,
+            [&](GlogPane &pane) { PaneAccess::Draw(pane, region ? &content : nullptr); });
 }
 
 // Input
@@ -273,7 +281,8 @@ bool CompoundPane::DispatchCustomEvent(UIEvent *event) {
     PointedEvent *pointed = dynamic_cast<PointedEvent *>(event);
     std::vector<GlogPane *> const snapshot = compoundRep->subpanes;
     for (auto i = snapshot.rbegin(); i != snapshot.rend(); ++i) {
-        if (std::find(compoundRep->subpanes.begin(), compoundRep->subpanes.end(), *i) == compoundRep->subpanes.end())
+        if (std::find(compoundRep->subpanes.begin(), compoundRep->subpanes.end(), *i) ==
+            compoundRep->subpanes.end())
             continue;
         if (!PaneAccess::OwnVisibility(**i) || (pointed && !pointed->LiesIn(**i)))
             continue;

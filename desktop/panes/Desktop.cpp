@@ -1,5 +1,4 @@
 #include "desktop/Desktop.h"
-#include <stdexcept>
 #include "desktop/observe/DrawingTrace.h"
 #include "desktop/observe/MessageTrace.h"
 #include "desktop/observe/TreeDump.h"
@@ -9,6 +8,7 @@
 #include "desktop/resources/Resources.h"
 #include "desktop/windows/SdlWindowSystem.h"
 #include "host/TarnImage.h"
+#include <stdexcept>
 
 namespace {
 
@@ -20,7 +20,8 @@ DesktopOptions const &Checked(DesktopOptions const &options) {
     if (theDesktop)
         throw std::logic_error("a desktop is open already");
     if (options.scale != 0 && !(options.scale >= kSmallestScale && options.scale <= kLargestScale))
-        throw std::invalid_argument("the scale " + std::to_string(options.scale) + " is not between 0.5 and 4");
+        throw std::invalid_argument("the scale " + std::to_string(options.scale) +
+                                    " is not between 0.5 and 4");
     return options;
 }
 
@@ -31,7 +32,7 @@ void OpenResources(DesktopOptions const &options) {
     resources.SetLanguage(options.language);
 }
 
-}
+} // namespace
 
 Desktop::Desktop(DesktopOptions const &options)
     : Desktop(Checked(options), std::unique_ptr<WindowSystem>(new SdlWindowSystem(options.scale))) {}

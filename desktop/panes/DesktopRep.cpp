@@ -1,15 +1,18 @@
 #include "desktop/panes/DesktopRep.h"
-#include <algorithm>
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/HostCall.h"
+#include <algorithm>
 
 namespace {
 // A pane that damages itself whenever it is drawn must not keep the program from waiting.
 int const kMostUpdateRounds = 4;
-}
+} // namespace
 
-DesktopRep::DesktopRep(Desktop &desktop, DesktopOptions const &options_, std::unique_ptr<WindowSystem> windows_)
-    : options(options_), windows(std::move(windows_)), loop(new EventLoop(desktop, *windows)) {}
+DesktopRep::DesktopRep(Desktop &desktop, DesktopOptions const &options_,
+                       std::unique_ptr<WindowSystem> windows_)
+    : options(options_)
+    , windows(std::move(windows_))
+    , loop(new EventLoop(desktop, *windows)) {}
 
 DesktopRep::~DesktopRep() {}
 

@@ -1,11 +1,11 @@
 // What an open desktop consists of.
 #pragma once
-#include <memory>
-#include <string>
-#include <vector>
 #include "desktop/Desktop.h"
 #include "desktop/windows/EventLoop.h"
 #include "desktop/windows/WindowSystem.h"
+#include <memory>
+#include <string>
+#include <vector>
 
 class Glog;
 class PlatformWindow;
@@ -22,7 +22,7 @@ public:
     Glog *Front() const;                  // shown last of those that are visible; null without one
     bool AnyVisible() const { return Front() != nullptr; }
     void CameToFront(Glog *);
-    void Dispose(Glog *);                 // at once, or when no event is being handled any more
+    void Dispose(Glog *); // at once, or when no event is being handled any more
     void DeleteDisposed();
     void CloseGlogs(); // all of them, before the desktop goes
     void UpdateAll();

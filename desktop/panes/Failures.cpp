@@ -1,9 +1,9 @@
-#include <cstdio>
-#include <cstdlib>
-#include <string>
 #include "desktop/AssertionHandler.h"
 #include "host/AssertionFailed.h"
 #include "host/TarnError.h"
+#include <cstdio>
+#include <cstdlib>
+#include <string>
 
 namespace {
 
@@ -16,7 +16,7 @@ AssertionHandler theHandler = nullptr;
     std::abort();
 }
 
-}
+} // namespace
 
 void SetAssertionHandler(AssertionHandler handler) { theHandler = handler; }
 
@@ -24,9 +24,10 @@ void boost::assertion_failed(char const *expression, char const *function, char 
     Fail(std::string(expression) + " in " + function + ", " + file + ":" + std::to_string(line));
 }
 
-void boost::assertion_failed_msg(char const *expression, char const *message, char const *function, char const *file,
-                                 long line) {
-    Fail(std::string(expression) + " (" + message + ") in " + function + ", " + file + ":" + std::to_string(line));
+void boost::assertion_failed_msg(char const *expression, char const *message, char const *function,
+                                 char const *file, long line) {
+    Fail(std::string(expression) + " (" + message + ") in " + function + ", " + file + ":" +
+         std::to_string(line));
 }
 
 void FailMemFullError() { throw TarnError(); }

@@ -1,5 +1,4 @@
 #include "desktop/panes/Glog.h"
-#include <algorithm>
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/ThemeColors.h"
 #include "desktop/layout/LayoutEngine.h"
@@ -12,8 +11,9 @@
 #include "desktop/windows/HelpTagWindow.h"
 #include "host/CompoundPane.h"
 #include "host/NamedColors.h"
-#include "host/Services.h"
 #include "host/PortSavers.h"
+#include "host/Services.h"
+#include <algorithm>
 
 namespace {
 
@@ -44,8 +44,8 @@ EventRecordAdapter RecordOf(InputEvent const &event, unsigned short what) {
     return record;
 }
 
-// The low byte is the ASCII character where there is one, else a named key; the next sixteen bits are the key's code. Other characters
-// leave the byte 0, since their low bytes would pass for keys.
+// The low byte is the ASCII character where there is one, else a named key; the next sixteen bits are the
+// key's code. Other characters leave the byte 0, since their low bytes would pass for keys.
 unsigned long long KeyMessage(InputEvent const &event) {
     std::u16string_view const units = Utf::View(event.text);
     unsigned long long character = event.key < 0x80 ? static_cast<unsigned long long>(event.key) : 0;
@@ -54,11 +54,13 @@ unsigned long long KeyMessage(InputEvent const &event) {
     return character | static_cast<unsigned long long>(event.key) << 8;
 }
 
-}
+} // namespace
 
 Glog::Glog(Desktop &desktop_, GlogOptions const &options_)
-    : desktop(desktop_), options(options_), width(std::clamp(options_.width, 1, kMaxSide)),
-      height(std::clamp(options_.height, 1, kMaxSide)) {
+    : desktop(desktop_)
+    , options(options_)
+    , width(std::clamp(options_.width, 1, kMaxSide))
+    , height(std::clamp(options_.height, 1, kMaxSide)) {
     port.SetExtent(width, height);
     port.SetScreenPlace([this] { return window ? window->ScreenPlace() : Point{0, 0}; });
     // Panes measure text while they are being made, before anything is prepared or drawn.
@@ -84,7 +86,9 @@ void Glog::Tell(void (TarnOSWindow::OSWindow_PlatformWindowListener::*what)(Tarn
     typedef TarnOSWindow::OSWindow_PlatformWindowListener Listener;
     class WindowMsg : public DependentCastMessenger<Listener> {
     public:
-        WindowMsg(Glog &glog_, void (Listener::*what_)(OSWindow &)) : glog(glog_), what(what_) {}
+        WindowMsg(Glog &glog_, void (Listener::*what_)(OSWindow &))
+            : glog(glog_)
+            , what(what_) {}
         void BroadcastChange(Listener *listener) override { (listener->*what)(glog); }
 
     private:
@@ -104,7 +108,9 @@ void Glog::AddItem(GlogPane *pane) {
     NotePanesAdded();
 }
 
-void Glog::RemoveItem(GlogPane *pane) { items.erase(std::remove(items.begin(), items.end(), pane), items.end()); }
+void Glog::RemoveItem(GlogPane *pane) {
+    items.erase(std::remove(items.begin(), items.end(), pane), items.end());
+}
 
 void Glog::PaneGone(GlogPane *pane) {
     if (current == pane)
@@ -254,9 +260,7 @@ void Glog::SetScale(DeviceScale scale_) {
 
 // Drawing
 
-void Glog::DamageAll() {
-    DamageWindowRect({0, 0, Coordinate16(height), Coordinate16(width)});
-}
+void Glog::DamageAll() { DamageWindowRect({0, 0, Coordinate16(height), Coordinate16(width)}); }
 
 void Glog::DamageWindowRect(Rect const &r) {
     OSRgn region(r);
@@ -286,9 +290,13 @@ void Glog::Update() {
 bool Glog::NeedsUpdate() const { return shown && (layoutInvalid || !Region::IsEmpty(port.GetDamage())); }
 
 void Glog::DrawDamage(OSRgn const &region) {
-    // The region is the glog's for the time of the update. When a pane throws, what it left undrawn stays damaged.
+    // The region is the glog's for the time of the update. When a pane throws, what it left undrawn stays
+    // damaged.
     struct Updating {
-        Updating(Glog &glog_, OSRgn const &region_) : glog(glog_) { glog.updateRegion = &region_; }
+        Updating(Glog &glog_, OSRgn const &region_)
+            : glog(glog_) {
+            glog.updateRegion = &region_;
+        }
         ~Updating() {
             if (!done)
                 glog.port.DamageWindow(*glog.updateRegion);
@@ -310,7 +318,9 @@ void Glog::DrawDamage(OSRgn const &region) {
     updating.done = true;
 }
 
-void Glog::Present(std::vector<DeviceRect> const &rects) { window->Present(*surface, rects.data(), rects.size()); }
+void Glog::Present(std::vector<DeviceRect> const &rects) {
+    window->Present(*surface, rects.data(), rects.size());
+}
 
 void Glog::PresentAll() {
     if (shown && surface)
@@ -347,7 +357,12 @@ void Glog::Click(InputEvent const &event) {
         return;
     // A nested loop may handle further clicks in this glog; each has its own hit.
     struct OwnHit {
-        explicit OwnHit(Glog &glog_) : glog(glog_), item(glog.hitItem), noted(glog.hitNoted) { glog.hitNoted = false; }
+        explicit OwnHit(Glog &glog_)
+            : glog(glog_)
+            , item(glog.hitItem)
+            , noted(glog.hitNoted) {
+            glog.hitNoted = false;
+        }
         ~OwnHit() {
             glog.hitItem = item;
             glog.hitNoted = noted;
@@ -368,7 +383,8 @@ void Glog::Click(InputEvent const &event) {
 }
 
 bool Glog::DispatchKey(EventRecordAdapter &record, InputEvent const &event) {
-    if (event.key == KeyCodes::kTab && !(event.modifiers & (Modifiers::kCommand | Modifiers::kControl | Modifiers::kOption)))
+    if (event.key == KeyCodes::kTab &&
+        !(event.modifiers & (Modifiers::kCommand | Modifiers::kControl | Modifiers::kOption)))
         return OfferTab(event.modifiers & Modifiers::kShift ? -1 : 1);
     if (!current)
         return false;
@@ -475,7 +491,10 @@ void Glog::Idle() {
     if (!active || !shown || idling)
         return; // a pane that waits in its Idle is not called again meanwhile
     struct Idling {
-        explicit Idling(bool &idling_) : idling(idling_) { idling = true; }
+        explicit Idling(bool &idling_)
+            : idling(idling_) {
+            idling = true;
+        }
         ~Idling() { idling = false; }
         bool &idling;
     } const guard(idling);

@@ -1,9 +1,5 @@
 // A window with panes in it.
 #pragma once
-#include <map>
-#include <memory>
-#include <string>
-#include <vector>
 #include "desktop/Desktop.h"
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/Surface.h"
@@ -11,6 +7,10 @@
 #include "desktop/windows/PlatformWindow.h"
 #include "host/GlogStyleSheet.h"
 #include "host/glogRec.h"
+#include <map>
+#include <memory>
+#include <string>
+#include <vector>
 
 class EventRecordAdapter;
 class UIEvent;
@@ -36,9 +36,9 @@ public:
 
     // Panes
     std::vector<GlogPane *> const &Items() const { return items; }
-    void AddItem(GlogPane *);          // at the top level; the glog owns it
-    void RemoveItem(GlogPane *);       // the caller owns it
-    void PaneGone(GlogPane *);         // forgets every mention of the pane
+    void AddItem(GlogPane *);                            // at the top level; the glog owns it
+    void RemoveItem(GlogPane *);                         // the caller owns it
+    void PaneGone(GlogPane *);                           // forgets every mention of the pane
     void MakeCurrent(GlogPane *pane) { current = pane; } // without messages
     // Gives the place of an item that is still to be made.
     void DescribeItem(int id, Rect const &box) { described[id] = box; }
@@ -65,8 +65,10 @@ public:
     void Update();
     void DamageAll();
     void DamageWindowRect(Rect const &);
-    bool NeedsUpdate() const;          // something visible waits to be redrawn
-    OSRgn const *UpdateRegion() const { return updateRegion; } // in window coordinates; null outside an update
+    bool NeedsUpdate() const; // something visible waits to be redrawn
+    OSRgn const *UpdateRegion() const {
+        return updateRegion;
+    } // in window coordinates; null outside an update
     void PresentAll();
     void SetScale(DeviceScale);
 

@@ -13,7 +13,10 @@
 #include "host/Services.h"
 #include "host/VelaDrawing.h"
 
-GlogPane::GlogPane() : glog(nullptr), container(nullptr), rep(new Rep) {}
+GlogPane::GlogPane()
+    : glog(nullptr)
+    , container(nullptr)
+    , rep(new Rep) {}
 
 GlogPane::~GlogPane() {
     if (container)
@@ -193,7 +196,8 @@ void GlogPane::UpdateLayoutRect() {
     SetBox(&place);
 }
 
-// A box that is set from outside changes the layout of what the pane contains, or of the container that measures it.
+// A box that is set from outside changes the layout of what the pane contains, or of the container that
+// measures it.
 bool GlogPane::CanUpdateLayoutRect() const { return false; }
 
 bool GlogPane::DoesLayoutNeedToBeUpdated() const { return glog && Glog::From(glog).layoutInvalid; }

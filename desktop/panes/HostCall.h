@@ -1,8 +1,8 @@
 // While the host is inside a pane.
 #pragma once
 
-// Stands on the stack wherever the host calls panes, chores or handlers, so that nothing is deleted that such a call came from. What is
-// disposed of meanwhile goes when the main loop has come back to itself.
+// Stands on the stack wherever the host calls panes, chores or handlers, so that nothing is deleted that such
+// a call came from. What is disposed of meanwhile goes when the main loop has come back to itself.
 class HostCall {
 public:
     HostCall() { ++depth; }

@@ -1,9 +1,9 @@
 #include "desktop/panes/PaneAccess.h"
-#include <algorithm>
 #include "desktop/drawing/Region.h"
 #include "desktop/layout/LayoutEngine.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/PortKeeper.h"
+#include <algorithm>
 
 namespace {
 
@@ -18,7 +18,7 @@ Rect Common(Rect const &a, Rect const &b) {
     return r.bottom <= r.top || r.right <= r.left ? Rect{0, 0, 0, 0} : r;
 }
 
-}
+} // namespace
 
 Point PaneAccess::Origin(GlogPane &pane) {
     Point origin{0, 0};
@@ -59,10 +59,12 @@ void PaneAccess::MoveTo(GlogPane &pane, Rect const &box) {
 void PaneAccess::PlacedByLayout(GlogPane &pane) {
     Rect const place = LayoutEngine::Rep(*pane.rep->layoutItem).place;
     Rect const &old = pane.rep->box;
-    if (old.top == place.top && old.left == place.left && old.bottom == place.bottom && old.right == place.right)
+    if (old.top == place.top && old.left == place.left && old.bottom == place.bottom &&
+        old.right == place.right)
         return;
     Glog &glog = Glog::From(pane.glog);
-    // While the engine works the layout's rectangle is new already; the box still tells where the pane was drawn.
+    // While the engine works the layout's rectangle is new already; the box still tells where the pane was
+    // drawn.
     if (pane.GetVisibility())
         glog.DamageWindowRect(Moved(old, Origin(pane)));
     pane.UpdateLayoutRect();

@@ -27,9 +27,11 @@ public:
     static void ConfirmChanges(GlogPane &pane) { pane.ConfirmChangesOnClickAway(); }
     static void InvalidateLayout(GlogPane &pane) { pane.LayoutIsNowInvalid(); }
 
-    // Draws a visible pane that meets the region (in the coordinates of the pane; null: all of it), with clip and port state of its own.
+    // Draws a visible pane that meets the region (in the coordinates of the pane; null: all of it), with clip
+    // and port state of its own.
     static void Draw(GlogPane &, OSRgn *region);
-    // Gives the pane the rectangle that its layout item was placed at; both the old and the new one are damaged when they differ.
+    // Gives the pane the rectangle that its layout item was placed at; both the old and the new one are
+    // damaged when they differ.
     static void PlacedByLayout(GlogPane &);
     static void MoveTo(GlogPane &, Rect const &box);
 

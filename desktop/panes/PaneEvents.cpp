@@ -1,8 +1,8 @@
 #include "desktop/panes/PaneEvents.h"
-#include <boost/make_shared.hpp>
 #include "desktop/observe/MessageTrace.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/PaneAccess.h"
+#include <boost/make_shared.hpp>
 
 namespace {
 
@@ -13,20 +13,22 @@ template <class Operation> int Reported(GlogPane &pane, char const *name, bool i
     std::string const className = MessageTrace::On() ? MessageTrace::ClassName(pane) : std::string();
     int const result = operation();
     if (!className.empty())
-        MessageTrace::Write(MessageTrace::Begin(className, id).Text("message", std::string(name)).Integer("result", result));
+        MessageTrace::Write(
+            MessageTrace::Begin(className, id).Text("message", std::string(name)).Integer("result", result));
     if (isHit && glog && result != 0)
         Glog::From(glog).NoteHit(id);
     return result;
 }
 
-}
+} // namespace
 
 int PaneEvents::Click(GlogPane &pane, EventRecordAdapter &event) {
     return Reported(pane, "HandleClick", true, [&] { return PaneAccess::Click(pane, &event); });
 }
 
 int PaneEvents::SecondaryClick(GlogPane &pane, EventRecordAdapter &event) {
-    return Reported(pane, "HandleSecondaryButtonClick", true, [&] { return PaneAccess::SecondaryClick(pane, &event); });
+    return Reported(pane, "HandleSecondaryButtonClick", true,
+                    [&] { return PaneAccess::SecondaryClick(pane, &event); });
 }
 
 int PaneEvents::Key(GlogPane &pane, EventRecordAdapter &event) {
@@ -43,7 +45,8 @@ bool PointedEvent::LiesIn(GlogPane &pane) const {
 }
 
 WheelEvent::WheelEvent(Point window, float delta, int axis)
-    : PointedEvent(window), params(boost::make_shared<MouseWheelParams>()) {
+    : PointedEvent(window)
+    , params(boost::make_shared<MouseWheelParams>()) {
     params->delta = delta;
     params->axis = axis;
 }

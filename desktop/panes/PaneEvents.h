@@ -6,17 +6,19 @@
 
 // Hands events to a pane and reports what it answered to those who watch.
 namespace PaneEvents {
-// A non-zero result is noted at the glog as a hit of the innermost pane that gave it. Either call may delete the pane.
+// A non-zero result is noted at the glog as a hit of the innermost pane that gave it. Either call may delete
+// the pane.
 int Click(GlogPane &, EventRecordAdapter &);
 int SecondaryClick(GlogPane &, EventRecordAdapter &);
 int Key(GlogPane &, EventRecordAdapter &);
 int Tab(GlogPane &, char direction);
-}
+} // namespace PaneEvents
 
 // A custom event that happened at a place; containers offer it to the subpanes that lie there.
 class PointedEvent : public UIEvent {
 public:
-    explicit PointedEvent(Point window_) : window(window_) {}
+    explicit PointedEvent(Point window_)
+        : window(window_) {}
     bool LiesIn(GlogPane &) const;
 
 private:

@@ -1,9 +1,9 @@
 // The host's own fields of a pane.
 #pragma once
-#include <memory>
-#include <vector>
 #include "host/CompoundPane.h"
 #include "host/GlogPane.h"
+#include <memory>
+#include <vector>
 
 struct GlogPane::Rep {
     int id = 0;

@@ -1,10 +1,14 @@
 #include "desktop/panes/PortKeeper.h"
 
-PortKeeper::PortKeeper() : current(DrawingPort::CurrentPort()), kept(DrawingPort::CurrentPort()) {
+PortKeeper::PortKeeper()
+    : current(DrawingPort::CurrentPort())
+    , kept(DrawingPort::CurrentPort()) {
     Keep(DrawingPort::CurrentPort());
 }
 
-PortKeeper::PortKeeper(DrawingPort &alsoKept) : current(DrawingPort::CurrentPort()), kept(&alsoKept) {
+PortKeeper::PortKeeper(DrawingPort &alsoKept)
+    : current(DrawingPort::CurrentPort())
+    , kept(&alsoKept) {
     Keep(&alsoKept);
 }
 

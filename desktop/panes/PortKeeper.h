@@ -2,8 +2,8 @@
 #pragma once
 #include "desktop/drawing/DrawingPort.h"
 
-// Puts the current port back, with its origin, boundary, clip and state: whatever ran meanwhile may have prepared other panes, thrown,
-// or closed the very window.
+// Puts the current port back, with its origin, boundary, clip and state: whatever ran meanwhile may have
+// prepared other panes, thrown, or closed the very window.
 class PortKeeper {
 public:
     PortKeeper();

@@ -1,9 +1,9 @@
 #include "desktop/SimulatedDesktop.h"
-#include <cmath>
-#include <fstream>
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/windows/SimulatedWindowSystem.h"
+#include <cmath>
+#include <fstream>
 
 namespace {
 
@@ -44,7 +44,7 @@ void CarryOut(Desktop &desktop, ScriptStep const &step, PlatformWindow *window) 
     }
 }
 
-}
+} // namespace
 
 SimulatedDesktop::SimulatedDesktop(DesktopOptions const &options)
     : Desktop(options, std::unique_ptr<WindowSystem>(new SimulatedWindowSystem(options.scale))) {

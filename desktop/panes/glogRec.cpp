@@ -13,7 +13,8 @@ short GetGlogWidth(glogRec *glog) { return static_cast<short>(Glog::From(glog).W
 
 short GetGlogHeight(glogRec *glog) { return static_cast<short>(Glog::From(glog).Height()); }
 
-// Panes that were given numbers go by them; where none has the number, the place in the order of creation counts.
+// Panes that were given numbers go by them; where none has the number, the place in the order of creation
+// counts.
 GlogPane *GetGlogItem(glogRec *glog, short id) {
     if (id < 1)
         return nullptr;

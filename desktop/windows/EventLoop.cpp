@@ -1,11 +1,11 @@
 #include "desktop/windows/EventLoop.h"
-#include <algorithm>
 #include "desktop/Desktop.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/HostCall.h"
 #include "desktop/panes/PortKeeper.h"
 #include "desktop/windows/HelpTagWindow.h"
+#include <algorithm>
 
 namespace {
 
@@ -18,10 +18,12 @@ bool IsRelease(InputEvent const &event) { return event.kind == InputEvent::kMous
 
 bool Drags(InputEvent const &event) { return event.kind == InputEvent::kMouseMove || IsRelease(event); }
 
-}
+} // namespace
 
 EventLoop::EventLoop(Desktop &desktop_, WindowSystem &windows_)
-    : desktop(desktop_), windows(windows_), helpTags(new HelpTagWindow(windows_)) {
+    : desktop(desktop_)
+    , windows(windows_)
+    , helpTags(new HelpTagWindow(windows_)) {
     theLoop = this;
 }
 
@@ -189,7 +191,8 @@ bool EventLoop::HandleWindowEvent(InputEvent const &event) {
 
 void EventLoop::HandlePress(Glog &glog, InputEvent const &event) {
     helpTags->Hide();
-    glog.SetActivatedByMouseDown(event.window == activatedWindow && event.time - activatedAt < kActivatingPressWindow);
+    glog.SetActivatedByMouseDown(event.window == activatedWindow &&
+                                 event.time - activatedAt < kActivatingPressWindow);
     activatedAt = -1000;
     lastPressClicks = event.clicks;
     if (event.button == 1) {

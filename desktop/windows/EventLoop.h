@@ -1,20 +1,21 @@
 // Takes events from the window system and gives them to glogs.
 #pragma once
-#include <deque>
-#include <memory>
-#include <vector>
 #include "desktop/windows/IdleChores.h"
 #include "desktop/windows/InputEvent.h"
 #include "desktop/windows/WindowSystem.h"
 #include "host/MouseTask.h"
+#include <deque>
+#include <memory>
+#include <vector>
 
 class Desktop;
 class DrawingPort;
 class Glog;
 class HelpTagWindow;
 
-// One for the life of the desktop. The main loop and every nested one wait here: a wait blocks on the window system's queue, keeps
-// all windows drawn, and runs the chores that come due. Events that a nested loop has no use for wait for the main loop.
+// One for the life of the desktop. The main loop and every nested one wait here: a wait blocks on the window
+// system's queue, keeps all windows drawn, and runs the chores that come due. Events that a nested loop has
+// no use for wait for the main loop.
 class EventLoop {
 public:
     EventLoop(Desktop &, WindowSystem &);
@@ -22,7 +23,8 @@ public:
     static EventLoop &Instance(); // of the open desktop
     static EventLoop *Open();     // null without one
 
-    // Handles events until `seconds` have passed (negative: until the loop is told to quit). False once it was.
+    // Handles events until `seconds` have passed (negative: until the loop is told to quit). False once it
+    // was.
     bool Run(double seconds);
     void Quit(int status);
     void Restart() { quitting = false; }
@@ -32,7 +34,8 @@ public:
     // Tracking. Points are in the window of the press, in window coordinates.
     bool IsTracking() const { return heldWindow != nullptr; }
     PlatformWindow *HeldWindow() const { return heldWindow; }
-    // Blocks until the pointer has moved or the button is up; true while it is down. A negative limit is none.
+    // Blocks until the pointer has moved or the button is up; true while it is down. A negative limit is
+    // none.
     bool NextDragPoint(double limit, Point &where, double &when, bool &timedOut);
     bool ButtonStillDown();
     PlatformWindow *WindowOf(DrawingPort &) const; // null for a port without window
@@ -54,7 +57,8 @@ private:
     bool MainLoopIsOver(double deadline) const;
     // Takes one event, or none when the time is over. Draws what is damaged before it blocks.
     bool Take(InputEvent &, double deadline, WindowSystem::Waiter, char const *what);
-    // In a nested loop: window events are handled, pointer events go to `pointer`, everything else waits for the main loop.
+    // In a nested loop: window events are handled, pointer events go to `pointer`, everything else waits for
+    // the main loop.
     void Sort(InputEvent const &);
     bool HandleWindowEvent(InputEvent const &);
     void Handle(InputEvent const &);

@@ -1,12 +1,12 @@
 #include "desktop/windows/EventScript.h"
+#include "desktop/SimulatedDesktop.h"
 #include <algorithm>
 #include <cmath>
 #include <cstdlib>
-#include "desktop/SimulatedDesktop.h"
 
 namespace {
 
-int const kFarthest = 32000;       // pixels
+int const kFarthest = 32000; // pixels
 double const kMostNotches = 1000;
 double const kLongestWait = 86400; // a day
 
@@ -15,11 +15,11 @@ struct NamedKey {
     int key;
 };
 NamedKey const kNamedKeys[] = {
-    {"Return", KeyCodes::kReturn},   {"Enter", KeyCodes::kEnter},       {"Escape", KeyCodes::kEscape},
-    {"Tab", KeyCodes::kTab},         {"Space", KeyCodes::kSpace},       {"Backspace", KeyCodes::kBackspace},
-    {"Delete", KeyCodes::kDelete},   {"Left", KeyCodes::kLeft},         {"Right", KeyCodes::kRight},
-    {"Up", KeyCodes::kUp},           {"Down", KeyCodes::kDown},         {"Home", KeyCodes::kHome},
-    {"End", KeyCodes::kEnd},         {"PageUp", KeyCodes::kPageUp},     {"PageDown", KeyCodes::kPageDown},
+    {"Return", KeyCodes::kReturn}, {"Enter", KeyCodes::kEnter},   {"Escape", KeyCodes::kEscape},
+    {"Tab", KeyCodes::kTab},       {"Space", KeyCodes::kSpace},   {"Backspace", KeyCodes::kBackspace},
+    {"Delete", KeyCodes::kDelete}, {"Left", KeyCodes::kLeft},     {"Right", KeyCodes::kRight},
+    {"Up", KeyCodes::kUp},         {"Down", KeyCodes::kDown},     {"Home", KeyCodes::kHome},
+    {"End", KeyCodes::kEnd},       {"PageUp", KeyCodes::kPageUp}, {"PageDown", KeyCodes::kPageDown},
     {"Help", KeyCodes::kHelp},
 };
 int const kFunctionKeys = 12;
@@ -38,7 +38,9 @@ NamedModifier const kNamedModifiers[] = {
 // Reads one line word by word.
 class LineReader {
 public:
-    LineReader(std::string const &line_, std::string const &source_) : line(line_), source(source_) {}
+    LineReader(std::string const &line_, std::string const &source_)
+        : line(line_)
+        , source(source_) {}
 
     [[noreturn]] void Fail(std::string const &what) const { throw ScriptError(source + ": " + what); }
 
@@ -113,7 +115,7 @@ public:
         if (sub)
             second = std::strtol(end + 1, &end, 10);
         bool const empty = end == word.c_str() || (sub && word.back() == '/');
-    if (empty || *end != '\0' || first < 0 || first > 32767 || second < 0 || second > 32767)
+        if (empty || *end != '\0' || first < 0 || first > 32767 || second < 0 || second > 32767)
             Fail("expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"" + word + "\"");
         step.menu = sub ? static_cast<int>(first) : 0;
         step.item = static_cast<int>(sub ? second : first);
@@ -209,7 +211,7 @@ ScriptStep ReadStep(LineReader &reader, std::string const &source) {
     reader.Fail("there is no step \"" + word + "\"");
 }
 
-}
+} // namespace
 
 int EventScript::KeyByName(std::string const &name) {
     for (NamedKey const &known : kNamedKeys)

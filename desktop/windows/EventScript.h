@@ -1,8 +1,8 @@
 // Scripts of events for the simulated desktop.
 #pragma once
+#include "desktop/windows/InputEvent.h"
 #include <string>
 #include <vector>
-#include "desktop/windows/InputEvent.h"
 
 // One step of a script. Which fields count, the kind tells.
 struct ScriptStep {
@@ -25,15 +25,15 @@ struct ScriptStep {
         kDump
     };
     Kind kind = kWait;
-    int h = 0, v = 0;                  // place, or width and height
+    int h = 0, v = 0; // place, or width and height
     double wheelH = 0, wheelV = 0;
     unsigned short modifiers = 0;
     int key = 0;
     double seconds = 0;
     bool on = true;
-    int menu = 0, item = 0;            // `item` 0: dismissed; `menu` 0: the menu itself
-    std::string text;                  // typed, or a file's path
-    std::string source;                // "name:line" for messages
+    int menu = 0, item = 0; // `item` 0: dismissed; `menu` 0: the menu itself
+    std::string text;       // typed, or a file's path
+    std::string source;     // "name:line" for messages
 };
 
 namespace EventScript {
@@ -41,4 +41,4 @@ namespace EventScript {
 std::vector<ScriptStep> Parse(std::string const &steps, std::string const &name);
 // The code of a key by its name in scripts ("Return", "a"); KeyCodes::kNone for an unknown one.
 int KeyByName(std::string const &name);
-}
+} // namespace EventScript

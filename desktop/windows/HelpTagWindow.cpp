@@ -1,6 +1,4 @@
 #include "desktop/windows/HelpTagWindow.h"
-#include <algorithm>
-#include <stdexcept>
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/ThemeColors.h"
 #include "desktop/panes/Glog.h"
@@ -10,6 +8,8 @@
 #include "host/CompoundPane.h"
 #include "host/TextSettings.h"
 #include "host/VelaDrawing.h"
+#include <algorithm>
+#include <stdexcept>
 
 namespace {
 
@@ -21,13 +21,14 @@ int const kWidest = 360;
 double const kPaneDelay = 0.5; // of tags that name no delay
 
 Rect Moved(Rect const &r, Point by) {
-    return {static_cast<short>(r.top + by.v), static_cast<short>(r.left + by.h), static_cast<short>(r.bottom + by.v),
-            static_cast<short>(r.right + by.h)};
+    return {static_cast<short>(r.top + by.v), static_cast<short>(r.left + by.h),
+            static_cast<short>(r.bottom + by.v), static_cast<short>(r.right + by.h)};
 }
 
-}
+} // namespace
 
-HelpTagWindow::HelpTagWindow(WindowSystem &windows_) : windows(windows_) {}
+HelpTagWindow::HelpTagWindow(WindowSystem &windows_)
+    : windows(windows_) {}
 
 HelpTagWindow::~HelpTagWindow() { Hide(); }
 
@@ -125,11 +126,12 @@ Rect HelpTagWindow::ChoosePlace(int width, int height) const {
 
 void HelpTagWindow::Show() {
     UString const text = wanted.text;
-    UpdateTextLayout(layout, text, kFont, TextSettings::kAlignLeft, TextSettings::kTruncateNone, 1, 0, 0, 0, 0.0f, 1.0f,
-                     1.0f);
+    UpdateTextLayout(layout, text, kFont, TextSettings::kAlignLeft, TextSettings::kTruncateNone, 1, 0, 0, 0,
+                     0.0f, 1.0f, 1.0f);
     int const textWidth = static_cast<int>(layout.GetWidth());
     int const width = std::min(textWidth + 2 * kPadH, kWidest);
-    // Lines break at words and are not filled to the end, so that some room for one more is kept from the second line on.
+    // Lines break at words and are not filled to the end, so that some room for one more is kept from the
+    // second line on.
     int const room = kWidest - 2 * kPadH;
     int const lines = textWidth <= room ? 1 : (textWidth + textWidth / 8) / room + 1;
     place = ChoosePlace(width, lines * kLineHeight + 2 * kPadV);
@@ -165,6 +167,7 @@ void HelpTagWindow::Draw() {
     Rect inside = all;
     VelaDrawing::InsetRect(&inside, kPadH, kPadV);
     VelaDrawing::RGBForeColor(ThemeColors::kTooltipTextColor);
-    DrawTextLayoutInRect(layout, wanted.text, inside, kFont, TextSettings::kAlignLeft, TextSettings::kTruncateNone,
-                         1, inside.bottom - inside.top > kLineHeight, 0, 0, 0.0f, 1.0f, 1.0f);
+    DrawTextLayoutInRect(layout, wanted.text, inside, kFont, TextSettings::kAlignLeft,
+                         TextSettings::kTruncateNone, 1, inside.bottom - inside.top > kLineHeight, 0, 0, 0.0f,
+                         1.0f, 1.0f);
 }

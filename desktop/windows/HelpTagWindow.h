@@ -1,16 +1,16 @@
 // The tool tip that shows help tags.
 #pragma once
-#include <memory>
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/Surface.h"
 #include "desktop/windows/WindowSystem.h"
 #include "host/GlogPane.h"
 #include "host/TextLayout.h"
+#include <memory>
 
 class Glog;
 
-// Appears when the pointer has rested on a part with a help tag for the tag's delay; goes when the pointer leaves the part, and at any
-// click, key, turn of the wheel or change of activation.
+// Appears when the pointer has rested on a part with a help tag for the tag's delay; goes when the pointer
+// leaves the part, and at any click, key, turn of the wheel or change of activation.
 class HelpTagWindow {
 public:
     explicit HelpTagWindow(WindowSystem &);

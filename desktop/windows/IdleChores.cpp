@@ -1,7 +1,7 @@
 #include "desktop/windows/IdleChores.h"
-#include <algorithm>
 #include "desktop/windows/EventLoop.h"
 #include "host/CIdleChore.h"
+#include <algorithm>
 
 namespace {
 double const kSecondsPerTick = 1.0 / 60.0; // an interval counts ticks
@@ -15,8 +15,9 @@ void IdleChores::Assign(CIdleChore *chore, double now) {
 }
 
 void IdleChores::Cancel(CIdleChore *chore) {
-    entries.erase(std::remove_if(entries.begin(), entries.end(), [=](Entry const &e) { return e.chore == chore; }),
-                  entries.end());
+    entries.erase(
+        std::remove_if(entries.begin(), entries.end(), [=](Entry const &e) { return e.chore == chore; }),
+        entries.end());
 }
 
 void IdleChores::Run(double now) {
@@ -32,7 +33,11 @@ void IdleChores::Run(double now) {
             continue;
         // A chore that waits in its DoIdle is not run again meanwhile; it may also go, or be assigned anew.
         struct Running {
-            Running(IdleChores &chores_, CIdleChore *chore_) : chores(chores_), chore(chore_) { Set(true); }
+            Running(IdleChores &chores_, CIdleChore *chore_)
+                : chores(chores_)
+                , chore(chore_) {
+                Set(true);
+            }
             ~Running() { Set(false); }
             void Set(bool on) {
                 if (Entry *entry = chores.Find(chore))
@@ -64,7 +69,8 @@ double IdleChores::UntilNext(double now) const {
 }
 
 CIdleChore::CIdleChore(long long interval_, UseInitialDelay useInitialDelay_)
-    : interval(interval_), useInitialDelay(useInitialDelay_) {}
+    : interval(interval_)
+    , useInitialDelay(useInitialDelay_) {}
 
 CIdleChore::~CIdleChore() { Cancel(); }
 

@@ -9,7 +9,8 @@ class IdleChores {
 public:
     void Assign(CIdleChore *, double now);
     void Cancel(CIdleChore *);
-    // Runs what is due: chores without interval at each call, the others when their time has come. A chore may cancel itself or others.
+    // Runs what is due: chores without interval at each call, the others when their time has come. A chore
+    // may cancel itself or others.
     void Run(double now);
     // Seconds until the next chore with an interval; negative when there is none.
     double UntilNext(double now) const;

@@ -1,8 +1,8 @@
 // Key codes and modifier bits.
 #pragma once
 
-// A key's code is the lower-case character it types without modifiers, or one of these. The low values are the character codes that
-// panes compare with.
+// A key's code is the lower-case character it types without modifiers, or one of these. The low values are
+// the character codes that panes compare with.
 namespace KeyCodes {
 enum Code {
     kNone = 0,

@@ -5,7 +5,10 @@ namespace {
 double const kAutoScrollSeconds = 1.0 / 20.0;
 }
 
-MouseTask::MouseTask(int) : startPoint{0, 0}, sleepTime(-1), trackingResult(MouseTracking::Result(0)) {}
+MouseTask::MouseTask(int)
+    : startPoint{0, 0}
+    , sleepTime(-1)
+    , trackingResult(MouseTracking::Result(0)) {}
 
 MouseTask::~MouseTask() {}
 

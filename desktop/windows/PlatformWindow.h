@@ -1,20 +1,20 @@
 // A window of a window system.
 #pragma once
-#include <cstddef>
-#include <string>
 #include "desktop/drawing/DeviceScale.h"
 #include "host/Geometry.h"
+#include <cstddef>
+#include <string>
 
 class PlatformWindow;
 class Surface;
 
 struct WindowSpec {
-    std::string title;          // UTF-8
+    std::string title;             // UTF-8
     int width = 320, height = 200; // logical pixels of content
     bool resizable = false;
-    bool popup = false;         // no frame, above others, does not take the activation (menus, tool tips)
-    bool placed = false;        // `h` and `v` count; otherwise the system chooses the place
-    int h = 0, v = 0;           // screen position of the content in logical pixels
+    bool popup = false;  // no frame, above others, does not take the activation (menus, tool tips)
+    bool placed = false; // `h` and `v` count; otherwise the system chooses the place
+    int h = 0, v = 0;    // screen position of the content in logical pixels
     PlatformWindow *owner = nullptr; // of a pop-up
 };
 
@@ -34,7 +34,8 @@ public:
     virtual int Height() const = 0;
     virtual Point ScreenPlace() const = 0; // of the content's top left
     virtual double Scale() const = 0;
-    // Copies the rectangles of the surface to the screen. They may reach beyond the surface; what does is not copied.
+    // Copies the rectangles of the surface to the screen. They may reach beyond the surface; what does is not
+    // copied.
     virtual void Present(Surface const &, DeviceRect const *, std::size_t count) = 0;
     // Lets an input method work at the place (content coordinates), or stops it.
     virtual void StartTextInput(Rect const &caret) = 0;

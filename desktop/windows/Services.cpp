@@ -1,11 +1,11 @@
 #include "host/Services.h"
-#include <cmath>
 #include "desktop/drawing/DrawingPort.h"
 #include "desktop/drawing/Region.h"
 #include "desktop/windows/EventLoop.h"
 #include "desktop/windows/PlatformConventions.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
+#include <cmath>
 
 namespace {
 
@@ -37,7 +37,7 @@ bool NextPoint(double limit, Point *where, double *when, bool &timedOut) {
     return true;
 }
 
-}
+} // namespace
 
 bool OS::Services::StillDown() { return EventLoop::Instance().ButtonStillDown(); }
 

@@ -1,11 +1,16 @@
 #include "desktop/windows/SimulatedWindow.h"
+#include "desktop/windows/SimulatedWindowSystem.h"
 #include <algorithm>
 #include <cstring>
-#include "desktop/windows/SimulatedWindowSystem.h"
 
 SimulatedWindow::SimulatedWindow(SimulatedWindowSystem &system_, WindowSpec const &spec, double scale_)
-    : system(system_), title(spec.title), width(spec.width), height(spec.height),
-      place{static_cast<short>(spec.v), static_cast<short>(spec.h)}, scale(scale_), popup(spec.popup) {}
+    : system(system_)
+    , title(spec.title)
+    , width(spec.width)
+    , height(spec.height)
+    , place{static_cast<short>(spec.v), static_cast<short>(spec.h)}
+    , scale(scale_)
+    , popup(spec.popup) {}
 
 SimulatedWindow::~SimulatedWindow() { system.WindowGone(this); }
 
@@ -48,7 +53,8 @@ void SimulatedWindow::Present(Surface const &surface, DeviceRect const *rects, s
         picture.reset(new Surface(surface.Width(), surface.Height()));
     for (std::size_t i = 0; i < count; ++i) {
         DeviceRect const r{std::max(rects[i].left, 0), std::max(rects[i].top, 0),
-                           std::min(rects[i].right, surface.Width()), std::min(rects[i].bottom, surface.Height())};
+                           std::min(rects[i].right, surface.Width()),
+                           std::min(rects[i].bottom, surface.Height())};
         if (r.Empty())
             continue;
         presented.push_back(r);

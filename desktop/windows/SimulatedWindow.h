@@ -1,9 +1,9 @@
 // A window that exists in memory only.
 #pragma once
-#include <memory>
-#include <vector>
 #include "desktop/drawing/Surface.h"
 #include "desktop/windows/PlatformWindow.h"
+#include <memory>
+#include <vector>
 
 class SimulatedWindowSystem;
 

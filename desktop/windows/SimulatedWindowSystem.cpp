@@ -1,14 +1,15 @@
 #include "desktop/windows/SimulatedWindowSystem.h"
-#include <algorithm>
 #include "desktop/SimulatedDesktop.h"
 #include "desktop/resources/Utf.h"
+#include <algorithm>
 
 namespace {
 Rect const kScreen{0, 0, 1200, 1920};
 Point const kFirstPlace{80, 100}; // of windows that name no place
-}
+} // namespace
 
-SimulatedWindowSystem::SimulatedWindowSystem(double scale_) : scale(scale_ > 0 ? scale_ : 1.0) {}
+SimulatedWindowSystem::SimulatedWindowSystem(double scale_)
+    : scale(scale_ > 0 ? scale_ : 1.0) {}
 
 SimulatedWindowSystem::~SimulatedWindowSystem() {}
 
@@ -39,8 +40,9 @@ void SimulatedWindowSystem::WindowHidden(SimulatedWindow *window) {
         active = nullptr;
     if (captured == window)
         captured = nullptr;
-    queue.erase(std::remove_if(queue.begin(), queue.end(), [=](InputEvent const &e) { return e.window == window; }),
-                queue.end());
+    queue.erase(
+        std::remove_if(queue.begin(), queue.end(), [=](InputEvent const &e) { return e.window == window; }),
+        queue.end());
     state.Forget(window);
     if (!window->IsPopup() && !active)
         Activate(Target(), true);
@@ -120,7 +122,8 @@ bool SimulatedWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter 
         stepTimed = false;
         Perform(step);
         // After a step without events the wait's limit may have passed, or the script have ended.
-        if (queue.empty() && ((deadline >= 0 && now >= deadline) || (waiter == Waiter::kMainLoop && steps.empty())))
+        if (queue.empty() &&
+            ((deadline >= 0 && now >= deadline) || (waiter == Waiter::kMainLoop && steps.empty())))
             return false;
     }
 }
@@ -134,7 +137,8 @@ void SimulatedWindowSystem::Push(InputEvent event, ScriptStep const &step) {
     queue.push_back(event);
 }
 
-void SimulatedWindowSystem::PushButton(InputEvent::Kind kind, int button, int clicks, ScriptStep const &step) {
+void SimulatedWindowSystem::PushButton(InputEvent::Kind kind, int button, int clicks,
+                                       ScriptStep const &step) {
     InputEvent event;
     event.kind = kind;
     event.h = lastH;

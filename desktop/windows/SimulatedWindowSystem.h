@@ -1,23 +1,24 @@
 // Windows without a display, time without a clock.
 #pragma once
-#include <deque>
-#include <functional>
-#include <string>
-#include <vector>
 #include "desktop/windows/EventScript.h"
 #include "desktop/windows/InputState.h"
 #include "desktop/windows/SimulatedWindow.h"
 #include "desktop/windows/WindowSystem.h"
+#include <deque>
+#include <functional>
+#include <string>
+#include <vector>
 
-// Events come from a script. Time stands still but for waits: a wait moves it to the next step of the script or to its own end,
-// whichever comes first.
+// Events come from a script. Time stands still but for waits: a wait moves it to the next step of the script
+// or to its own end, whichever comes first.
 class SimulatedWindowSystem : public WindowSystem {
 public:
     explicit SimulatedWindowSystem(double scale);
     ~SimulatedWindowSystem() override;
 
     void Append(std::vector<ScriptStep> const &);
-    // Carries out the steps that are no events (snapshot, dump, menu, print), on the window that scripts act on; null without one.
+    // Carries out the steps that are no events (snapshot, dump, menu, print), on the window that scripts act
+    // on; null without one.
     typedef std::function<void(ScriptStep const &, PlatformWindow *)> CommandHandler;
     void SetCommandHandler(CommandHandler handler) { commandHandler = std::move(handler); }
 

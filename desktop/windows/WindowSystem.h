@@ -1,18 +1,19 @@
 // The seam between the desktop and whatever shows its windows.
 #pragma once
-#include <memory>
-#include <string>
 #include "desktop/windows/InputEvent.h"
 #include "desktop/windows/PlatformWindow.h"
+#include <memory>
+#include <string>
 
-// One clock, one queue of events, some windows. Two implementations: SdlWindowSystem shows real windows, SimulatedWindowSystem keeps
-// them in memory and takes its events from a script.
+// One clock, one queue of events, some windows. Two implementations: SdlWindowSystem shows real windows,
+// SimulatedWindowSystem keeps them in memory and takes its events from a script.
 class WindowSystem {
 public:
     virtual ~WindowSystem() {}
     virtual char const *Name() const = 0;
 
-    virtual std::unique_ptr<PlatformWindow> CreateWindow(WindowSpec const &) = 0; // throws std::runtime_error with the reason
+    virtual std::unique_ptr<PlatformWindow>
+    CreateWindow(WindowSpec const &) = 0; // throws std::runtime_error with the reason
 
     // Who waits, for the message of a wait that nothing can end, and what may end it.
     enum class Waiter {
@@ -21,15 +22,16 @@ public:
         kPause,    // has a timeout of its own
         kModal     // a dialog or menu: a wait that nothing can end is an error
     };
-    // Takes the next event. Blocks until there is one, or until `timeout` seconds have passed (negative: for ever); false then. The
-    // simulated system throws ScriptError, naming `what`, when a modal wait could never end.
+    // Takes the next event. Blocks until there is one, or until `timeout` seconds have passed (negative: for
+    // ever); false then. The simulated system throws ScriptError, naming `what`, when a modal wait could
+    // never end.
     virtual bool WaitEvent(InputEvent &, double timeout, Waiter, char const *what) = 0;
 
     // No event will ever come; a real window system never knows that.
     virtual bool AtEnd() const { return false; }
 
-    virtual double Now() const = 0; // seconds, never backwards
-    virtual bool IsMouseDown() const = 0;            // primary button, as of the last event taken
+    virtual double Now() const = 0;                   // seconds, never backwards
+    virtual bool IsMouseDown() const = 0;             // primary button, as of the last event taken
     virtual bool IsKeyPressed(int keyCode) const = 0; // as of the last event taken
     virtual unsigned short CurrentModifiers() const = 0;
     // Last known pointer position in the window's content coordinates.
@@ -38,7 +40,7 @@ public:
 
     // The scale of all windows from now on, instead of their displays'.
     virtual void ForceScale(double factor) = 0;
-    virtual void SetCursor(int cursor) = 0; // resource number, or one of Cursors
+    virtual void SetCursor(int cursor) = 0;     // resource number, or one of Cursors
     virtual std::string GetClipboardText() = 0; // UTF-8
     virtual void SetClipboardText(std::string const &utf8) = 0;
     virtual Rect ScreenBounds() const = 0; // logical pixels, of the display with the main window

@@ -1,7 +1,3 @@
-#include "tests/PaneTest.h"
-#include <cstdlib>
-#include <fstream>
-#include <sstream>
 #include "desktop/AssertionHandler.h"
 #include "desktop/drawing/Surface.h"
 #include "desktop/observe/JsonLine.h"
@@ -16,7 +12,11 @@
 #include "host/Services.h"
 #include "host/TarnError.h"
 #include "host/TarnImage.h"
+#include "tests/PaneTest.h"
 #include "tests/desktop/ProbePane.h"
+#include <cstdlib>
+#include <fstream>
+#include <sstream>
 
 namespace {
 
@@ -74,7 +74,8 @@ TEST_F(DesktopTest, AThemeChangeRedrawsEverythingInTheNewColoursAndIsTold) {
     EXPECT_EQ(listener.changes, 1);
     EXPECT_EQ(desktop.Theme(), "dark");
     EXPECT_EQ(Repainted(), (std::vector<Rect>{{0, 0, 200, 320}}));
-    EXPECT_EQ(desktop.Picture(glog)->Row(5)[5] >> 8 & 0xFF, static_cast<unsigned>(kWindowBackgroundColor.green >> 8));
+    EXPECT_EQ(desktop.Picture(glog)->Row(5)[5] >> 8 & 0xFF,
+              static_cast<unsigned>(kWindowBackgroundColor.green >> 8));
 }
 
 TEST_F(DesktopTest, AnUnknownThemeChangesNothing) {
@@ -265,7 +266,12 @@ TEST_F(DesktopTest, HelpResizeObjectDamagesWhatOneRectangleHasAndTheOtherHasNot)
 
 TEST(JsonLineTest, FieldsStandInTheOrderTheyAreAddedIn) {
     JsonLine line;
-    line.Integer("a", -3).Number("b", 0.1).Flag("c", true).Box("d", {1, 2, 3, 4}).Spot("e", {5, 6}).Raw("f", "[]");
+    line.Integer("a", -3)
+        .Number("b", 0.1)
+        .Flag("c", true)
+        .Box("d", {1, 2, 3, 4})
+        .Spot("e", {5, 6})
+        .Raw("f", "[]");
     EXPECT_EQ(line.Finish(), "{\"a\":-3,\"b\":0.1,\"c\":true,\"d\":[1,2,3,4],\"e\":[5,6],\"f\":[]}");
     EXPECT_EQ(JsonLine().Finish(), "{}");
 }
@@ -282,4 +288,4 @@ TEST(JsonLineTest, NumbersReadBackTheSame) {
     EXPECT_EQ(line.Finish(), "{\"a\":0.3333333333333333,\"b\":1e+300,\"c\":0}");
 }
 
-}
+} // namespace

@@ -1,7 +1,7 @@
 #include "desktop/windows/EventScript.h"
-#include <gtest/gtest.h>
 #include "desktop/SimulatedDesktop.h"
 #include "host/glogRec.h"
+#include <gtest/gtest.h>
 
 namespace {
 
@@ -33,14 +33,15 @@ TEST(EventScript, EveryStepOfTheLanguageIsRead) {
         char const *line;
         ScriptStep::Kind kind;
     };
-    for (Case const &c : {Case{"move 1 2", ScriptStep::kMove}, Case{"release", ScriptStep::kRelease},
-                          Case{"click 1 2", ScriptStep::kClick}, Case{"doubleclick 1 2", ScriptStep::kDoubleClick},
-                          Case{"rightclick 1 2", ScriptStep::kRightClick}, Case{"wheel 1 2 0 -1", ScriptStep::kWheel},
-                          Case{"key Return", ScriptStep::kKey}, Case{"type \"a\"", ScriptStep::kType},
-                          Case{"wait 0.5", ScriptStep::kWait}, Case{"resize 640 480", ScriptStep::kResize},
-                          Case{"activate off", ScriptStep::kActivate}, Case{"menu 3", ScriptStep::kMenu},
-                          Case{"print a.pdf", ScriptStep::kPrint}, Case{"snapshot a.png", ScriptStep::kSnapshot},
-                          Case{"dump a.json", ScriptStep::kDump}})
+    for (Case const &c :
+         {Case{"move 1 2", ScriptStep::kMove}, Case{"release", ScriptStep::kRelease},
+          Case{"click 1 2", ScriptStep::kClick}, Case{"doubleclick 1 2", ScriptStep::kDoubleClick},
+          Case{"rightclick 1 2", ScriptStep::kRightClick}, Case{"wheel 1 2 0 -1", ScriptStep::kWheel},
+          Case{"key Return", ScriptStep::kKey}, Case{"type \"a\"", ScriptStep::kType},
+          Case{"wait 0.5", ScriptStep::kWait}, Case{"resize 640 480", ScriptStep::kResize},
+          Case{"activate off", ScriptStep::kActivate}, Case{"menu 3", ScriptStep::kMenu},
+          Case{"print a.pdf", ScriptStep::kPrint}, Case{"snapshot a.png", ScriptStep::kSnapshot},
+          Case{"dump a.json", ScriptStep::kDump}})
         EXPECT_EQ(One(c.line).kind, c.kind) << c.line;
 }
 
@@ -79,7 +80,8 @@ TEST(EventScript, ErrorsNameTheLineAndWhatWasExpected) {
     EXPECT_EQ(ErrorOf("press 1.5 2"), "demo:1: expected a horizontal place, a whole number");
     EXPECT_EQ(ErrorOf("press 1 99999999999"), "demo:1: expected a vertical place, found \"99999999999\"");
     EXPECT_EQ(ErrorOf("press nan 2"), "demo:1: expected a horizontal place, found \"nan\"");
-    EXPECT_EQ(ErrorOf("click 1 2 hyper"), "demo:1: expected shift, command, option or control, found \"hyper\"");
+    EXPECT_EQ(ErrorOf("click 1 2 hyper"),
+              "demo:1: expected shift, command, option or control, found \"hyper\"");
     EXPECT_EQ(ErrorOf("key Hyper"), "demo:1: there is no key \"Hyper\"");
     EXPECT_EQ(ErrorOf("type héllo"), "demo:1: expected a text in double quotes");
     EXPECT_EQ(ErrorOf("type \"abc"), "demo:1: the text has no closing double quote");
@@ -87,8 +89,10 @@ TEST(EventScript, ErrorsNameTheLineAndWhatWasExpected) {
     EXPECT_EQ(ErrorOf("wait 1 2"), "demo:1: there is more on the line than \"wait\" takes");
     EXPECT_EQ(ErrorOf("resize 0 10"), "demo:1: expected a width of 1 to 16000, found \"0\"");
     EXPECT_EQ(ErrorOf("activate maybe"), "demo:1: expected on or off, found \"maybe\"");
-    EXPECT_EQ(ErrorOf("menu 4/"), "demo:1: expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"4/\"");
-    EXPECT_EQ(ErrorOf("menu -1"), "demo:1: expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"-1\"");
+    EXPECT_EQ(ErrorOf("menu 4/"),
+              "demo:1: expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"4/\"");
+    EXPECT_EQ(ErrorOf("menu -1"),
+              "demo:1: expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"-1\"");
 }
 
 TEST(EventScript, AWrongScriptAppendsNoneOfItsSteps) {
@@ -100,4 +104,4 @@ TEST(EventScript, AWrongScriptAppendsNoneOfItsSteps) {
     EXPECT_EQ(desktop.Now(), 0);
 }
 
-}
+} // namespace

@@ -1,10 +1,10 @@
-#include "tests/PaneTest.h"
-#include <boost/make_shared.hpp>
-#include "desktop/drawing/Surface.h"
 #include "desktop/panes/Glog.h"
+#include "desktop/drawing/Surface.h"
 #include "host/CustomEventHandler.h"
 #include "host/UIEvent.h"
+#include "tests/PaneTest.h"
 #include "tests/desktop/ProbePane.h"
+#include <boost/make_shared.hpp>
 
 namespace {
 
@@ -297,7 +297,8 @@ public:
 
 private:
     struct Handler : CustomEventHandler {
-        explicit Handler(WheelPane *pane_) : pane(pane_) {}
+        explicit Handler(WheelPane *pane_)
+            : pane(pane_) {}
         bool HandleEvent(UIEvent *event) override {
             boost::shared_ptr<UIEvent::MouseWheelParams> params = event->GetMouseWheelParams();
             pane->calls.push_back(pane->name + ": wheel " + std::to_string(params->axis) + " " +
@@ -347,7 +348,9 @@ TEST_F(GlogTest, ActivationReachesEveryPaneOnce) {
 TEST_F(GlogTest, AClickThatActivatedTheWindowIsKnownAsSuch) {
     ProbePane *pane = NewPane();
     std::vector<bool> activating;
-    pane->onClick = [&](EventRecordAdapter *) { activating.push_back(glog->DidActivateWithCurrentMouseDown()); };
+    pane->onClick = [&](EventRecordAdapter *) {
+        activating.push_back(glog->DidActivateWithCurrentMouseDown());
+    };
     Show();
     desktop.Play("wait 1\nactivate off\nwait 1\nactivate on\nclick 25 15\nwait 1\nclick 25 15");
     EXPECT_EQ(activating, (std::vector<bool>{true, false}));
@@ -409,4 +412,4 @@ TEST_F(GlogTest, DrawingOutsideAnUpdateShowsAtTheNextWait) {
     EXPECT_EQ(desktop.Picture(glog)->Row(12)[22], 0xFF000000u);
 }
 
-}
+} // namespace

@@ -153,7 +153,8 @@ TEST_F(LayoutTest, AnItemWithoutPlaceAnswersTheRectangleItWasMadeWith) {
     EXPECT_EQ(plain->GetBorderRect(), (Rect{1, 2, 3, 4}));
     EXPECT_EQ(plain->GetItemRect(), (Rect{1, 2, 3, 4}));
     EXPECT_STREQ(plain->GetName(), "part");
-    RCPtr<GlogLayoutRectItem> nested = GlogLayout::MakeRectItem({2, 3, 5, 9}, {10, 20, 30, 60}, -1, 1, "icon");
+    RCPtr<GlogLayoutRectItem> nested =
+        GlogLayout::MakeRectItem({2, 3, 5, 9}, {10, 20, 30, 60}, -1, 1, "icon");
     EXPECT_EQ(nested->GetBorderRect(), (Rect{10, 20, 30, 60}));
     EXPECT_EQ(nested->GetItemRect(), (Rect{12, 23, 15, 29}));
 }
@@ -171,7 +172,8 @@ TEST_F(LayoutTest, PartsOfAPaneMoveWithIt) {
     Add(30, 20);
     ProbePane *pane = new ProbePane(glog, {0, 0, 20, 50}, calls, "parts");
     pane->UseLayoutSubItemMode();
-    RCPtr<GlogLayoutRectItem> part = GlogLayout::MakeRectItem({4, 5, 14, 25}, -1, pane->NumLayoutSubItems(), "");
+    RCPtr<GlogLayoutRectItem> part =
+        GlogLayout::MakeRectItem({4, 5, 14, 25}, -1, pane->NumLayoutSubItems(), "");
     pane->AddLayoutSubItem(part);
     EXPECT_EQ(pane->NumLayoutSubItems(), 1);
     box->Add(pane, -1);
@@ -228,4 +230,4 @@ TEST_F(LayoutTest, AGrowingPaneAtTheTopLevelFollowsTheWindow) {
     EXPECT_EQ(Count(calls, "grows: Resize 80 50"), 1);
 }
 
-}
+} // namespace

@@ -1,11 +1,11 @@
 // Panes that note what the host does to them.
 #pragma once
-#include <functional>
-#include <string>
-#include <vector>
 #include "host/CompoundPane.h"
 #include "host/EventRecordAdapter.h"
 #include "host/VelaDrawing.h"
+#include <functional>
+#include <string>
+#include <vector>
 
 typedef std::vector<std::string> Calls;
 
@@ -19,7 +19,9 @@ inline Calls &FreshCalls() {
 // Notes each call in a list that outlives it, and fills its rectangle with one gray.
 class ProbePane : public GlogPane {
 public:
-    ProbePane(glogRec *glog_, Rect box, Calls &calls_, std::string name_ = "pane") : calls(calls_), name(name_) {
+    ProbePane(glogRec *glog_, Rect box, Calls &calls_, std::string name_ = "pane")
+        : calls(calls_)
+        , name(name_) {
         GlogPaneInit(glog_, 0);
         GlogPane::SetBox(&box);
     }

@@ -1,4 +1,3 @@
-#include "tests/PaneTest.h"
 #include "desktop/drawing/Surface.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
@@ -7,6 +6,7 @@
 #include "host/CIdleChore.h"
 #include "host/PortSavers.h"
 #include "host/Services.h"
+#include "tests/PaneTest.h"
 #include "tests/desktop/ProbePane.h"
 
 namespace {
@@ -19,7 +19,9 @@ protected:
 
     class Chore : public CIdleChore {
     public:
-        explicit Chore(std::function<void()> work_) : CIdleChore(0, kNoInitialDelay), work(std::move(work_)) {
+        explicit Chore(std::function<void()> work_)
+            : CIdleChore(0, kNoInitialDelay)
+            , work(std::move(work_)) {
             Assign();
         }
         std::function<void()> work;
@@ -178,7 +180,8 @@ TEST(ClosingADesktop, APaneMayDisposeOfAnotherGlogWhileItDies) {
         class Owner : public ProbePane {
         public:
             Owner(glogRec *glog, Calls &calls, glogRec *owned_)
-                : ProbePane(glog, {0, 0, 5, 5}, calls, "owner"), owned(owned_) {}
+                : ProbePane(glog, {0, 0, 5, 5}, calls, "owner")
+                , owned(owned_) {}
             ~Owner() override { DisposeGlog(owned); }
             glogRec *owned;
         };
@@ -220,7 +223,8 @@ TEST_F(ReentrancyTest, AChoreThatWaitsIsNotRunAgainMeanwhile) {
 }
 
 TEST_F(ReentrancyTest, GroupsAndContainersCannotLieInThemselves) {
-    ProbeContainer *outer = new ProbeContainer(glog, {0, 0, 50, 50}), *inner = new ProbeContainer(glog, {0, 0, 9, 9});
+    ProbeContainer *outer = new ProbeContainer(glog, {0, 0, 50, 50}),
+                   *inner = new ProbeContainer(glog, {0, 0, 9, 9});
     EXPECT_EQ(outer->Add(inner, -1), 0);
     EXPECT_LT(inner->Add(outer, -1), 0);
     EXPECT_EQ(CountGlogItems(glog), 2);
@@ -302,7 +306,8 @@ TEST_F(ReentrancyTest, PanesMadeWhileTheGlogRunsAreStartedAndActive) {
 
 TEST_F(ReentrancyTest, ASubpaneThatIsTakenOutAndAddedAgainIsInTheLayoutAgain) {
     ProbeContainer *container = new ProbeContainer(glog, {0, 0, 100, 100});
-    ProbePane *a = new ProbePane(glog, {0, 0, 20, 30}, calls), *b = new ProbePane(glog, {0, 0, 10, 30}, calls);
+    ProbePane *a = new ProbePane(glog, {0, 0, 20, 30}, calls),
+              *b = new ProbePane(glog, {0, 0, 10, 30}, calls);
     container->Add(a, -1);
     container->Add(b, -1);
     container->SetUseLayout(true);
@@ -405,4 +410,4 @@ TEST_F(ReentrancyTest, EachClickReportsItsOwnHitAlsoWhenOneIsHandledInsideAnothe
     EXPECT_EQ(hits, (std::vector<int>{2, 1}));
 }
 
-}
+} // namespace

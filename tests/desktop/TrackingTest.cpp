@@ -1,8 +1,8 @@
-#include "tests/PaneTest.h"
 #include "desktop/drawing/Surface.h"
 #include "host/CIdleChore.h"
 #include "host/MouseTask.h"
 #include "host/Services.h"
+#include "tests/PaneTest.h"
 #include "tests/desktop/ProbePane.h"
 
 namespace {
@@ -195,13 +195,16 @@ TEST_F(TrackingTest, YieldUntilKeyUpEndsWithTheKey) {
 
 class LoggingTask : public MouseTask {
 public:
-    LoggingTask(Calls &log_, double sleep) : MouseTask(0), log(log_) {
+    LoggingTask(Calls &log_, double sleep)
+        : MouseTask(0)
+        , log(log_) {
         if (sleep > 0)
             SetSleepTime(sleep);
     }
     void MouseTaskBegin() override { log.push_back("begin " + Spelled(GetStartPoint())); }
     void MouseTaskContinue(Point const &p) override {
-        log.push_back("continue " + Spelled(p) + (GetTrackingResult() == MouseTracking::kTimedOut ? " timed out" : ""));
+        log.push_back("continue " + Spelled(p) +
+                      (GetTrackingResult() == MouseTracking::kTimedOut ? " timed out" : ""));
     }
     void MouseTaskEnd() override { log.push_back("end"); }
     Calls &log;
@@ -220,10 +223,13 @@ TEST_F(TrackingTest, AMouseTaskContinuesEachTimeItsSleepTimeRunsOut) {
         LoggingTask task(log, 0.1);
         pane->TrackMouse(task, {20, 30});
     });
-    EXPECT_EQ(log, (Calls{"begin 30,20", "continue 30,20 timed out", "continue 30,20 timed out", "continue 31,21", "end"}));
+    EXPECT_EQ(log, (Calls{"begin 30,20", "continue 30,20 timed out", "continue 30,20 timed out",
+                          "continue 31,21", "end"}));
 }
 
-TEST_F(TrackingTest, TheAutoScrollTimeIsATwentiethOfASecond) { EXPECT_EQ(MouseTask::DefaultAutoScrollTime(), 0.05); }
+TEST_F(TrackingTest, TheAutoScrollTimeIsATwentiethOfASecond) {
+    EXPECT_EQ(MouseTask::DefaultAutoScrollTime(), 0.05);
+}
 
 // Idle time
 
@@ -246,7 +252,8 @@ TEST_F(TrackingTest, VisiblePanesOfTheActiveGlogAreToldOfIdleTimeBeforeEachWait)
 
 class Chore : public CIdleChore {
 public:
-    Chore(long long interval, UseInitialDelay delay) : CIdleChore(interval, delay) {}
+    Chore(long long interval, UseInitialDelay delay)
+        : CIdleChore(interval, delay) {}
     std::function<void()> work;
 
 protected:
@@ -300,4 +307,4 @@ TEST_F(TrackingTest, AChoreMayCancelAnotherThatIsDueAtTheSameTime) {
     EXPECT_EQ(runs, 0);
 }
 
-}
+} // namespace

@@ -268,7 +268,8 @@ TEST_F(Mouse, LosingTheActivationToNobodyReleasesTheButton) {
     PointAt(*window, 20, 20);
     Do("mousedown 1");
     Await(InputEvent::kMouseDown);
-    // The window manager gives the focus to what was pressed, at a time of its own: it can take the focus back once.
+    // The window manager gives the focus to what was pressed, at a time of its own: it can take the focus
+    // back once.
     for (int tries = 0; tries < 20 && System().IsMouseDown(); ++tries) {
         RunBeside("xdotool windowfocus $(xwininfo -root -int | awk '/Window id/ { print $4 }')");
         Drain();
