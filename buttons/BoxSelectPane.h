@@ -47,6 +47,7 @@ public:
     void InitStatus(bool);
     void ChangeStatus(bool);
 
+    // How many boxes there are.
     short GetNumBoxes() const;
     // Writes the box's rectangle, in the coordinates of the pane's events.
     void GetOneBox(short index, Rect *out);

@@ -21,11 +21,15 @@ public:
     static GIconPane *NewGIconPane(glogRec *, GIconResRec *);
     static GIconPane *NewGIconPane(glogRec *, boost::shared_ptr<XMLLib::ContainerItem>);
 
+    // The icons' family.
     short GetFamilyID() const { return family; }
     short GetIconNum() const { return icon; } // of state 0
+    // How many states there are.
     short GetNumStates() const { return numStates; }
     bool CanDisable() const { return canDisable != 0; } // as the record had it; what is shown ignores it
+    // The state shown, from 0.
     short GetCurState() const { return curState; }
+    // Whether the pane is drawn as enabled.
     bool GetEnabled() const { return enabled != 0; }
     DecalProc GetDecalProc() const { return decalProc; } // or null
 

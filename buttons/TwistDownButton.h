@@ -10,6 +10,7 @@ public:
     // on; null when memory or glog is wanting. The owner moves it to its place.
     static TwistDownButton *NewTwistDownButton(glogRec *);
 
+    // Whether the triangle points down.
     bool IsOpen() const { return open; }
 
     // Flips the button, but for the release with which the mouse slides off it.

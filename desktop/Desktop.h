@@ -13,18 +13,14 @@ struct glogRec;
 // How a desktop is opened; every setting has a default.
 class DesktopOptions {
 public:
-    DesktopOptions &Theme(std::string const &name) {
-        return theme = name, *this;
-    } // "light" (default) or "dark"
-    DesktopOptions &Scale(double factor) {
-        return scale = factor, *this;
-    } // device pixels per pixel, 0.5 to 4; 0 (default): the display's
-    DesktopOptions &Language(std::string const &code) {
-        return language = code, *this;
-    } // "en" (default), "de"
-    DesktopOptions &Artwork(std::string const &path) {
-        return artwork = path, *this;
-    } // default: beside the library
+    // "light" (default) or "dark".
+    DesktopOptions &Theme(std::string const &name) { return theme = name, *this; }
+    // Device pixels per pixel, 0.5 to 4; 0 (default): the display's.
+    DesktopOptions &Scale(double factor) { return scale = factor, *this; }
+    // "en" (default) or "de".
+    DesktopOptions &Language(std::string const &code) { return language = code, *this; }
+    // The directory of the artwork; default: beside the library.
+    DesktopOptions &Artwork(std::string const &path) { return artwork = path, *this; }
 
     // What was set.
     std::string theme = "light";
