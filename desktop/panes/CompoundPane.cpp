@@ -35,7 +35,9 @@ GlogPane *TopmostAt(std::vector<GlogPane *> const &subpanes, Point p) {
 
 CompoundPane::CompoundPane()
     : usesLayout(false)
-    , compoundRep(new CompoundRep) {}
+    , compoundRep(new CompoundRep) {
+    rep->asContainer = this;
+}
 
 CompoundPane::~CompoundPane() {
     // A subpane's destructor takes it out of the list.
@@ -44,6 +46,7 @@ CompoundPane::~CompoundPane() {
     if (compoundRep->layout.get())
         LayoutEngine::PaneGone(*compoundRep->layout);
     delete compoundRep;
+    rep->asContainer = nullptr;
 }
 
 CompoundPane *CompoundPane::CompoundPaneInit(glogRec *glog_, short id) {

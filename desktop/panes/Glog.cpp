@@ -105,11 +105,26 @@ RGBColor Glog::GetContentColor() { return kWindowBackgroundColor; }
 
 void Glog::AddItem(GlogPane *pane) {
     items.push_back(pane);
+    ++itemChanges;
     NotePanesAdded();
 }
 
 void Glog::RemoveItem(GlogPane *pane) {
     items.erase(std::remove(items.begin(), items.end(), pane), items.end());
+    ++itemChanges;
+}
+
+bool Glog::HasItem(GlogPane *pane) const {
+    return std::find(items.begin(), items.end(), pane) != items.end();
+}
+
+template <class Operation> void Glog::ForEachItem(Operation operation) {
+    std::vector<GlogPane *> const snapshot = items;
+    unsigned long const changes = itemChanges;
+    for (GlogPane *pane : snapshot)
+        if (itemChanges == changes ||
+            HasItem(pane)) // looking up each of them takes longer than most operations
+            operation(*pane);
 }
 
 void Glog::PaneGone(GlogPane *pane) {
@@ -243,10 +258,7 @@ void Glog::Resized(int w, int h) {
     if (surface)
         MakeSurface();
     port.SetExtent(width, height);
-    std::vector<GlogPane *> const snapshot = items;
-    for (GlogPane *pane : snapshot)
-        if (std::find(items.begin(), items.end(), pane) != items.end())
-            pane->Resize(delta);
+    ForEachItem([&](GlogPane &pane) { pane.Resize(delta); });
     DamageAll();
 }
 
@@ -311,10 +323,7 @@ void Glog::DrawDamage(OSRgn const &region) {
     port.SetBoundary(region);
     port.FillClip(ToRGBA(GetContentColor()));
     OSRgn local(region);
-    std::vector<GlogPane *> const snapshot = items;
-    for (GlogPane *pane : snapshot)
-        if (std::find(items.begin(), items.end(), pane) != items.end())
-            PaneAccess::Draw(*pane, &local);
+    ForEachItem([&](GlogPane &pane) { PaneAccess::Draw(pane, &local); });
     updating.done = true;
 }
 
@@ -353,7 +362,7 @@ void Glog::Click(InputEvent const &event) {
             PaneAccess::ConfirmChanges(*current);
     }
     // The confirmation can have changed everything.
-    if (!pane || std::find(items.begin(), items.end(), pane) == items.end())
+    if (!pane || !HasItem(pane))
         return;
     // A nested loop may handle further clicks in this glog; each has its own hit.
     struct OwnHit {
@@ -376,7 +385,7 @@ void Glog::Click(InputEvent const &event) {
                                           : 0;
     if (disposed)
         return;
-    if (value == 0 && event.button == 1 && std::find(items.begin(), items.end(), pane) != items.end())
+    if (value == 0 && event.button == 1 && HasItem(pane))
         pane->TryMouseControl(record.where);
     if (value > 0)
         ReportHit(value);
@@ -409,7 +418,7 @@ void Glog::AddToTabOrder(GlogPane &pane, std::vector<GlogPane *> &order) const {
     if (!PaneAccess::OwnVisibility(pane))
         return;
     order.push_back(&pane);
-    if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
+    if (CompoundPane *container = PaneAccess::AsContainer(pane))
         for (short i = 0; i < container->NumSubpanes(); ++i)
             AddToTabOrder(*container->Get(i), order);
 }
@@ -481,10 +490,7 @@ void Glog::Activation(bool on) {
     active = on;
     if (on)
         DesktopRep::Of(desktop).CameToFront(this);
-    std::vector<GlogPane *> const snapshot = items;
-    for (GlogPane *pane : snapshot)
-        if (std::find(items.begin(), items.end(), pane) != items.end())
-            pane->SetActive();
+    ForEachItem([&](GlogPane &pane) { pane.SetActive(); });
 }
 
 void Glog::Idle() {

@@ -89,6 +89,10 @@ public:
     bool disposed = false; // waits to be deleted when nothing runs in it any more
 
 private:
+    bool HasItem(GlogPane *) const;
+    // Calls the operation with each top-level pane, as far as it is one still. Panes may come and go
+    // meanwhile.
+    template <class Operation> void ForEachItem(Operation);
     void DrawDamage(OSRgn const &);
     void Present(std::vector<DeviceRect> const &);
     void MakeSurface();
@@ -104,6 +108,7 @@ private:
     int width, height;
     int minWidth = 0, minHeight = 0, maxWidth = 0, maxHeight = 0;
     std::vector<GlogPane *> items;
+    unsigned long itemChanges = 0; // how often a pane has come or gone
     std::map<int, Rect> described;
     GlogPane *current = nullptr;
     int hitItem = 0;

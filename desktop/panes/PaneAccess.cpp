@@ -72,7 +72,7 @@ void PaneAccess::PlacedByLayout(GlogPane &pane) {
 }
 
 void PaneAccess::ResizeSubpanes(GlogPane &pane, Point delta) {
-    CompoundPane *const container = dynamic_cast<CompoundPane *>(&pane);
+    CompoundPane *const container = AsContainer(pane);
     if (!container)
         return;
     std::vector<GlogPane *> const snapshot = container->compoundRep->subpanes;
@@ -92,7 +92,7 @@ void PaneAccess::Adopt(GlogPane &pane, glogRec *glog) {
     pane.glog = glog;
     if (glog)
         EnsureLayoutItems(pane);
-    if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
+    if (CompoundPane *container = AsContainer(pane))
         for (GlogPane *inside : container->compoundRep->subpanes)
             Adopt(*inside, glog);
 }
@@ -102,7 +102,7 @@ void PaneAccess::EnsureLayoutItems(GlogPane &pane) {
         pane.rep->layoutItem = LayoutEngine::MakeForPane(&pane);
         LayoutEngine::Rep(*pane.rep->layoutItem).made = pane.rep->box;
     }
-    CompoundPane *const container = dynamic_cast<CompoundPane *>(&pane);
+    CompoundPane *const container = AsContainer(pane);
     if (container && !container->compoundRep->layout.get())
         container->compoundRep->layout = LayoutEngine::MakeForContainer(container);
     JoinLayout(pane);
@@ -118,7 +118,7 @@ void PaneAccess::JoinLayout(GlogPane &pane) {
 void PaneAccess::Idle(GlogPane &pane) {
     if (!pane.rep->visible)
         return;
-    CompoundPane *const container = dynamic_cast<CompoundPane *>(&pane);
+    CompoundPane *const container = AsContainer(pane);
     for (short i = 0; container && i < container->NumSubpanes(); ++i)
         Idle(*container->Get(i));
     pane.Idle(); // last, since it may delete the pane
@@ -131,7 +131,7 @@ void PaneAccess::Start(GlogPane &pane) {
         pane.GlogItemInit();
         pane.SetActive();
     }
-    if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane))
+    if (CompoundPane *container = AsContainer(pane))
         for (short i = 0; i < container->NumSubpanes(); ++i)
             Start(*container->Get(i));
 }

@@ -12,6 +12,9 @@ class PaneAccess {
 public:
     static GlogPane::Rep &Rep(GlogPane &pane) { return *pane.rep; }
     static CompoundPane::CompoundRep &Rep(CompoundPane &pane) { return *pane.compoundRep; }
+    static CompoundPane *AsContainer(GlogPane &pane) {
+        return pane.rep->asContainer;
+    } // null for no container
     static CompoundPane *Container(GlogPane &pane) { return pane.container; }
     static void SetContainerField(GlogPane &pane, CompoundPane *container) { pane.container = container; }
     static void SetGlogField(GlogPane &pane, glogRec *glog) { pane.glog = glog; }

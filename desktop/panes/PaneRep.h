@@ -12,6 +12,9 @@ struct GlogPane::Rep {
     bool active = false;
     bool selected = false;
     bool started = false; // GlogItemInit was called
+    // The pane itself when it holds others. Asked for every pane between any two events, where a cast would
+    // be most of the work.
+    CompoundPane *asContainer = nullptr;
     RCPtr<GlogLayoutRectItem> layoutItem;
     bool subItemMode = false;
     std::vector<RCPtr<GlogLayoutRectItem>> subItems;

@@ -36,7 +36,7 @@ HelpTagWindow::~HelpTagWindow() { Hide(); }
 bool HelpTagWindow::Find(GlogPane &pane, Point p, Found &found) {
     if (!PaneAccess::OwnVisibility(pane) || !pane.ContainsForHelp(p))
         return false;
-    if (CompoundPane *container = dynamic_cast<CompoundPane *>(&pane)) {
+    if (CompoundPane *container = PaneAccess::AsContainer(pane)) {
         Point inside = p;
         container->LocalOffset(&inside);
         for (short i = static_cast<short>(container->NumSubpanes() - 1); i >= 0; --i)
