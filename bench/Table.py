@@ -71,13 +71,11 @@ def time_text(nanoseconds):
     return f"{nanoseconds:.3g} ns"
 
 
-def mark(value, most):
-    return "" if most is None else MARKS[value <= most]
-
-
 def row(what, measured, beside, value, most):
-    goal = "" if most is None else f"{most:g}"
-    print(f"{what:40} {measured:>10} {beside:>10} {value:>9} {goal:>6} {mark(float(value), most)}".rstrip())
+    """Prints a line; whether its goal, if it has one, is missed."""
+    goal, mark = ("", "") if most is None else (f"{most:g}", MARKS[value <= most])
+    print(f"{what:40} {measured:>10} {beside:>10} {value:9.3f} {goal:>6} {mark}".rstrip())
+    return mark == MARKS[False]
 
 
 def main():
@@ -93,16 +91,13 @@ def main():
         return statistics.median(values[name, clock])
 
     missed = 0
-    print(f"{'':40} {'measured':>10} {'beside':>10} {'ratio':>9} {'goal':>6}")
+    print(f"{'':40} {'measured':>10} {'beside':>10} {'value':>9} {'goal':>6}")
     for ratio in RATIOS:
         measured, beside = median(ratio.measured, ratio.clock), median(ratio.beside, ratio.clock)
-        value = f"{measured / beside:.3f}"
-        row(ratio.what, time_text(measured), time_text(beside), value, ratio.most)
-        missed += mark(float(value), ratio.most) == MARKS[False]
+        missed += row(ratio.what, time_text(measured), time_text(beside), measured / beside, ratio.most)
     for amount in AMOUNTS:
-        value = f"{median(amount.measured, 'real_time') / amount.size:.1f}"
-        row(amount.what, f"{value} {amount.unit}", "", value, amount.most)
-        missed += mark(float(value), amount.most) == MARKS[False]
+        value = median(amount.measured, "real_time") / amount.size
+        missed += row(amount.what, f"{value:.1f} {amount.unit}", "", value, amount.most)
     print(f"{missed} goal(s) missed" if missed else "All goals met")
     return 1 if options.check and missed else 0
 
