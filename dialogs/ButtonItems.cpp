@@ -2,16 +2,13 @@
 #include "buttons/FrameButtonPane.h"
 #include "buttons/OvalButtonPane.h"
 #include "buttons/StudButtonPane.h"
-#include "desktop/observe/MessageTrace.h"
 #include "desktop/observe/TreeDump.h"
+#include "dialogs/IconFamilyKey.h"
 #include "dialogs/ItemRegistry.h"
-#include "dialogs/KeyFault.h"
-#include "dialogs/MessageReporter.h"
+#include "dialogs/PressReporter.h"
 #include "dialogs/RecordBytes.h"
 #include "dialogs/StockItems.h"
-#include "dialogs/Utf8.h"
 #include "frame/ResourceReading.h"
-#include "host/EnumToStringMap.h"
 #include "host/GlogStyleSheet.h"
 
 namespace {
@@ -25,21 +22,6 @@ UString TextUnder(GlogStyleSheet *sheet, char const *key) {
 
 int NumberUnder(GlogStyleSheet *sheet, char const *key) {
     return sheet->GetSInt32ItemValue(ResourceKey(key));
-}
-
-class PressReporter : public MessageReporter<GlogButtonPaneListener> {
-public:
-    using MessageReporter::MessageReporter;
-    void GlogButtonPressed(GlogButtonPane *button) override {
-        if (MessageTrace::On())
-            MessageTrace::Write(
-                MessageTrace::Begin(*button).Text("message", std::string("GlogButtonPressed")));
-    }
-};
-
-void ReportPresses(GlogPane *pane) {
-    if (GlogButtonPane *button = dynamic_cast<GlogButtonPane *>(pane))
-        new PressReporter(button);
 }
 
 bool DescribeButton(GlogPane &pane, JsonLine &line) {
@@ -80,14 +62,8 @@ GlogPane *MakeStud(glogRec *glog, GlogStyleSheet *sheet) {
     return button;
 }
 
-void RequireIconFamily(UString const &name) {
-    UString const none = ResourceKey("0");
-    if (!name.empty() && !(name == none) && ISetIDMapper::Instance().GetID(name) == 0)
-        throw KeyFault("ISetID", "there is no icon family \"" + Utf8::FromUString(name) + "\"");
-}
-
 GlogPane *MakeFrame(glogRec *glog, GlogStyleSheet *sheet) {
-    RequireIconFamily(TextUnder(sheet, "ISetID"));
+    RequireIconFamily(TextUnder(sheet, "ISetID"), "ISetID");
     FrameButtonPane *const button = FrameButtonPane::NewFrameButtonPane(glog, sheet->GetItemRes());
     if (!button)
         return nullptr;

@@ -6,6 +6,8 @@
 ItemRegistry::ItemRegistry() {
     AddButtonItems(*this);
     AddChoiceItems(*this);
+    AddIconItems(*this);
+    AddBoxItems(*this);
     AddLabelItems(*this);
     AddGroupItems(*this);
 }

@@ -24,10 +24,25 @@ short RecordBytes::Short() {
     return static_cast<short>(high << 8 | low);
 }
 
+int RecordBytes::Long() {
+    unsigned const low = static_cast<unsigned short>(Short());
+    unsigned const high = static_cast<unsigned short>(Short());
+    return static_cast<int>(high << 16 | low);
+}
+
 Point RecordBytes::ReadPoint() {
     short const v = Short();
     short const h = Short();
     return Point{v, h};
+}
+
+Rect RecordBytes::ReadRect() {
+    Rect rect;
+    rect.top = Short();
+    rect.left = Short();
+    rect.bottom = Short();
+    rect.right = Short();
+    return rect;
 }
 
 std::string RecordBytes::Rest() {

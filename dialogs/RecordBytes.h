@@ -15,7 +15,9 @@ public:
 
     unsigned char Byte();                          // the next 8 bits
     short Short();                                 // the next 16
+    int Long();                                    // the next 32
     Point ReadPoint();                             // v, then h
+    Rect ReadRect();                               // top, left, bottom, right
     std::string Rest();                            // what is left, as a text in UTF-8
     void Skip(std::size_t count);                  // leaves out bytes
     std::size_t Left() const { return size - at; } // how many bytes are still to be read

@@ -40,12 +40,16 @@ void CollectElements(XmlNode const &node, std::set<std::string> &names) {
     }
 }
 
+std::set<std::string> const kStockTypes = {"OvalButton",  "StudButton",    "FrameButton", "CheckBox",
+                                           "RadioButton", "Icon",          "IconButton",  "SuccessiveIcons",
+                                           "TwistDown",   "TrackSelector", "Box",         "BoxSelect",
+                                           "Label",       "Group",         "Spacer"};
+
 std::set<std::string> KeysOfStockTypes() {
     std::set<std::string> names = {"Items"};
     for (std::string const &key : CommonKeys::List().Names())
         names.insert(key);
-    for (char const *type :
-         {"OvalButton", "StudButton", "FrameButton", "CheckBox", "RadioButton", "Label", "Group", "Spacer"}) {
+    for (std::string const &type : kStockTypes) {
         for (std::string const &key : ItemRegistry::Instance().Find(type)->keys.Names())
             names.insert(key);
     }
@@ -55,7 +59,8 @@ std::set<std::string> KeysOfStockTypes() {
 TEST(Schema, KnowsTheKeysOfTheStockTypesAndNoOthers) {
     XmlFile const schema = XmlFile::Read(kSchema);
     std::set<std::string> known;
-    for (char const *group : {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Labels", "Groups"})
+    for (char const *group :
+         {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels", "Groups"})
         CollectElements(*Named(schema.Root(), "xs:group", group), known);
     EXPECT_EQ(known, KeysOfStockTypes());
 }
@@ -74,8 +79,7 @@ TEST(Schema, KnowsTheStockTypes) {
     std::set<std::string> known;
     for (XmlNode const &value : list.children)
         known.insert(*value.Attribute("value"));
-    EXPECT_EQ(known, (std::set<std::string>{"OvalButton", "StudButton", "FrameButton", "CheckBox",
-                                            "RadioButton", "Label", "Group", "Spacer"}));
+    EXPECT_EQ(known, kStockTypes);
     for (std::string const &name : known)
         EXPECT_NE(ItemRegistry::Instance().Find(name), nullptr) << name;
 }
@@ -110,6 +114,9 @@ protected:
 TEST_F(SchemaJudgement, TakesWhatTheLoaderTakes) {
     EXPECT_TRUE(Accepts("<BoundsRect top=\"1\" left=\"2\" bottom=\"3\" right=\"4\"/><TextNum>1</TextNum>"));
     EXPECT_TRUE(Accepts("<TextNum type=\"integer\"> 1 </TextNum><ButtonText list=\"4323\" index=\"1\"/>"));
+    EXPECT_TRUE(Accepts("<Style>panel</Style><Style type=\"integer\">2</Style>"));
+    EXPECT_TRUE(Accepts("<RectList><Box top=\"1\" left=\"2\" bottom=\"3\" right=\"4\"/></RectList>"));
+    EXPECT_TRUE(Accepts("<NumStates>3</NumStates><Width>1</Width>"));
     EXPECT_TRUE(Accepts("<Layout><GrowWidth>1</GrowWidth><InsetTop>2</InsetTop></Layout>"));
 }
 
@@ -121,6 +128,11 @@ TEST_F(SchemaJudgement, RefusesWhatTheLoaderRefuses) {
     EXPECT_FALSE(Accepts("<Visible>2</Visible>"));
     EXPECT_FALSE(Accepts("<Mode>256</Mode>"));
     EXPECT_FALSE(Accepts("<Layout><Alignment>4</Alignment></Layout>"));
+    EXPECT_FALSE(Accepts("<Style>plate</Style>"));
+    EXPECT_FALSE(Accepts("<Style>256</Style>"));
+    EXPECT_FALSE(Accepts("<RectList/>"));
+    EXPECT_FALSE(Accepts("<NumStates>0</NumStates>"));
+    EXPECT_FALSE(Accepts("<Width>0</Width>"));
     EXPECT_FALSE(Accepts("text"));
 }
 
