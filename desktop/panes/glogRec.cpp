@@ -48,9 +48,16 @@ void PositionGlog(glogRec *glog, Rect *place, bool redrawNow) {
         UpdateGlog(glog);
 }
 
+// A glog that is gone already is none of the desktop's: it is compared, and not looked into.
 void DisposeGlog(glogRec *glog) {
-    if (glog && Desktop::Current())
-        DesktopRep::Of(*Desktop::Current()).Dispose(&Glog::From(glog));
+    if (!Desktop::Current())
+        return;
+    for (Glog *known : DesktopRep::Of(*Desktop::Current()).Glogs()) {
+        if (known == glog) {
+            DesktopRep::Of(*Desktop::Current()).Dispose(known);
+            return;
+        }
+    }
 }
 
 bool GlogError(glogRec *glog) { return glog == nullptr || Glog::From(glog).disposed; }
