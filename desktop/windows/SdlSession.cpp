@@ -1,5 +1,7 @@
 #include "desktop/windows/SdlSession.h"
 #include <SDL.h>
+#include <X11/Xlib.h>
+#include <X11/Xproto.h>
 #include <cstring>
 #include <stdexcept>
 #include <string>
@@ -34,6 +36,17 @@ static Hint const kHints[] = {
     {SDL_HINT_NO_SIGNAL_HANDLERS, "0"},
 };
 
+// SDL wakes its own wait by sending an event to a window, over a second connection to the server. When that
+// window is closed at the same moment, the server refuses the event, and Xlib's own handler would end the
+// program.
+static XErrorHandler theFormerHandler = nullptr;
+
+static int IgnoreLateWakeUps(Display *display, XErrorEvent *error) {
+    if (error->error_code == BadWindow && error->request_code == X_SendEvent)
+        return 0;
+    return theFormerHandler(display, error);
+}
+
 static std::runtime_error NoDisplay(std::string const &reason) {
     return std::runtime_error("no display: " + reason);
 }
@@ -49,8 +62,12 @@ SdlSession::SdlSession() {
         SDL_QuitSubSystem(SDL_INIT_VIDEO);
         throw NoDisplay("the X server cannot be reached");
     }
+    theFormerHandler = XSetErrorHandler(IgnoreLateWakeUps);
     // Text input is on at first, and an input method would take the keys of shortcuts.
     SDL_StopTextInput();
 }
 
-SdlSession::~SdlSession() { SDL_QuitSubSystem(SDL_INIT_VIDEO); }
+SdlSession::~SdlSession() {
+    SDL_QuitSubSystem(SDL_INIT_VIDEO);
+    XSetErrorHandler(theFormerHandler);
+}
