@@ -178,6 +178,12 @@ TEST_F(RealWindow, TheScreenBoundsAreTheDisplays) {
     EXPECT_EQ(bounds.bottom, 768);
 }
 
+TEST_F(RealWindow, AnEventForOneThatWasJustClosedDoesNotEndTheProgram) {
+    Window window = Open(At(200, 150, 300, 200));
+    Screen().SendToAWindowThatIsGone();
+    window->SetTitle("still here");
+}
+
 TEST_F(RealWindow, TheTerminationSignalQuits) {
     Window window = Open(At(200, 150, 300, 200));
     std::system(("(sleep 0.3; kill -TERM " + std::to_string(getpid()) + ") &").c_str());

@@ -35,6 +35,18 @@ std::uint32_t XScreen::PixelAt(int x, int y) const {
            (static_cast<std::uint32_t>(colour.green >> 8) << 8) | (colour.blue >> 8);
 }
 
+void XScreen::SendToAWindowThatIsGone() const {
+    Display *display = connection->display;
+    Window window = XCreateSimpleWindow(display, DefaultRootWindow(display), 0, 0, 1, 1, 0, 0, 0);
+    XDestroyWindow(display, window);
+    XEvent event = {};
+    event.xclient.type = ClientMessage;
+    event.xclient.window = window;
+    event.xclient.format = 32;
+    XSendEvent(display, window, False, NoEventMask, &event);
+    XSync(display, False);
+}
+
 int XScreen::ColourBits() const {
     Display *display = connection->display;
     return DefaultDepth(display, DefaultScreen(display)) >= kDeepColourDepth ? kFullBits : kReducedBits;

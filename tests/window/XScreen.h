@@ -13,6 +13,9 @@ public:
     // The colour at the place of the screen, as 0xRRGGBB.
     std::uint32_t PixelAt(int x, int y) const;
     // Bits of each of the colours red, green and blue that the screen can show.
+    // Sends an event to a window that there is not, as happens when one closes at that moment; returns when
+    // the server has refused it.
+    void SendToAWindowThatIsGone() const;
     int ColourBits() const;
 
     struct PointerPicture {
