@@ -1,7 +1,6 @@
 #include "desktop/windows/SdlSession.h"
 #include <SDL.h>
-#include <X11/Xlib.h>
-#include <X11/Xproto.h>
+#include <SDL_syswm.h>
 #include <cstring>
 #include <stdexcept>
 #include <string>
@@ -36,13 +35,15 @@ static Hint const kHints[] = {
     {SDL_HINT_NO_SIGNAL_HANDLERS, "0"},
 };
 
+static unsigned char const kSendEventRequest = 25; // its number in the X protocol
+
 // SDL wakes its own wait by sending an event to a window, over a second connection to the server. When that
 // window is closed at the same moment, the server refuses the event, and Xlib's own handler would end the
 // program.
 static XErrorHandler theFormerHandler = nullptr;
 
 static int IgnoreLateWakeUps(Display *display, XErrorEvent *error) {
-    if (error->error_code == BadWindow && error->request_code == X_SendEvent)
+    if (error->error_code == BadWindow && error->request_code == kSendEventRequest)
         return 0;
     return theFormerHandler(display, error);
 }
