@@ -2,12 +2,14 @@
 #include "desktop/type/FontLibrary.h"
 #include "host/OSFont.h"
 
+static FontSpec SpecOf(int font) {
+    fontSaveRec const &record = *GetIndVelaFont(font);
+    return FontSpec::Make(record.family.GetOrderedFontID(), record.face, record.size);
+}
+
 BarePangoText::BarePangoText(cairo_surface_t *surface, char const *text, int font)
     : context(cairo_create(surface))
-    , layout(pango_layout_new(FontLibrary::Instance().Context())) {
-    fontSaveRec const &record = *GetIndVelaFont(font);
-    FontSpec const spec = FontSpec::Make(record.family.GetOrderedFontID(), record.face, record.size);
-    pango_layout_set_font_description(layout, FontLibrary::Instance().Description(spec));
+    , layout(FontLibrary::Instance().NewLayout(SpecOf(font))) {
     pango_layout_set_text(layout, text, -1);
     cairo_set_source_rgb(context, 0, 0, 0);
 }

@@ -5,8 +5,8 @@
 #include <cmath>
 #include <fontconfig/fontconfig.h>
 #include <pango/pangocairo.h>
-#include <pango/pangofc-fontmap.h>
 #include <set>
+#include <utility>
 
 // What is kept of a font once it was used.
 struct FontLibrary::Font {
@@ -40,17 +40,31 @@ std::set<std::string> FamiliesOf(FcFontSet const *set) {
     return families;
 }
 
-// Puts fonts behind those that are there. Other copies of the same families are left out: they would take
-// turns with the pinned files.
-void AppendOtherFamilies(FcFontSet *own, FcFontSet const *others) {
-    std::set<std::string> const ownFamilies = FamiliesOf(own);
+template <class Wanted> FcConfig *NewConfig(std::vector<FontFile> const &files, Wanted const &wanted) {
+    FcConfig *config = FcConfigCreate();
+    for (FontFile const &file : files) {
+        if (wanted(file))
+            FcConfigAppFontAddFile(config, FcText(file.path));
+    }
+    return config;
+}
+
+// Puts fonts behind those that are there, except those of the given families.
+void Append(FcFontSet *own, FcFontSet const *others, std::set<std::string> const &except = {}) {
     for (int i = 0; others && i < others->nfont; ++i) {
         FcPattern *font = others->fonts[i];
-        if (ownFamilies.count(FamilyOf(font)))
+        if (except.count(FamilyOf(font)))
             continue;
         FcPatternReference(font);
         FcFontSetAdd(own, font);
     }
+}
+
+// A map's thread looks into the tables of its map whenever it is done with a font, and the map does not wait
+// for it, neither when it goes away nor when its fonts change: a map is left as it is for good.
+void Retire(PangoFontMap *map) {
+    static std::vector<PangoFontMap *> &retired = *new std::vector<PangoFontMap *>; // outlives the exit
+    retired.push_back(map);
 }
 
 cairo_font_options_t *NewFontOptions() {
@@ -115,14 +129,13 @@ std::size_t FontLibrary::SpecHash::operator()(FontSpec const &spec) const {
     return hash * 1024 + static_cast<std::size_t>(spec.size);
 }
 
+// Never destroyed, as its map's thread may still be at work when the process ends.
 FontLibrary &FontLibrary::Instance() {
-    static FontLibrary library;
+    static FontLibrary &library = *new FontLibrary;
     return library;
 }
 
 FontLibrary::FontLibrary() {}
-
-FontLibrary::~FontLibrary() { Close(); }
 
 unsigned int FontLibrary::Generation() {
     if (resourceGeneration != Resources::Instance().Generation())
@@ -148,12 +161,19 @@ void FontLibrary::Refresh() {
     resourceGeneration = Resources::Instance().Generation();
 }
 
-// The configuration must be current before there is a font map, or the map loads the system's. The map takes
-// the current one: setting it as the map's own would leak it.
 void FontLibrary::Open() {
-    config = FcConfigCreate();
-    FcConfigSetCurrent(config);
-    LoadFace(0); // while there is no map yet: a map starts threads whenever its fonts change
+    UseConfig(FcConfigCreate());
+    LoadFace(0);
+    if (!context)
+        OpenMap();
+    if (!FcConfigGetFonts(config, FcSetApplication))
+        AddSystemFonts(); // better any text than none
+}
+
+// The configuration must be current before there is a font map, or the map loads the system's. The map takes
+// the current one: setting it as the map's own would leak it. What was shaped before keeps the map before.
+void FontLibrary::OpenMap() {
+    CloseMap();
     map = pango_cairo_font_map_new_for_font_type(CAIRO_FONT_TYPE_FT);
     context = pango_font_map_create_context(map);
     pango_context_set_language(context, pango_language_from_string(kShapingLanguage));
@@ -161,37 +181,40 @@ void FontLibrary::Open() {
     cairo_font_options_t *options = NewFontOptions();
     pango_cairo_context_set_font_options(context, options);
     cairo_font_options_destroy(options);
-    if (!FcConfigGetFonts(config, FcSetApplication))
-        AddSystemFonts(); // better any text than none
+}
+
+void FontLibrary::CloseMap() {
+    if (!context)
+        return;
+    g_object_unref(context);
+    Retire(map);
+    context = nullptr;
+    map = nullptr;
 }
 
 void FontLibrary::Close() {
     fonts.clear();
-    if (!context)
-        return;
-    g_object_unref(context);
-    g_object_unref(map);
-    FcConfigSetCurrent(nullptr);
-    FcConfigDestroy(config);
-    context = nullptr;
-    map = nullptr;
-    config = nullptr;
+    CloseMap();
+    UseConfig(nullptr);
     loadedFaces = 0;
     systemFonts = false;
 }
 
+// In a configuration of its own: a thread may still be looking through the one before.
 void FontLibrary::LoadFace(int faceBits) {
     std::uint64_t const bit = std::uint64_t(1) << faceBits;
     if (loadedFaces & bit)
         return;
     loadedFaces |= bit;
-    bool added = false;
-    for (FontFile const &file : files) {
-        if (file.face == faceBits && FcConfigAppFontAddFile(config, FcText(file.path)))
-            added = true;
+    FcConfig *grown = NewConfig(files, [faceBits](FontFile const &file) { return file.face == faceBits; });
+    FcFontSet *own = FcConfigGetFonts(grown, FcSetApplication);
+    if (!own) {
+        FcConfigDestroy(grown);
+        return;
     }
-    if (added && map)
-        pango_fc_font_map_config_changed(PANGO_FC_FONT_MAP(map));
+    Append(own, FcConfigGetFonts(config, FcSetApplication));
+    UseConfig(grown);
+    OpenMap();
 }
 
 FontLibrary::Font &FontLibrary::Find(FontSpec const &spec) {
@@ -204,12 +227,13 @@ FontLibrary::Font &FontLibrary::Find(FontSpec const &spec) {
     return found->second;
 }
 
-PangoContext *FontLibrary::Context() {
-    Generation();
-    return context;
+// The font comes first: finding it may change the context.
+PangoLayout *FontLibrary::NewLayout(FontSpec const &spec) {
+    PangoFontDescription const *description = Find(spec).description;
+    PangoLayout *layout = pango_layout_new(context);
+    pango_layout_set_font_description(layout, description);
+    return layout;
 }
-
-PangoFontDescription const *FontLibrary::Description(FontSpec const &spec) { return Find(spec).description; }
 
 FontMetrics const &FontLibrary::Metrics(FontSpec const &spec) {
     Font &font = Find(spec);
@@ -220,21 +244,22 @@ FontMetrics const &FontLibrary::Metrics(FontSpec const &spec) {
     return font.metrics;
 }
 
+// Other copies of the pinned files' families are left out: they would take turns with these.
 bool FontLibrary::AddSystemFonts() {
     if (systemFonts)
         return false;
     systemFonts = true;
-    for (FontFile const &file : files)
-        LoadFace(file.face);
     if (FcConfig *system = FcInitLoadConfigAndFonts()) {
-        if (FcFontSet *own = FcConfigGetFonts(config, FcSetApplication)) {
-            AppendOtherFamilies(own, FcConfigGetFonts(system, FcSetSystem));
-            FcConfigDestroy(system);
-        } else {
-            UseConfig(system);
+        FcConfig *grown = NewConfig(files, [](FontFile const &) { return true; });
+        if (FcFontSet *own = FcConfigGetFonts(grown, FcSetApplication)) {
+            Append(own, FcConfigGetFonts(system, FcSetSystem), FamiliesOf(own));
+            std::swap(grown, system);
         }
+        FcConfigDestroy(grown);
+        UseConfig(system);
     }
-    pango_fc_font_map_config_changed(PANGO_FC_FONT_MAP(map));
+    loadedFaces = ~std::uint64_t(0);
+    OpenMap();
     fonts.clear();
     ++generation;
     return true;
@@ -242,6 +267,7 @@ bool FontLibrary::AddSystemFonts() {
 
 void FontLibrary::UseConfig(FcConfig *other) {
     FcConfigSetCurrent(other);
-    FcConfigDestroy(config);
+    if (config)
+        FcConfigDestroy(config);
     config = other;
 }

@@ -10,8 +10,8 @@
 
 typedef struct _FcConfig FcConfig;
 typedef struct _PangoContext PangoContext;
-typedef struct _PangoFontDescription PangoFontDescription;
 typedef struct _PangoFontMap PangoFontMap;
+typedef struct _PangoLayout PangoLayout;
 
 // Whole logical pixels, the same at every scale.
 struct FontMetrics {
@@ -28,10 +28,8 @@ class FontLibrary {
 public:
     static FontLibrary &Instance();
 
-    // Shapes text; grayscale, glyphs on whole logical pixels.
-    PangoContext *Context();
-    // Valid until Generation changes.
-    PangoFontDescription const *Description(FontSpec const &);
+    // An empty layout, the caller's, with the font: grayscale, glyphs on whole logical pixels.
+    PangoLayout *NewLayout(FontSpec const &);
     FontMetrics const &Metrics(FontSpec const &);
 
     // Adds the system's fonts; false when they had been added before.
@@ -44,13 +42,15 @@ private:
     struct Font;
 
     FontLibrary();
-    ~FontLibrary();
+    ~FontLibrary() = delete;
     FontLibrary(FontLibrary const &) = delete;
     FontLibrary &operator=(FontLibrary const &) = delete;
 
     void Refresh();
     void Open();
     void Close();
+    void OpenMap();
+    void CloseMap();
     void LoadFace(int faceBits);
     void UseConfig(FcConfig *);
     Font &Find(FontSpec const &);

@@ -38,9 +38,7 @@ PangoAttrList *NewAttributes(TextShape const &shape) {
 }
 
 PangoLayout *NewLayout(std::string const &utf8, TextShape const &shape) {
-    FontLibrary &library = FontLibrary::Instance();
-    PangoLayout *layout = pango_layout_new(library.Context());
-    pango_layout_set_font_description(layout, library.Description(shape.font));
+    PangoLayout *layout = FontLibrary::Instance().NewLayout(shape.font);
     if (PangoAttrList *attributes = NewAttributes(shape)) {
         pango_layout_set_attributes(layout, attributes);
         pango_attr_list_unref(attributes);
