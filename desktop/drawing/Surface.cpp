@@ -36,13 +36,25 @@ void GetPages(void *start, std::size_t bytes) {
 #endif
 }
 
+std::size_t PixelCount(int width, int height) {
+    return static_cast<std::size_t>(width) * static_cast<std::size_t>(height);
+}
+
 std::vector<std::uint32_t> NewPixels(int width, int height) {
-    std::size_t const count = static_cast<std::size_t>(width) * static_cast<std::size_t>(height);
+    std::size_t const count = PixelCount(width, height);
     std::vector<std::uint32_t> pixels;
     pixels.reserve(count);
     GetPages(pixels.data(), count * sizeof(std::uint32_t));
     pixels.assign(count, kOpaqueBlack);
     return pixels;
+}
+
+pixman_image_t *NewImage(std::uint32_t *pixels, int width, int height) {
+    pixman_image_t *image = pixman_image_create_bits_no_clear(
+        PIXMAN_a8r8g8b8, width, height, pixels, width * static_cast<int>(sizeof(std::uint32_t)));
+    if (!image)
+        throw std::bad_alloc();
+    return image;
 }
 
 struct CairoSurfaceFree {
@@ -83,12 +95,20 @@ bool PngSizeIsSane(std::string const &path, std::string &error) {
 Surface::Surface(int width_, int height_)
     : width(std::max(width_, 1))
     , height(std::max(height_, 1))
-    , pixels(NewPixels(width, height))
-    , image(pixman_image_create_bits_no_clear(PIXMAN_a8r8g8b8, width, height, pixels.data(),
-                                              width * static_cast<int>(sizeof(std::uint32_t))))
+    , own(NewPixels(width, height))
+    , pixels(own.data())
+    , image(NewImage(pixels, width, height))
+    , cairo(nullptr) {}
+
+Surface::Surface(std::uint32_t *memory, int width_, int height_)
+    : width(width_)
+    , height(height_)
+    , pixels(memory)
+    , image(NewImage(pixels, width, height))
     , cairo(nullptr) {
-    if (!image)
-        throw std::bad_alloc();
+    std::size_t const count = PixelCount(width, height);
+    GetPages(pixels, count * sizeof(std::uint32_t));
+    std::fill_n(pixels, count, kOpaqueBlack);
 }
 
 Surface::~Surface() {
@@ -101,20 +121,20 @@ Surface::~Surface() {
 
 cairo_surface_t *Surface::CairoSurface() {
     if (!cairo)
-        cairo = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(pixels.data()),
+        cairo = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(pixels),
                                                     CAIRO_FORMAT_ARGB32, width, height,
                                                     width * static_cast<int>(sizeof(std::uint32_t)));
     return cairo;
 }
 
 bool Surface::IsOpaque() const {
-    return std::all_of(pixels.begin(), pixels.end(),
+    return std::all_of(pixels, pixels + PixelCount(width, height),
                        [](std::uint32_t pixel) { return (pixel & kAlphaMask) == kAlphaMask; });
 }
 
 bool Surface::WritePng(std::string const &path, std::string &error) const {
     // Cairo only reads from the surface while it writes the file.
-    unsigned char *data = reinterpret_cast<unsigned char *>(const_cast<std::uint32_t *>(pixels.data()));
+    unsigned char *data = reinterpret_cast<unsigned char *>(pixels);
     CairoSurfaceHolder view(
         cairo_image_surface_create_for_data(data, IsOpaque() ? CAIRO_FORMAT_RGB24 : CAIRO_FORMAT_ARGB32,
                                             width, height, width * static_cast<int>(sizeof(std::uint32_t))));

@@ -185,7 +185,8 @@ void Glog::SetMaxSize(int w, int h) {
 
 void Glog::MakeSurface() {
     port.SetSurface(nullptr, scale);
-    surface.reset(new Surface(scale.Edge(width), scale.Edge(height)));
+    surface.reset(); // before the window gives another
+    surface = window->NewSurface(scale.Edge(width), scale.Edge(height));
     port.SetSurface(surface.get(), scale);
     port.SetExtent(width, height);
     DamageAll();
@@ -328,7 +329,10 @@ void Glog::DrawDamage(OSRgn const &region) {
 }
 
 void Glog::Present(std::vector<DeviceRect> const &rects) {
-    window->Present(*surface, rects.data(), rects.size());
+    if (window->Present(*surface, rects.data(), rects.size()))
+        return;
+    MakeSurface();
+    Update();
 }
 
 void Glog::PresentAll() {

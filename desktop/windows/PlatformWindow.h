@@ -3,6 +3,7 @@
 #include "desktop/drawing/DeviceScale.h"
 #include "host/Geometry.h"
 #include <cstddef>
+#include <memory>
 #include <string>
 
 class PlatformWindow;
@@ -34,9 +35,13 @@ public:
     virtual int Height() const = 0;
     virtual Point ScreenPlace() const = 0; // of the content's top left
     virtual double Scale() const = 0;
+    // A surface that Present shows faster than others where the window system can give its own memory. Only
+    // one may be there at a time: let go of it before the next call, and before the window.
+    virtual std::unique_ptr<Surface> NewSurface(int deviceWidth, int deviceHeight);
     // Copies the rectangles of the surface to the screen. They may reach beyond the surface; what does is not
-    // copied.
-    virtual void Present(Surface const &, DeviceRect const *, std::size_t count) = 0;
+    // copied. False, with nothing shown, when the window system has dropped the memory that NewSurface gave,
+    // as it does when the window's size changes: that surface may still be drawn on, but another is needed.
+    virtual bool Present(Surface const &, DeviceRect const *, std::size_t count) = 0;
     // Lets an input method work at the place (content coordinates), or stops it.
     virtual void StartTextInput(Rect const &caret) = 0;
     virtual void StopTextInput() = 0;

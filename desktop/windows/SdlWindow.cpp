@@ -153,24 +153,47 @@ static void CopyPixels(Surface const &from, DeviceRect const &rect, SDL_Surface 
                       from.Width() * kSurfacePixelBytes, to.format->format, target, to.pitch);
 }
 
+static bool HasFormatOfSurfaces(SDL_Surface const &screen) {
+    return screen.format->format == kSurfaceFormat && screen.pitch == screen.w * kSurfacePixelBytes;
+}
+
+std::unique_ptr<Surface> SdlWindow::NewSurface(int deviceWidth, int deviceHeight) {
+    lent = nullptr;
+    SDL_Surface *screen = SDL_GetWindowSurface(window);
+    if (screen == nullptr || screen->w != deviceWidth || screen->h != deviceHeight ||
+        !HasFormatOfSurfaces(*screen))
+        return PlatformWindow::NewSurface(deviceWidth, deviceHeight);
+    std::unique_ptr<Surface> surface(
+        new Surface(static_cast<std::uint32_t *>(screen->pixels), deviceWidth, deviceHeight));
+    lent = surface->Pixels();
+    return surface;
+}
+
 // A rectangle that lies wholly outside the window would be refused by the X server, which ends the program:
 // nothing but what both have goes there. They differ between a resize and the surface that answers it.
-void SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
-    SDL_Surface *screen = SDL_GetWindowSurface(window);
-    if (screen == nullptr)
-        return; // the server is out of memory for pictures: the next exposure tries again
-    DeviceRect common = {0, 0, std::min(surface.Width(), screen->w), std::min(surface.Height(), screen->h)};
+bool SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
+    bool const inPlace = lent != nullptr && surface.Pixels() == lent;
+    SDL_Surface *screen = inPlace ? nullptr : SDL_GetWindowSurface(window);
+    DeviceRect common = {0, 0, surface.Width(), surface.Height()};
+    if (screen != nullptr)
+        common = common.Intersected({0, 0, screen->w, screen->h});
+    else if (!inPlace)
+        return true; // the server is out of memory for pictures: the next exposure tries again
     updated.clear();
     for (std::size_t i = 0; i < count; ++i) {
         DeviceRect rect = rects[i].Intersected(common);
         if (rect.Empty())
             continue;
-        CopyPixels(surface, rect, *screen);
+        if (screen != nullptr)
+            CopyPixels(surface, rect, *screen);
         updated.push_back({rect.left, rect.top, rect.Width(), rect.Height()});
     }
     keptHidden = (SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) != 0;
-    if (!updated.empty() && !keptHidden)
+    if (updated.empty() || keptHidden)
+        return true;
+    int const refused =
         SDL_UpdateWindowSurfaceRects(window, updated.data(), static_cast<int>(updated.size()));
+    return refused == 0 || !inPlace;
 }
 
 void SdlWindow::StartTextInput(Rect const &caret) {

@@ -2,14 +2,16 @@
 #pragma once
 #include "desktop/windows/PlatformWindow.h"
 #include <cstdint>
+#include <memory>
 #include <vector>
 
 struct SDL_Rect;
 struct SDL_Window;
 class SdlWindowSystem;
 
-// Larger than its logical size by its scale. Its pixels are copied from the surfaces that are presented and
-// kept by SDL only until the next resize. The window system must outlive it.
+// Larger than its logical size by its scale. SDL keeps its pixels in memory that NewSurface gives away where
+// it suits, and that other surfaces are copied to; only until the next resize. The window system must outlive
+// it.
 class SdlWindow : public PlatformWindow {
 public:
     // Throws std::runtime_error with SDL's reason.
@@ -50,7 +52,8 @@ public:
     int Height() const override { return height; }
     Point ScreenPlace() const override;
     double Scale() const override { return scale.Factor(); }
-    void Present(Surface const &, DeviceRect const *, std::size_t count) override;
+    std::unique_ptr<Surface> NewSurface(int deviceWidth, int deviceHeight) override;
+    bool Present(Surface const &, DeviceRect const *, std::size_t count) override;
     void StartTextInput(Rect const &caret) override;
     void StopTextInput() override;
 
@@ -73,6 +76,7 @@ private:
     SizeLimits limits;
     bool placePending; // `placeH` and `placeV` wait for the frame
     int placeH, placeV;
-    bool keptHidden = false;       // SDL has a picture of ours that could not be shown yet
-    std::vector<SDL_Rect> updated; // of one Present; kept for its memory
+    std::uint32_t const *lent = nullptr; // SDL's pixels that a surface of ours lies in
+    bool keptHidden = false;             // SDL has a picture of ours that could not be shown yet
+    std::vector<SDL_Rect> updated;       // of one Present; kept for its memory
 };

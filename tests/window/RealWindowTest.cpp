@@ -246,6 +246,46 @@ TEST_F(Picture, ASurfaceOfAnotherSizeThanTheWindowIsCut) {
     ExpectPixel(*window, 99, 79, 0x00A000);
 }
 
+TEST_F(Picture, TheWindowsOwnSurfaceIsShownWhereItIsPresented) {
+    Window window = Open(At(200, 150, 100, 80));
+    Fill(*window, 0x102030);
+    std::unique_ptr<Surface> surface = window->NewSurface(100, 80);
+    std::fill(surface->Pixels(), surface->Row(80), 0xFFF0E0D0U);
+    ExpectPixel(*window, 15, 15, 0x102030);
+    DeviceRect rect = {10, 10, 20, 20};
+    EXPECT_TRUE(window->Present(*surface, &rect, 1));
+    ExpectPixel(*window, 19, 19, 0xF0E0D0);
+    ExpectPixel(*window, 20, 19, 0x102030);
+}
+
+TEST_F(Picture, TheWindowsOwnSurfaceIsRefusedAfterAResize) {
+    Window window = Open(At(200, 150, 100, 80));
+    std::unique_ptr<Surface> surface = window->NewSurface(100, 80);
+    DeviceRect all = {0, 0, 120, 90};
+    EXPECT_TRUE(window->Present(*surface, &all, 1));
+    window->SetContentSize(120, 90);
+    Await(InputEvent::kResized);
+    EXPECT_FALSE(window->Present(*surface, &all, 1));
+    std::fill(surface->Pixels(), surface->Row(80), 0xFF00A000U); // what draws on it still may
+    surface.reset();
+    surface = window->NewSurface(120, 90);
+    std::fill(surface->Pixels(), surface->Row(90), 0xFF336699U);
+    EXPECT_TRUE(window->Present(*surface, &all, 1));
+    ExpectPixel(*window, 119, 89, 0x336699);
+}
+
+TEST_F(Picture, AnotherSizeThanTheWindowsGetsASurfaceOfItsOwn) {
+    Window window = Open(At(200, 150, 100, 80));
+    Fill(*window, 0x101010);
+    std::unique_ptr<Surface> surface = window->NewSurface(40, 30);
+    ASSERT_EQ(surface->Width(), 40);
+    std::fill(surface->Pixels(), surface->Row(30), 0xFFC00000U);
+    DeviceRect all = {0, 0, 100, 80};
+    EXPECT_TRUE(window->Present(*surface, &all, 1));
+    ExpectPixel(*window, 39, 29, 0xC00000);
+    ExpectPixel(*window, 40, 30, 0x101010);
+}
+
 TEST_F(Picture, NothingToPresentIsNothing) {
     Window window = Open(At(200, 150, 100, 80));
     Fill(*window, 0x405060);
