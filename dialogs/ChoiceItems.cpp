@@ -12,15 +12,17 @@
 #include "dialogs/Utf8.h"
 #include "frame/ResourceReading.h"
 #include "host/GlogStyleSheet.h"
+#include <limits>
 
 namespace {
 
 typedef boost::shared_ptr<XMLLib::ContainerItem> Container;
 
-long long const kLargestSpacing = 1000;    // pixels
-long long const kLargestExtension = 16000; // pixels
-long long const kLargestByte = 255;
-long long const kLargestMode = 1;
+int const kLargestSpacing = 1000;    // pixels
+int const kLargestExtension = 16000; // pixels
+int const kLargestFont = 255;
+int const kLargestMode = 1;
+std::size_t const kMostButtons = std::numeric_limits<short>::max();
 
 char const kButtonsKey[] = "RadioCheckButtonItems";
 char const kButtonKey[] = "Button";
@@ -103,6 +105,14 @@ template <class Function> void ForEachButton(GlogStyleSheet *sheet, Function con
         function(static_cast<short>(i), XMLLib::ContainerFromItem(buttons->GetNthItem(i)));
 }
 
+// Indices of buttons are 16 bits wide.
+void RequireButtonCount(GlogStyleSheet *sheet) {
+    std::size_t const count = sheet->GetContainerItem(ResourceKey(kButtonsKey))->GetNumItems();
+    if (count < 1 || count > kMostButtons)
+        throw KeyFault(kButtonsKey, "expected 1 to " + std::to_string(kMostButtons) + " buttons, found " +
+                                        std::to_string(count));
+}
+
 // Creators of their own read no enabling.
 void SetModes(GlogStyleSheet *sheet, ButtonGroupPane *group) {
     ForEachButton(sheet, [group](short index, Container const &button) {
@@ -112,6 +122,7 @@ void SetModes(GlogStyleSheet *sheet, ButtonGroupPane *group) {
 }
 
 GlogPane *MakeCheckBoxes(glogRec *glog, GlogStyleSheet *sheet) {
+    RequireButtonCount(sheet);
     CheckBoxPane *const group = CheckBoxPane::NewCheckBoxPane(glog, sheet);
     if (!group)
         return nullptr;
@@ -137,6 +148,7 @@ short CurrentButton(GlogStyleSheet *sheet) {
 }
 
 GlogPane *MakeRadioButtons(glogRec *glog, GlogStyleSheet *sheet) {
+    RequireButtonCount(sheet);
     short const current = CurrentButton(sheet);
     RadioButtonPane *const group = RadioButtonPane::NewRadioButtonPane(glog, sheet);
     if (!group)
@@ -167,7 +179,7 @@ UString ReadText(RecordBytes &bytes) {
 Container ReadString(RecordBytes &bytes) {
     Container item = XMLLib::CreateContainer(ResourceKey(kStringKey));
     AddOrigin(*item, bytes.ReadPoint());
-    item->AddSIntItem(ResourceKey("FSRID"), bytes.Short());
+    item->AddSIntItem(ResourceKey("FSRID"), bytes.Short("FSRID", 0, kLargestFont));
     item->AddUStringItem(ResourceKey("Text"), ReadText(bytes));
     return item;
 }
@@ -175,7 +187,7 @@ Container ReadString(RecordBytes &bytes) {
 Container ReadButton(RecordBytes &bytes) {
     Container item = XMLLib::CreateContainer(ResourceKey(kButtonKey));
     AddOrigin(*item, bytes.ReadPoint());
-    item->AddSIntItem(ResourceKey("HitExtension"), bytes.Short());
+    item->AddSIntItem(ResourceKey("HitExtension"), bytes.Short("HitExtension", 0, kLargestExtension));
     Container const strings = XMLLib::CreateContainer(ResourceKey(kStringsKey));
     for (int left = ReadCount(bytes); left > 0; --left)
         strings->AddItem(ResourceKey(kStringKey), ReadString(bytes));
@@ -187,12 +199,9 @@ Container ReadRecord(RecordBytes &bytes) {
     Container item = XMLLib::CreateContainer(ResourceKey("Item"));
     bytes.Short(); // the kind
     item->AddSIntItem(ResourceKey("Flags"), bytes.Short());
-    item->AddSIntItem(ResourceKey("LineSpacing"), bytes.Short());
+    item->AddSIntItem(ResourceKey("LineSpacing"), bytes.Short("LineSpacing", 0, kLargestSpacing));
     Container const buttons = XMLLib::CreateContainer(ResourceKey(kButtonsKey));
-    int const count = ReadCount(bytes);
-    if (count == 0)
-        throw KeyFault(kButtonsKey, "there are no buttons");
-    for (int left = count; left > 0; --left)
+    for (int left = ReadCount(bytes); left > 0; --left)
         buttons->AddItem(ResourceKey(kButtonKey), ReadButton(bytes));
     item->AddItem(ResourceKey(kButtonsKey), buttons);
     return item;
@@ -211,7 +220,7 @@ GlogPane *MakeRadioButtonsFromRecord(glogRec *glog, RecordBytes &bytes) {
 // Keys
 
 KeyList StringKeys() {
-    return KeyList().Point("Origin").Integer("FSRID", 0, kLargestByte).String("Text").Required();
+    return KeyList().Point("Origin").Integer("FSRID", 0, kLargestFont).String("Text").Required();
 }
 
 KeyList ButtonKeys() {

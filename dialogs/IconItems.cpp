@@ -7,7 +7,6 @@
 #include "desktop/observe/TreeDump.h"
 #include "dialogs/IconFamilyKey.h"
 #include "dialogs/ItemRegistry.h"
-#include "dialogs/KeyFault.h"
 #include "dialogs/MessageReporter.h"
 #include "dialogs/PressReporter.h"
 #include "dialogs/RecordBytes.h"
@@ -19,13 +18,6 @@ namespace {
 
 long long const kLargestByte = 255;
 short const kTrackSelectorWidth = 15, kTrackSelectorHeight = 16; // pixels
-
-// Numbers that come from a record, where no list of keys has judged them.
-void RequireAtLeast(int smallest, int value, char const *key) {
-    if (value < smallest)
-        throw KeyFault(key, std::string(key) + " is " + std::to_string(value) + ", but at least " +
-                                std::to_string(smallest) + " is needed");
-}
 
 void RequireFamilyUnder(GlogStyleSheet *sheet) {
     RequireIconFamily(sheet->GetUStringItemValue(ResourceKey("FamilyID")), "FamilyID");
@@ -131,11 +123,9 @@ void ReadIcon(RecordBytes &bytes, GIconResRec &record) {
     record.width = bytes.Short();
     record.height = bytes.Short();
     record.family = bytes.Short();
-    record.icon = bytes.Short();
-    record.numStates = bytes.Short();
+    record.icon = bytes.Short("Num", 0, KeyList::kLargest);
+    record.numStates = bytes.Short("NumStates", 1, KeyList::kLargest);
     record.canDisable = bytes.Short();
-    RequireAtLeast(0, record.icon, "Num");
-    RequireAtLeast(1, record.numStates, "NumStates");
 }
 
 GlogPane *MakeIconFromRecord(glogRec *glog, RecordBytes &bytes) {
@@ -147,14 +137,13 @@ GlogPane *MakeIconFromRecord(glogRec *glog, RecordBytes &bytes) {
 GlogPane *MakeIconButtonFromRecord(glogRec *glog, RecordBytes &bytes) {
     GIconButtonResRec record;
     ReadIcon(bytes, record);
-    record.numDownStates = bytes.Short();
+    record.numDownStates = bytes.Short("NumDownStates", 1, KeyList::kLargest);
     record.canCancel = bytes.Byte();
     record.notifyWindow = bytes.Byte();
     record.cmdClassID = bytes.Short();
     record.optCmdClassID = bytes.Short();
     record.cmdID = bytes.Short();
     record.optCmdID = bytes.Short();
-    RequireAtLeast(1, record.numDownStates, "NumDownStates");
     return GIconButton::NewGIconButton(glog, &record);
 }
 
@@ -164,12 +153,8 @@ GlogPane *MakeStripFromRecord(glogRec *glog, RecordBytes &bytes) {
     record.bounds = bytes.ReadRect();
     bytes.Short(); // fills up to a multiple of four bytes
     record.family = bytes.Long();
-    record.baseIcon = bytes.Long();
-    record.width = bytes.Long();
-    RequireAtLeast(0, record.baseIcon, "BaseIcon");
-    RequireAtLeast(1, record.width, "Width");
-    if (record.baseIcon > KeyList::kLargest || record.width > KeyList::kLargest)
-        throw KeyFault("Width", "an icon number or width is larger than 32767");
+    record.baseIcon = bytes.Long("BaseIcon", 0, KeyList::kLargest);
+    record.width = bytes.Long("Width", 1, KeyList::kLargest);
     return new SuccessiveIconsPane(glog, &record);
 }
 

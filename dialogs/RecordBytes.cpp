@@ -30,6 +30,24 @@ int RecordBytes::Long() {
     return static_cast<int>(high << 16 | low);
 }
 
+int RecordBytes::Within(LoadError::Place place, char const *key, int value, int smallest, int largest) {
+    if (value >= smallest && value <= largest)
+        return value;
+    place.key = key;
+    throw LoadError(place, "expected an integer from " + std::to_string(smallest) + " to " +
+                               std::to_string(largest) + ", found " + std::to_string(value));
+}
+
+short RecordBytes::Short(char const *key, int smallest, int largest) {
+    LoadError::Place const place = Place();
+    return static_cast<short>(Within(place, key, Short(), smallest, largest));
+}
+
+int RecordBytes::Long(char const *key, int smallest, int largest) {
+    LoadError::Place const place = Place();
+    return Within(place, key, Long(), smallest, largest);
+}
+
 Point RecordBytes::ReadPoint() {
     short const v = Short();
     short const h = Short();

@@ -13,9 +13,12 @@ public:
     // its first byte.
     RecordBytes(unsigned char const *bytes, std::size_t size, LoadError::Place const &place);
 
-    unsigned char Byte();                          // the next 8 bits
-    short Short();                                 // the next 16
-    int Long();                                    // the next 32
+    unsigned char Byte(); // the next 8 bits
+    short Short();        // the next 16
+    int Long();           // the next 32
+    // The same, but a number outside of the limits, which are both allowed, throws a LoadError under the key.
+    short Short(char const *key, int smallest, int largest);
+    int Long(char const *key, int smallest, int largest);
     Point ReadPoint();                             // v, then h
     Rect ReadRect();                               // top, left, bottom, right
     std::string Rest();                            // what is left, as a text in UTF-8
@@ -26,6 +29,8 @@ public:
     LoadError::Place Place() const;
 
 private:
+    static int Within(LoadError::Place, char const *key, int value, int smallest, int largest);
+
     unsigned char const *bytes;
     std::size_t size;
     std::size_t at = 0;

@@ -85,8 +85,15 @@ void RecordFile::MakePanes(glogRec *glog) const {
         Make(glog, entry, ++id);
 }
 
+// Makers do not tell where in the record the key's number stood.
+LoadError::Place RecordFile::PlaceOf(Entry const &entry, std::string const &key) {
+    LoadError::Place place = entry.place;
+    place.key = key;
+    return place;
+}
+
 void RecordFile::Make(glogRec *glog, Entry const &entry, int id) const {
-    PaneMaker::Guard([&](std::string const &) { return entry.place; },
+    PaneMaker::Guard([&](std::string const &key) { return PlaceOf(entry, key); },
                      [&] {
                          RecordBytes record(entry.bytes, entry.size, entry.place);
                          GlogPane *const pane = entry.type->recordMaker(glog, record);

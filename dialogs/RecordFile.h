@@ -41,6 +41,7 @@ private:
     };
 
     static Entry ReadEntry(RecordBytes &, unsigned char const *start, int id);
+    static LoadError::Place PlaceOf(Entry const &, std::string const &key);
     void Make(glogRec *, Entry const &, int id) const;
 
     int width = 0, height = 0;

@@ -169,9 +169,79 @@ TEST_F(ChoiceItems, OfRecordsCutAtAnyLengthAreAnError) {
 }
 
 TEST_F(ChoiceItems, OfRecordsNeedButtonsAndTheBytesForThem) {
-    std::string const none = AboutRecord(Shorts({54, 0, 16, 0}));
-    EXPECT_TRUE(Holds(none, "there are no buttons")) << none;
+    EXPECT_EQ(AboutRecord(Shorts({54, 0, 16, 0})),
+              "records: byte 16: item 1 (CheckBox): key RadioCheckButtonItems: expected 1 to 32767 buttons, "
+              "found 0");
     EXPECT_TRUE(Holds(AboutRecord(Shorts({53, 0, 16, 0xFFFF, 0, 0})), "before it is complete"));
+    EXPECT_TRUE(
+        Holds(AboutRecord(Shorts({53, 0, 16, 1}) + Shorts({20, 20, 6, 0xFFFF})), "before it is complete"));
+    EXPECT_TRUE(Holds(
+        AboutRecord(Shorts({53, 0, 16, 1}) + Shorts({20, 20, 6, 1}) + Shorts({31, 38, 0, 0xFFFF}) + "One"),
+        "before it is complete"));
+    EXPECT_TRUE(Holds(AboutRecord(Record(54) + "?"), "1 byte after the record's last field"));
+}
+
+TEST_F(ChoiceItems, OfRecordsRefuseSpacingsExtensionsAndFontsThatThereAreNot) {
+    auto const about = [this](int spacing, int extension, int font) {
+        return AboutRecord(Shorts({54, 0, spacing, 1}) + Shorts({20, 20, extension, 1}) +
+                           Shorts({31, 38, font, 1}) + "x");
+    };
+    EXPECT_EQ(about(-1, 0, 0), "records: byte 20: item 1 (CheckBox): key LineSpacing: expected an integer "
+                               "from 0 to 1000, found -1");
+    EXPECT_EQ(about(0, 16001, 0), "records: byte 28: item 1 (CheckBox): key HitExtension: expected an "
+                                  "integer from 0 to 16000, found 16001");
+    EXPECT_EQ(about(0, 0, -1), "records: byte 36: item 1 (CheckBox): key FSRID: expected an integer from 0 "
+                               "to 255, found -1");
+    EXPECT_EQ(about(0, 0, 255), "no complaint");
+}
+
+TEST_F(ChoiceItems, RefuseMoreButtonsThanThereAreIndices) {
+    std::string const button = "<Button><RadioCheckButtonStrings/></Button>";
+    std::string all;
+    for (int i = 0; i < 32768; ++i)
+        all += button;
+    for (char const *type : {"CheckBox", "RadioButton"}) {
+        std::string const complaint = ComplaintAboutItem(type, Group(all));
+        EXPECT_TRUE(Holds(complaint, "key RadioCheckButtonItems: expected 1 to 32767 buttons, found 32768"))
+            << complaint;
+    }
+}
+
+TEST_F(ChoiceItems, OfAsManyButtonsAsThereAreIndicesAreMade) {
+    std::string const button = "<Button><RadioCheckButtonStrings/></Button>";
+    std::string all;
+    for (int i = 0; i < 32766; ++i)
+        all += button;
+    all += "<Button><RadioCheckButtonStrings/><State>1</State></Button>";
+    RadioButtonPane *const group = LoadOne<RadioButtonPane>("RadioButton", Group(all));
+    EXPECT_EQ(group->CountButtons(), 32767);
+    EXPECT_EQ(group->RadioGet(), 32766);
+}
+
+TEST_F(ChoiceItems, RefuseMoreLabelsThanThereAreKeysForTexts) {
+    std::string label = "<String><Text>x</Text></String>", all;
+    for (int i = 0; i < 32768; ++i)
+        all += label;
+    EXPECT_TRUE(Holds(ComplaintAboutItem("CheckBox", Group("<Button><RadioCheckButtonStrings>" + all +
+                                                           "</RadioCheckButtonStrings></Button>")),
+                      "memory has run out"));
+    EXPECT_EQ(LoadOne<CheckBoxPane>("CheckBox", Group(kTwo))->CountButtonTexts(), 2) << "keys were lost";
+}
+
+TEST_F(ChoiceItems, RefuseNumbersOutOfRange) {
+    EXPECT_TRUE(Holds(ComplaintAboutItem("CheckBox", "<LineSpacing>-1</LineSpacing>" +
+                                                         Group(kTwo).substr(Group("").find("<Radio"))),
+                      "key LineSpacing: expected an integer from 0 to 1000, found -1"));
+    EXPECT_TRUE(Holds(ComplaintAboutItem("CheckBox", Group("<Button><HitExtension>-1</HitExtension>"
+                                                           "<RadioCheckButtonStrings/></Button>")),
+                      "HitExtension: expected an integer from 0 to 16000, found -1"));
+    EXPECT_TRUE(Holds(
+        ComplaintAboutItem("CheckBox", Group("<Button><RadioCheckButtonStrings><String><FSRID>256</FSRID>"
+                                             "<Text>x</Text></String></RadioCheckButtonStrings></Button>")),
+        "FSRID: expected an integer from 0 to 255, found 256"));
+    EXPECT_TRUE(Holds(ComplaintAboutItem("CheckBox", Group("<Button><Origin v=\"40000\" h=\"0\"/>"
+                                                           "<RadioCheckButtonStrings/></Button>")),
+                      "expected an integer from -32768 to 32767, found 40000"));
 }
 
 } // namespace

@@ -184,6 +184,33 @@ TEST_F(IconItems, RefuseToHaveNoStatesOrNoWidth) {
     EXPECT_TRUE(Holds(ComplaintAboutItem("SuccessiveIcons", family + "<Width>0</Width>"), "Width"));
 }
 
+TEST_F(IconItems, TellWhichNumberIsOutOfItsRange) {
+    std::string const family = "<FamilyID>kNoteGlyphs</FamilyID>";
+    EXPECT_EQ(ComplaintAboutItem("IconButton", family + "<NumStates>1</NumStates>\n <NumDownStates>0"
+                                                        "</NumDownStates>"),
+              "test.xml:2:2: item 1 (IconButton): key NumDownStates: expected an integer from 1 to 32767, "
+              "found 0");
+    EXPECT_EQ(ComplaintAboutItem("SuccessiveIcons", family + "\n<Width>0</Width>"),
+              "test.xml:2:1: item 1 (SuccessiveIcons): key Width: expected an integer from 1 to 32767, found "
+              "0");
+    EXPECT_EQ(ComplaintAboutItem("SuccessiveIcons", family + "\n<Width>32768</Width>"),
+              "test.xml:2:1: item 1 (SuccessiveIcons): key Width: expected an integer from 1 to 32767, found "
+              "32768");
+    EXPECT_TRUE(Holds(ComplaintAboutItem("Icon", family + "<NumStates>1</NumStates><Num>-1</Num>"),
+                      "key Num: expected an integer from 0 to 32767, found -1"));
+    EXPECT_TRUE(Holds(ComplaintAboutItem("Icon", family + "<NumStates>99999999999999999999</NumStates>"),
+                      "key NumStates: "));
+}
+
+TEST_F(IconItems, RefuseMoreBoxesThanThereAreIndices) {
+    std::string all;
+    for (int i = 0; i < 32768; ++i)
+        all += "<Box top=\"0\" left=\"0\" bottom=\"1\" right=\"1\"/>";
+    for (char const *mode : {"<Mode>0</Mode>", "<Mode>1</Mode>"})
+        EXPECT_TRUE(Holds(ComplaintAboutItem("BoxSelect", mode + ("<RectList>" + all + "</RectList>")),
+                          "item 1 (BoxSelect): key RectList: expected 1 to 32767 boxes, found 32768"));
+}
+
 TEST_F(IconItems, RefuseASelectionWithoutBoxes) {
     EXPECT_TRUE(Holds(ComplaintAboutItem("BoxSelect", "<Mode>1</Mode>"), "RectList"));
     EXPECT_TRUE(Holds(ComplaintAboutItem("BoxSelect", "<RectList/>"), "Box"));
@@ -231,14 +258,52 @@ TEST_F(IconRecords, MakeBoxSelectionsOfEmptyBoxes) {
 }
 
 TEST_F(IconRecords, RefuseCountsAndWidthsBelowOne) {
-    EXPECT_TRUE(Holds(About(Shorts({47, 20, 30, 20, 16, 2000, 5, 0, 1})), "NumStates is 0"));
-    EXPECT_TRUE(Holds(About(Shorts({47, 20, 30, 20, 16, 2000, -1, 1, 1})), "Num is -1"));
-    EXPECT_TRUE(
-        Holds(About(Shorts({49, 20, 30, 20, 16, 2000, 5, 2, 1, 0, 0, 0, 0, 0, 0})), "NumDownStates is 0"));
-    EXPECT_TRUE(Holds(About(Shorts({64, 20, 30, 36, 50, 0, 1821, 0, 3, 0, 0, 0})), "Width is 0"));
-    EXPECT_TRUE(Holds(About(Shorts({64, 20, 30, 36, 50, 0, 1821, 0, 3, 0, 0, 1})), "larger than 32767"));
-    EXPECT_TRUE(Holds(About(Shorts({14, 0, 0})), "expected 1 to 32767 boxes, found 0"));
-    EXPECT_TRUE(Holds(About(Shorts({14, -3, 1 << 8})), "expected 1 to 32767 boxes, found -3"));
+    EXPECT_EQ(
+        About(Shorts({47, 20, 30, 20, 16, 2000, 5, 0, 1})),
+        "old.glog: byte 30: item 1 (Icon): key NumStates: expected an integer from 1 to 32767, found 0");
+    EXPECT_EQ(About(Shorts({47, 20, 30, 20, 16, 2000, -1, 1, 1})),
+              "old.glog: byte 28: item 1 (Icon): key Num: expected an integer from 0 to 32767, found -1");
+    EXPECT_EQ(About(Shorts({49, 20, 30, 20, 16, 2000, 5, -2, 1, 1, 0, 0, 0, 0, 0})),
+              "old.glog: byte 30: item 1 (IconButton): key NumStates: expected an integer from 1 to 32767, "
+              "found -2");
+    EXPECT_EQ(About(Shorts({49, 20, 30, 20, 16, 2000, 5, 2, 1, 0, 0, 0, 0, 0, 0})),
+              "old.glog: byte 34: item 1 (IconButton): key NumDownStates: expected an integer from 1 to "
+              "32767, found 0");
+    EXPECT_EQ(About(Shorts({64, 20, 30, 36, 50, 0, 1821, 0, 3, 0, 0, 0})),
+              "old.glog: byte 36: item 1 (SuccessiveIcons): key Width: expected an integer from 1 to 32767, "
+              "found 0");
+    EXPECT_EQ(About(Shorts({64, 20, 30, 36, 50, 0, 1821, 0, 3, 0, -1, -1})),
+              "old.glog: byte 36: item 1 (SuccessiveIcons): key Width: expected an integer from 1 to 32767, "
+              "found -1");
+    EXPECT_EQ(About(Shorts({64, 20, 30, 36, 50, 0, 1821, 0, 3, 0, -1, 0x7FFF})),
+              "old.glog: byte 36: item 1 (SuccessiveIcons): key Width: expected an integer from 1 to 32767, "
+              "found 2147483647");
+    EXPECT_EQ(About(Shorts({64, 20, 30, 36, 50, 0, 1821, 0, 0, 1, 16, 0})),
+              "old.glog: byte 32: item 1 (SuccessiveIcons): key BaseIcon: expected an integer from 0 to "
+              "32767, found 65536");
+    EXPECT_EQ(About(Shorts({14, 0, 0})), "old.glog: byte 16: item 1 (BoxSelect): key RectList: expected 1 to "
+                                         "32767 boxes, found 0");
+    EXPECT_EQ(About(Shorts({14, -3, 1 << 8})), "old.glog: byte 16: item 1 (BoxSelect): key RectList: "
+                                               "expected 1 to 32767 boxes, found -3");
+}
+
+TEST_F(IconRecords, OfTheGreatestNumbersAreDrawnAndClicked) {
+    std::string const box = Shorts({0, 0, 200, 200});
+    for (std::string const &record :
+         {Shorts({47}) + box + Shorts({-1, 32767, 32767, 1}),
+          Shorts({49}) + box + Shorts({32767, 32767, 32767, 1, 32767, 0x0101, -1, -1, -1, -1}),
+          Shorts({64, -32768, -32768, 32767, 32767, 0, -1, -1, 32767, 0, 32767, 0}),
+          Shorts({64, 0, 0, 200, 200, 0, 0, 0x7FFF, 32767, 0, 1, 0}), Shorts({14, 32767, 0}),
+          Shorts({47, 32767, 32767, 32767, 32767, 2000, 0, 1, 1}),
+          Shorts({47, 0, 0, -1, -32768, 2000, 0, 1, 1})}) {
+        GlogPane *const pane = LoadRecord<GlogPane>(record);
+        ASSERT_NE(pane, nullptr);
+        glogRec *const glog = pane->GetGlog();
+        ShowGlog(glog, kShowGlog);
+        desktop.Play("click 8 8\nclick 199 199");
+        EXPECT_FALSE(Dump(glog).empty());
+        DisposeGlog(glog);
+    }
 }
 
 TEST_F(IconRecords, CutAtAnyLengthAreErrors) {
