@@ -16,6 +16,7 @@
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
 #include <algorithm>
+#include <cstddef>
 
 namespace {
 
@@ -48,7 +49,7 @@ short const kBeyondRight = 32767, kBeyondLeft = -32768;
 
 char const kGroupSpacingKey[] = "GCheckGroup_LineSpacing";
 
-short Short(int value) { return static_cast<short>(value); }
+short Short(std::ptrdiff_t value) { return static_cast<short>(value); }
 
 TarnQuickDrawText::FontInfo PortFontInfo() {
     TarnQuickDrawText::FontInfo info;
@@ -328,7 +329,9 @@ void ButtonGroupPane::SetOneEnable(short index, bool enabled) { SetButton(index,
 void ButtonGroupPane::SetAllEnable(bool enabled) { SetAllButtons(enabled, true, kEveryButton); }
 
 void ButtonGroupPane::SetAllButtons(bool value, bool isEnable, short except) {
-    for (int i = 0; i < CountButtons(); ++i)
+    // Not those that a listener adds on the way.
+    int const count = CountButtons();
+    for (int i = 0; i < count; ++i)
         if (i != except)
             SetButton(Short(i), value, isEnable);
 }
@@ -366,6 +369,17 @@ void ButtonGroupPane::SetForPrinting(bool on) { forPrinting = on; }
 
 template <class Part> Rect ButtonGroupPane::RectOf(Part const &part) const {
     return IsInLayout() ? part.layoutItem->GetBorderRect() : part.bounds;
+}
+
+template <class Part>
+typename std::vector<Part>::const_iterator ButtonGroupPane::FirstAt(Point where,
+                                                                    std::vector<Part> const &parts) const {
+    // Asked once: groups may have thousands of parts.
+    bool const inLayout = IsInLayout();
+    return std::find_if(parts.begin(), parts.end(), [inLayout, where](Part const &part) {
+        Rect const rect = inLayout ? part.layoutItem->GetBorderRect() : part.bounds;
+        return VelaDrawing::PtInRect(where, &rect);
+    });
 }
 
 template <class Visit> void ButtonGroupPane::VisitRectsFromLast(Visit const &visit) const {
@@ -498,17 +512,12 @@ int ButtonGroupPane::HandleClick(EventRecordAdapter *event) {
     if (!allowClicks)
         return -1;
     short const modifiers = static_cast<short>(event->modifiers);
-    for (ButtonTextRec const &text : texts) {
-        Rect const rect = RectOf(text);
-        if (text.button != kNoButton && VelaDrawing::PtInRect(event->where, &rect))
-            return ResultOfClick(text.button, modifiers);
-    }
-    for (int i = 0; i < CountButtons(); ++i) {
-        Rect const rect = RectOf(buttons[static_cast<std::size_t>(i)]);
-        if (VelaDrawing::PtInRect(event->where, &rect))
-            return ResultOfClick(Short(i), modifiers);
-    }
-    return 0;
+    auto const text = FirstAt(event->where, texts);
+    // A label of no button hides the labels that it covers, but no button.
+    if (text != texts.end() && text->button != kNoButton)
+        return ResultOfClick(text->button, modifiers);
+    auto const button = FirstAt(event->where, buttons);
+    return button == buttons.end() ? 0 : ResultOfClick(Short(button - buttons.begin()), modifiers);
 }
 
 int ButtonGroupPane::ResultOfClick(short index, short modifiers) {

@@ -121,7 +121,8 @@ protected:
     // visible, then ButtonGroupPaneChanged is sent for either. A listener of the first must not delete the
     // pane.
     void SetButton(short index, bool value, bool isEnable);
-    // SetButton for all but one, in order; -1: for all.
+    // SetButton for all but one, in order; -1: for all. Buttons that a listener adds meanwhile stay as they
+    // are. A listener must not delete the pane.
     void SetAllButtons(bool value, bool isEnable, short except);
     // Invalidates the button and a margin of 3 pixels, if the pane is visible. The pane must be prepared.
     void InvalButton(short index);
@@ -158,6 +159,9 @@ private:
     int FindAutoSetSource(Provider<AutoSetActivityListener> *) const;
 
     template <class Part> Rect RectOf(Part const &part) const;
+    // The first part whose rectangle holds the point; the end when there is none.
+    template <class Part>
+    typename std::vector<Part>::const_iterator FirstAt(Point, std::vector<Part> const &) const;
     template <class Visit> void VisitRectsFromLast(Visit const &visit) const;
     int SpacingOfGlog() const;
     RCPtr<GlogLayoutRectItem> MakeButtonItem(int spacing, Rect const &bounds);

@@ -84,7 +84,9 @@ void RadioButtonPane::RadioSet(short index) {
         return;
     radioValue = index;
     SetButton(old, false, false);
-    SetButton(index, true, false);
+    // A listener may have made another button the current one: there is never more than one on.
+    if (radioValue == index)
+        SetButton(index, true, false);
 }
 
 short RadioButtonPane::RadioGet() { return radioValue; }

@@ -25,8 +25,9 @@ public:
     void AddSpecialButton(short h, short v, short extraWidth) override;
 
     // Makes the button the current one. Both kinds of listeners hear first of the old one going off, then of
-    // the new one going on, and both are invalidated. The current button, and an index that does not exist,
-    // do nothing.
+    // the new one going on, and both are invalidated. When a listener of the former makes yet another button
+    // the current one, that one alone goes on; the group may be deleted at the last message only. The current
+    // button, and an index that does not exist, do nothing.
     virtual void RadioSet(short index);
     // The index of the current button; 0 also while there are no buttons.
     virtual short RadioGet();
