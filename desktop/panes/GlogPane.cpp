@@ -266,7 +266,8 @@ void GlogPane::ContainerChangedVisibility() {}
 // Drawing
 
 void GlogPane::Inval() {
-    if (!glog || !GetVisibility())
+    // The first picture is drawn as a whole, so a glog that is being made need not look where its panes lie.
+    if (!glog || !Glog::From(glog).Pixels() || !GetVisibility())
         return;
     Rect const part = PaneAccess::VisiblePart(*this);
     Glog::From(glog).DamageWindowRect(part);

@@ -36,6 +36,16 @@ TEST_F(CompoundPaneTest, AddAtAPositionMovesTheOthersBack) {
     EXPECT_LT(container->Add(container, -1), 0);
 }
 
+TEST_F(CompoundPaneTest, AddDoesNotSettleTheLayoutOfAGlogThatIsStillBeingMade) {
+    container->SetUseLayout(true);
+    ProbePane *const first = NewPane();
+    container->Add(first, -1);
+    container->Add(NewPane(), -1);
+    EXPECT_EQ(BoxOf(*first), (Rect{10, 10, 30, 60}));
+    Show();
+    EXPECT_EQ(BoxOf(*first), (Rect{0, 0, 20, 50}));
+}
+
 TEST_F(CompoundPaneTest, DelDeletesAndDelGutsCanKeepThePaneAlive) {
     ProbePane *kept = NewPane({0, 0, 5, 5}, "kept");
     container->Add(kept, -1);
