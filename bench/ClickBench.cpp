@@ -1,24 +1,15 @@
 // From the click in the window system's queue to the listener.
 #include "bench/BenchPage.h"
+#include "bench/ProcessorClock.h"
 #include "buttons/OvalButtonPane.h"
 #include <benchmark/benchmark.h>
-#include <ctime>
 #include <string>
 
 namespace {
 
-double const kSecondsPerNanosecond = 1e-9;
-
-// Of the process, so that other programs do not count.
-double ProcessorSeconds() {
-    timespec now = {};
-    clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &now);
-    return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * kSecondsPerNanosecond;
-}
-
 class TimedListener : public GlogButtonPaneListener {
 public:
-    void GlogButtonPressed(GlogButtonPane *) override { heardAt = ProcessorSeconds(); }
+    void GlogButtonPressed(GlogButtonPane *) override { heardAt = ProcessorClock::Seconds(); }
     double heardAt = 0;
 };
 
@@ -32,7 +23,7 @@ void ClickToListener(benchmark::State &state) {
     for (auto _ : state) {
         page.desktop.Script(click);
         listener.heardAt = 0;
-        double const start = ProcessorSeconds();
+        double const start = ProcessorClock::Seconds();
         page.desktop.Run();
         state.SetIterationTime(listener.heardAt - start);
         if (listener.heardAt == 0) {
