@@ -110,7 +110,10 @@ void Glog::AddItem(GlogPane *pane) {
 }
 
 void Glog::RemoveItem(GlogPane *pane) {
-    items.erase(std::remove(items.begin(), items.end(), pane), items.end());
+    // From the end: a window that closes deletes its panes from there.
+    auto const found = std::find(items.rbegin(), items.rend(), pane);
+    if (found != items.rend())
+        items.erase(std::next(found).base());
     ++itemChanges;
 }
 
