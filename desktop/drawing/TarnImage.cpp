@@ -7,13 +7,13 @@
 #include "desktop/observe/DrawingTrace.h"
 #include "desktop/resources/Resources.h"
 #include <algorithm>
-#include <cstdio>
 #include <memory>
 #include <string>
 
 namespace {
 
 constexpr char kPlainTheme[] = "light";
+constexpr char kPlainSuffix[] = ".png", kDetailedSuffix[] = "@2x.png";
 // No window shows more, and a stretched copy of a picture should not eat the memory.
 constexpr int kLongestScaledSide = 8192;
 
@@ -24,16 +24,26 @@ public:
     }
 };
 
-// pictures/0042-dark.png in the dark theme, if there is one, else pictures/0042.png. Empty for neither.
-std::string PicturePath(short id) {
-    Resources &resources = Resources::Instance();
-    char number[8];
-    std::snprintf(number, sizeof number, "%04d", static_cast<int>(id));
-    std::string const start = std::string("pictures/") + number;
-    std::string path;
-    if (resources.Theme() != kPlainTheme)
-        path = resources.Find(start + '-' + resources.Theme() + ".png");
-    return path.empty() ? resources.Find(start + ".png") : path;
+std::string PathIn(char const *theme, short id, char const *suffix) {
+    return Resources::Instance().Find("pictures/" + std::string(theme) + '/' + std::to_string(id) + suffix);
+}
+
+// pictures/THEME/42.png, or that of the light theme; with the suffix, pictures/THEME/42@2x.png. Empty when
+// there is neither.
+std::string PicturePath(short id, char const *suffix) {
+    std::string const path = PathIn(Resources::Instance().Theme().c_str(), id, suffix);
+    return path.empty() ? PathIn(kPlainTheme, id, suffix) : path;
+}
+
+// Null when there is no such picture, or it is broken.
+std::unique_ptr<Surface> ReadPicture(short id, char const *suffix) {
+    try {
+        std::string const path = PicturePath(id, suffix);
+        std::string reason; // a broken picture is as good as none
+        return path.empty() ? nullptr : Surface::ReadPng(path, reason);
+    } catch (ResourceError const &) {
+        return nullptr; // there is no artwork at all
+    }
 }
 
 } // namespace
@@ -52,18 +62,13 @@ struct PngImage::Rep {
     explicit Rep(short id_)
         : id(id_) {}
 
-    // Null when there is no such picture, or it is broken.
+    // In its own size; null when there is no such picture, or it is broken.
     Surface const *Picture() {
         if (!known) {
             known = true;
-            try {
-                std::string const path = PicturePath(id);
-                std::string reason; // a broken picture is as good as none
-                if (!path.empty())
-                    picture = Surface::ReadPng(path, reason);
-            } catch (ResourceError const &) {
-                picture.reset(); // there is no artwork at all
-            }
+            picture = ReadPicture(id, kPlainSuffix);
+            if (picture)
+                detailed = ReadPicture(id, kDetailedSuffix);
             opaque = picture && picture->IsOpaque();
         }
         return picture.get();
@@ -73,11 +78,11 @@ struct PngImage::Rep {
     PixelImage Sized(int width, int height) {
         width = std::min(width, kLongestScaledSide);
         height = std::min(height, kLongestScaledSide);
-        Surface *shown = picture.get();
-        if (picture->Width() != width || picture->Height() != height) {
+        Surface *shown = detailed && width > picture->Width() ? detailed.get() : picture.get();
+        if (shown->Width() != width || shown->Height() != height) {
             if (!scaled || scaled->Width() != width || scaled->Height() != height) {
                 scaled.reset(new Surface(width, height));
-                ScalePixels(picture->Pixels(), picture->Width(), picture->Height(), scaled->Pixels(), width,
+                ScalePixels(shown->Pixels(), shown->Width(), shown->Height(), scaled->Pixels(), width,
                             height);
             }
             shown = scaled.get();
@@ -88,13 +93,16 @@ struct PngImage::Rep {
     void Forget() {
         known = false;
         picture.reset();
+        detailed.reset();
         scaled.reset();
     }
 
     short const id;
     bool known = false; // whether the file has been looked for
     bool opaque = false;
-    std::unique_ptr<Surface> picture, scaled;
+    std::unique_ptr<Surface> picture;  // in its own size
+    std::unique_ptr<Surface> detailed; // with twice as many pixels each way, for larger sizes; or null
+    std::unique_ptr<Surface> scaled;   // as it was drawn last, if that was in another size
 };
 
 PngImage::PngImage(short id)

@@ -11,7 +11,8 @@ protected:
     Pictures() {
         directory.Write("themes/light.xml", "<theme name=\"light\"/>");
         directory.Write("themes/dark.xml", "<theme name=\"dark\"/>");
-        std::filesystem::create_directories(directory.Path() + "/pictures");
+        for (char const *theme : {"light", "dark"})
+            std::filesystem::create_directories(directory.Path() + "/pictures/" + theme);
         Resources::Instance().Open(directory.Path());
         Resources::Instance().SetTheme("light");
     }
@@ -32,7 +33,7 @@ std::uint32_t const kBlue = 0xFF0000FFu;
 } // namespace
 
 TEST_F(Pictures, AreDrawnIntoTheRectangle) {
-    Write("0042.png", 3, 2, kBlue);
+    Write("light/42.png", 3, 2, kBlue);
     PngImage picture(42);
     EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 2, 3}));
     Canvas canvas(12, 10);
@@ -46,15 +47,30 @@ TEST_F(Pictures, AreDrawnIntoTheRectangle) {
 }
 
 TEST_F(Pictures, AreSharpSquaresAtTwiceTheScale) {
-    Write("0042.png", 3, 2, kBlue);
+    Write("light/42.png", 3, 2, kBlue);
     PngImage picture(42);
     Canvas canvas(12, 10, 2);
     picture.Draw({0, 0, 2, 3});
     EXPECT_EQ(canvas.Count(kBlue), 24);
 }
 
+TEST_F(Pictures, AreDrawnFromTheDetailedOneWhereThereAreMorePixels) {
+    Write("light/42.png", 3, 2, kBlue);
+    Write("light/42@2x.png", 6, 4, Canvas::kRed);
+    PngImage picture(42);
+    EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 2, 3}));
+    {
+        Canvas plain(12, 10);
+        picture.Draw({0, 0, 2, 3});
+        EXPECT_EQ(plain.Count(kBlue), 6);
+    }
+    Canvas sharp(12, 10, 2);
+    picture.Draw({0, 0, 2, 3});
+    EXPECT_EQ(sharp.Count(Canvas::kRed), 24);
+}
+
 TEST_F(Pictures, TransparencyMixes) {
-    Write("0042.png", 3, 2, 0x80000000u);
+    Write("light/42.png", 3, 2, 0x80000000u);
     PngImage picture(42);
     Canvas canvas(3, 2);
     picture.Draw({0, 0, 2, 3});
@@ -71,15 +87,15 @@ TEST_F(Pictures, ANumberWithoutAPictureDrawsNothing) {
 }
 
 TEST_F(Pictures, ABrokenPictureIsAsGoodAsNone) {
-    directory.Write("pictures/0042.png", "this is no picture");
+    directory.Write("pictures/light/42.png", "this is no picture");
     PngImage picture(42);
     EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 0, 0}));
 }
 
 TEST_F(Pictures, FollowTheThemeByThemselves) {
-    Write("0042.png", 3, 2, kBlue);
-    Write("0042-dark.png", 4, 4, Canvas::kRed);
-    Write("0043.png", 3, 2, kBlue);
+    Write("light/42.png", 3, 2, kBlue);
+    Write("dark/42.png", 4, 4, Canvas::kRed);
+    Write("light/43.png", 3, 2, kBlue);
     PngImage picture(42), plain(43);
     EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 2, 3}));
     Resources::Instance().SetTheme("dark");
