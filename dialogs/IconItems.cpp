@@ -7,6 +7,7 @@
 #include "desktop/observe/TreeDump.h"
 #include "dialogs/IconFamilyKey.h"
 #include "dialogs/ItemRegistry.h"
+#include "dialogs/KeyFault.h"
 #include "dialogs/MessageReporter.h"
 #include "dialogs/PressReporter.h"
 #include "dialogs/RecordBytes.h"
@@ -80,14 +81,33 @@ void ReportReleases(GlogPane *pane) {
         new ReleaseReporter(button);
 }
 
+void RequireState(GlogStyleSheet *sheet) {
+    int const state = sheet->GetSInt32ItemValue(ResourceKey("State"));
+    int const last = sheet->GetSInt32ItemValue(ResourceKey("NumStates")) - 1;
+    if (state > last)
+        throw KeyFault("State", "there is no state " + std::to_string(state) + ": the last one is " +
+                                    std::to_string(last));
+}
+
+// Creators of their own read neither state nor enabling.
+GlogPane *WithLook(GlogStyleSheet *sheet, GIconPane *icon) {
+    if (!icon)
+        return nullptr;
+    gcStateIconSetCurState(icon, sheet->GetSInt32ItemValue(ResourceKey("State")));
+    gcStateIconSetEnable(icon, sheet->GetSInt32ItemValue(ResourceKey("Mode")) == 0);
+    return icon;
+}
+
 GlogPane *MakeIcon(glogRec *glog, GlogStyleSheet *sheet) {
     RequireFamilyUnder(sheet);
-    return GIconPane::NewGIconPane(glog, sheet->GetItemRes());
+    RequireState(sheet);
+    return WithLook(sheet, GIconPane::NewGIconPane(glog, sheet->GetItemRes()));
 }
 
 GlogPane *MakeIconButton(glogRec *glog, GlogStyleSheet *sheet) {
     RequireFamilyUnder(sheet);
-    return GIconButton::NewGIconButton(glog, sheet->GetItemRes());
+    RequireState(sheet);
+    return WithLook(sheet, GIconButton::NewGIconButton(glog, sheet->GetItemRes()));
 }
 
 GlogPane *MakeStrip(glogRec *glog, GlogStyleSheet *sheet) {
@@ -166,7 +186,9 @@ KeyList IconKeys() {
         .Integer("Num", 0, KeyList::kLargest)
         .Integer("NumStates", 1, KeyList::kLargest)
         .Required()
-        .Flag("CanDisable");
+        .Flag("CanDisable")
+        .Integer("State", 0, KeyList::kLargest)
+        .Flag("Mode");
 }
 
 KeyList IconButtonKeys() {

@@ -68,6 +68,17 @@ TEST_F(IconItems, MakeIcons) {
     EXPECT_TRUE(icon->CanDisable());
 }
 
+TEST_F(IconItems, BeginWithTheStateAndTheModeThatTheyAreGiven) {
+    GIconPane *const icon = LoadOne<GIconPane>("Icon", kIconKeys + "<State>1</State><Mode>1</Mode>");
+    EXPECT_EQ(icon->GetCurState(), 1);
+    EXPECT_FALSE(icon->GetEnabled());
+    GIconButton *const button = LoadOne<GIconButton>(
+        "IconButton", kIconKeys + "<NumDownStates>2</NumDownStates><State>1</State><Mode>0</Mode>");
+    EXPECT_EQ(button->GetCurState(), 1);
+    EXPECT_TRUE(button->GetEnabled());
+    EXPECT_TRUE(Holds(ComplaintAboutItem("Icon", kIconKeys + "<State>2</State>"), "there is no state 2"));
+}
+
 TEST_F(IconItems, MakeIconButtonsWhoseCommandsAreReported) {
     GIconButton *const button = LoadOne<GIconButton>(
         "IconButton", kIconKeys + "<NumDownStates>2</NumDownStates><CanCancel>1</CanCancel>"
