@@ -1,11 +1,15 @@
 // Box selections, and the pane that is no more than a box.
 #include "buttons/BoxSelectPane.h"
 #include "buttons/BoxPane.h"
+#include "desktop/drawing/Surface.h"
+#include "desktop/layout/LayoutEngine.h"
+#include "host/CallbackAPI.h"
 #include "host/CompoundPane.h"
 #include "host/NamedColors.h"
 #include "host/OSPort.h"
 #include "host/OSRgn.h"
 #include "host/PortSavers.h"
+#include "host/TarnError.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
 #include "tests/PaneTest.h"
@@ -58,6 +62,41 @@ protected:
     BoxSelectPane *New(int mode = kEachOnItsOwn, int style = BoxSelectPane::kThinFrame) {
         return BoxSelectPane::NewBoxSelectPane(glog, SelectionItem(mode, style));
     }
+    BoxSelectPane *NewOf(std::vector<Rect> const &rects, int mode = kEachOnItsOwn) {
+        TestItem list, item;
+        for (Rect const &rect : rects)
+            list.Box("Box", rect);
+        item.Integer("Mode", mode);
+        item.Container()->AddItem(Text("RectList"), list.Container());
+        return BoxSelectPane::NewBoxSelectPane(glog, item.Container());
+    }
+    // The pixels of the window.
+    typedef std::vector<std::vector<std::uint32_t>> Picture;
+    Picture PictureOf(glogRec *window) {
+        Surface const &surface = *desktop.Picture(window);
+        Picture picture;
+        for (int v = 0; v < surface.Height(); ++v)
+            picture.emplace_back(surface.Row(v), surface.Row(v) + surface.Width());
+        return picture;
+    }
+    // In a container at (100, 50) that lays out its items, below a gap of 30 pixels.
+    BoxSelectPane *NewInLayout(int mode = kEachOnItsOwn, int style = BoxSelectPane::kThinFrame) {
+        Group *const group = new Group(glog, true);
+        Rect above = {0, 0, 30, 50};
+        BoxPane *const spacer = new BoxPane(glog, above);
+        spacer->GetLayoutRect()->SetAttribute(GlogLayoutItem::kHeight, 30, GlogLayoutItem::kPixels,
+                                              UString());
+        group->Add(spacer, -1);
+        BoxSelectPane *const pane = New(mode, style);
+        group->Add(pane, -1);
+        return pane;
+    }
+    // Where a box lies in that layout.
+    static Rect InThatLayout(Rect const &box) {
+        return Moved(box, static_cast<short>(-kAround.left), static_cast<short>(30 - kAround.top));
+    }
+    // The same in the window.
+    static Rect InThatWindow(Rect const &box) { return Moved(InThatLayout(box), 100, 50); }
     static Rect BoundsOf(BoxSelectPane &pane, short index) {
         Rect box;
         pane.GetOneBox(index, &box);
@@ -79,6 +118,36 @@ protected:
             }
         });
     }
+};
+
+// A selection made from a record, for what makers of their own and subclasses see.
+class Subclass : public BoxSelectPane {
+public:
+    Subclass(glogRec *owner, boxSelResRec *record)
+        : BoxSelectPane(owner, record) {}
+    void SetBox(Rect *box) override {
+        boxesSet.push_back(*box);
+        BoxSelectPane::SetBox(box);
+    }
+    std::vector<Rect> boxesSet;
+};
+
+// Counts the steps of tracking.
+class Steps : public VelaFoundationCallbackAPI {
+public:
+    Steps()
+        : former(gInstance) {
+        gInstance = this;
+    }
+    ~Steps() override { gInstance = former; }
+    void TrackingStep() override { ++steps; }
+    void ListTrackingStep() override { ++steps; }
+    bool IsCancelKey(EventRecordAdapter *, bool) override { return false; }
+    bool IsDoubleClick() override { return false; }
+    int steps = 0;
+
+private:
+    VelaFoundationCallbackAPI *former;
 };
 
 class Box : public PaneTest {};
@@ -114,7 +183,29 @@ TEST_F(Box, StaysUnattachedWithoutAGlog) {
     EXPECT_EQ(BoxOf(lonely), (Rect{0, 0, 0, 0}));
 }
 
+TEST_F(Box, StaysUnattachedWithoutAGlogAlsoFromASheet) {
+    TestItem item;
+    item.Box("BoundsRect", {1, 2, 3, 4});
+    BoxPane lonely(nullptr, item.Sheet());
+    EXPECT_EQ(lonely.GetGlog(), nullptr);
+    EXPECT_EQ(BoxOf(lonely), (Rect{0, 0, 0, 0}));
+}
+
 TEST_F(BoxSelect, ItsRecordHasSixBytes) { EXPECT_EQ(sizeof(boxSelResRec), 6u); }
+
+TEST_F(BoxSelect, IsAProviderFirstAndAPaneSecond) {
+    BoxSelectPane *const pane = New();
+    char const *const whole = reinterpret_cast<char const *>(pane);
+    EXPECT_EQ(reinterpret_cast<char const *>(static_cast<Provider<BoxSelectPaneListener> *>(pane)), whole);
+    EXPECT_GT(reinterpret_cast<char const *>(static_cast<GlogPane *>(pane)), whole);
+}
+
+TEST_F(BoxSelect, TheKindOfItsRecordIsNotLookedAt) {
+    boxSelResRec record = {99, 2, BoxSelectPane::kHighlight, kEachOnItsOwn};
+    EXPECT_EQ(BoxSelectPane::NewBoxSelectPane(glog, &record)->GetNumBoxes(), 2);
+}
+
+TEST_F(BoxSelect, IsMadeUnderNumberZero) { EXPECT_EQ(New()->GetID(), 0); }
 
 TEST_F(BoxSelect, FromARecordAloneItsBoxesAreEmpty) {
     boxSelResRec record = {boxSelResRec::kKind, 3, 0, kEachOnItsOwn};
@@ -143,16 +234,70 @@ TEST_F(BoxSelect, TakesItsBoxesFromAnItemAndLiesAroundThem) {
     EXPECT_FALSE(pane->ReadOne(0));
 }
 
-TEST_F(BoxSelect, WithoutItsListAnAssertionFails) {
-    EXPECT_THROW(BoxSelectPane::NewBoxSelectPane(glog, TestItem().Container()), BrokenInvariant);
+TEST_F(BoxSelect, FromAnItemOneAtATimeBeginsWithTheFirstOnAndTellsNobody) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    EXPECT_EQ(pane->RadGet(), 0);
+    EXPECT_TRUE(pane->ReadOne(0));
+    EXPECT_FALSE(pane->ReadOne(1));
+    EXPECT_FALSE(pane->ReadOne(2));
 }
 
-TEST_F(BoxSelect, AChildOfItsListThatIsNoContainerEndsInAnError) {
+TEST_F(BoxSelect, ItsNaturalSizeIsThatOfTheRectangleAroundItsBoxes) {
+    GlogLayoutItem::Rep const &rep = LayoutEngine::Rep(*New()->GetLayoutRect());
+    EXPECT_EQ(rep.width, 80);
+    EXPECT_EQ(rep.height, 30);
+}
+
+TEST_F(BoxSelect, TheRectangleAroundItsBoxesReachesAtLeastToTheOrigin) {
+    BoxSelectPane *const pane = NewOf({{-50, -60, -40, -30}});
+    EXPECT_EQ(BoxOf(*pane), (Rect{-50, -60, 0, 0}));
+    EXPECT_EQ(BoundsOf(*pane, 0), (Rect{-50, -60, -40, -30}));
+}
+
+TEST_F(BoxSelect, WithAnEmptyListItsBoxBeginsBeyondItsEnd) {
+    BoxSelectPane *const pane = NewOf({});
+    EXPECT_EQ(pane->GetNumBoxes(), 0);
+    EXPECT_EQ(BoxOf(*pane), (Rect{32767, 32767, 0, 0}));
+    EXPECT_EQ(LayoutEngine::Rep(*pane->GetLayoutRect()).width, -32767);
+}
+
+TEST_F(BoxSelect, NumbersOfAnItemAreNarrowed) {
+    TestItem box, list, item;
+    box.Integer("kTop", 65536 + 20).Integer("kLeft", 10).Integer("kBottom", 65536 + 40).Integer("kRight", 30);
+    list.Container()->AddItem(Text("Box"), box.Container());
+    item.Integer("Style", 256 + BoxSelectPane::kThinFrame).Integer("Mode", 256);
+    item.Container()->AddItem(Text("RectList"), list.Container());
+    BoxSelectPane *const pane = BoxSelectPane::NewBoxSelectPane(glog, item.Container());
+    EXPECT_EQ(BoundsOf(*pane, 0), kFirst);
+    EXPECT_TRUE(pane->ReadOne(0)) << "a mode of 256 is one box at a time";
+    EXPECT_EQ(MarksOf(*pane), ThinFrames(*pane, {kFirst}));
+}
+
+TEST_F(BoxSelect, KeysThatAreAbsentCountAsZero) {
+    TestItem list, item;
+    list.Box("Box", kFirst);
+    item.Container()->AddItem(Text("RectList"), list.Container());
+    BoxSelectPane *const pane = BoxSelectPane::NewBoxSelectPane(glog, item.Container());
+    EXPECT_TRUE(pane->ReadOne(0));
+    EXPECT_EQ(MarksOf(*pane), ThinFrames(*pane, {kFirst}));
+}
+
+TEST_F(BoxSelect, NoItemFailsAnAssertion) {
+    EXPECT_THROW(BoxSelectPane::NewBoxSelectPane(glog, boost::shared_ptr<XMLLib::ContainerItem>()),
+                 BrokenInvariant);
+}
+
+TEST_F(BoxSelect, AListWithAChildThatIsNoneLeavesNoPane) {
     TestItem list, item;
     list.Box("Box", kFirst).Integer("Box", 3);
     item.Integer("Mode", kEachOnItsOwn);
     item.Container()->AddItem(Text("RectList"), list.Container());
-    EXPECT_ANY_THROW(BoxSelectPane::NewBoxSelectPane(glog, item.Container()));
+    EXPECT_THROW(BoxSelectPane::NewBoxSelectPane(glog, item.Container()), TarnError);
+    EXPECT_EQ(CountGlogItems(glog), 0);
+}
+
+TEST_F(BoxSelect, WithoutItsListAnAssertionFails) {
+    EXPECT_THROW(BoxSelectPane::NewBoxSelectPane(glog, TestItem().Container()), BrokenInvariant);
 }
 
 TEST_F(BoxSelect, WithoutAGlogItStaysUnattachedAndWithoutBoxes) {
@@ -194,6 +339,65 @@ TEST_F(BoxSelect, SetOneTellsAlsoWhereOneAtATimeIsOnAndLeavesTheOthers) {
     EXPECT_EQ(pane->RadGet(), 0);
 }
 
+TEST_F(BoxSelect, AChangeIsStoredAndTheRedrawAskedForBeforeAnybodyIsTold) {
+    BoxSelectPane *const pane = New();
+    Listener listener;
+    listener.DependUpon(pane);
+    Show();
+    bool value = false;
+    std::vector<Rect> repainted;
+    listener.onChange = [&](BoxSelectPane *source) {
+        value = source->ReadOne(1);
+        repainted = Repainted();
+    };
+    pane->SetOne(1, true);
+    EXPECT_TRUE(value);
+    EXPECT_EQ(repainted, (std::vector<Rect>{kAround}));
+    EXPECT_TRUE(Repainted().empty()) << "once is enough";
+}
+
+TEST_F(BoxSelect, TheMessageNamesThePane) {
+    BoxSelectPane *const pane = New();
+    Listener listener;
+    listener.DependUpon(pane);
+    BoxSelectPane *source = nullptr;
+    listener.onChange = [&](BoxSelectPane *sender) { source = sender; };
+    pane->SetOne(2, true);
+    EXPECT_EQ(source, pane);
+}
+
+TEST_F(BoxSelect, AHiddenPaneChangesAndTellsButRepaintsNothing) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    Listener listener;
+    listener.DependUpon(pane);
+    Show();
+    pane->SetVisibility(0);
+    pane->SetOne(1, true);
+    pane->RadSet(2);
+    pane->ChangeStatus(true);
+    EXPECT_EQ(listener.log, (Log{"1 on", "0 off", "2 on"}));
+    EXPECT_TRUE(Repainted().empty());
+}
+
+TEST_F(BoxSelect, WhileTheOldBoxGoesOffItIsStillTheCurrentOne) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    Listener listener;
+    listener.DependUpon(pane);
+    std::vector<short> current;
+    listener.onChange = [&](BoxSelectPane *source) { current.push_back(source->RadGet()); };
+    pane->RadSet(2);
+    EXPECT_EQ(current, (std::vector<short>{0, 2}));
+}
+
+TEST_F(BoxSelect, RadSetGoesOverAlsoWhereEachBoxIsOnItsOwn) {
+    BoxSelectPane *const pane = New(kEachOnItsOwn);
+    Listener listener;
+    listener.DependUpon(pane);
+    pane->RadSet(1);
+    EXPECT_EQ(listener.log, (Log{"1 on"})) << "the first was off";
+    EXPECT_EQ(pane->RadGet(), 1);
+}
+
 TEST_F(BoxSelect, RadSetTellsOfTheOldBoxFirst) {
     BoxSelectPane *const pane = New(kOneAtATime);
     Listener listener;
@@ -219,6 +423,51 @@ TEST_F(BoxSelect, AClickActsWhenTheMouseGoesDown) {
     Show();
     desktop.Play("press 15 25");
     EXPECT_TRUE(pane->ReadOne(0));
+}
+
+TEST_F(BoxSelect, AClickIsNotTrackedAndTakesNoTime) {
+    Steps steps;
+    New();
+    Show();
+    double const start = desktop.Now();
+    EXPECT_EQ(ResultOfClick("click 15 25"), 1);
+    EXPECT_EQ(desktop.Now(), start);
+    EXPECT_EQ(ResultOfClick("press 15 25\nwait 0.5\nmove 200 150\nrelease"), 1);
+    EXPECT_EQ(steps.steps, 0);
+}
+
+TEST_F(BoxSelect, AnyModeButZeroSwitchesEachBoxOnItsOwn) {
+    for (int mode : {2, 128, 255}) {
+        BoxSelectPane *const pane = New(mode);
+        Show();
+        EXPECT_FALSE(pane->ReadOne(0));
+        ResultOfClick("click 15 25");
+        ResultOfClick("click 45 25");
+        EXPECT_TRUE(pane->ReadOne(0) && pane->ReadOne(1)) << mode;
+        EXPECT_EQ(pane->RadGet(), 0) << mode;
+        delete pane;
+    }
+}
+
+TEST_F(BoxSelect, AClickOnTheCurrentBoxDoesNotTurnItOnAgain) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    pane->SetOne(0, false);
+    Listener listener;
+    listener.DependUpon(pane);
+    Show();
+    EXPECT_EQ(ResultOfClick("click 15 25"), 1);
+    EXPECT_FALSE(pane->ReadOne(0));
+    EXPECT_TRUE(listener.log.empty());
+}
+
+TEST_F(BoxSelect, AClickRepaintsThePaneAlone) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    Rect box = {100, 100, 120, 120};
+    new BoxPane(glog, box);
+    Show();
+    ResultOfClick("click 45 25");
+    EXPECT_EQ(pane->RadGet(), 1);
+    EXPECT_EQ(desktop.TakePresented(glog), (std::vector<Rect>{kAround}));
 }
 
 TEST_F(BoxSelect, AClickGoesOverToAnotherBox) {
@@ -254,7 +503,17 @@ TEST_F(BoxSelect, AClickOutsideOfEveryBoxFallsThrough) {
     Show();
     EXPECT_EQ(ResultOfClick("click 35 25"), 0);
     EXPECT_EQ(ResultOfClick("click 30 25"), 0) << "the right edge is outside";
+    EXPECT_EQ(ResultOfClick("click 15 40"), 0) << "the bottom edge is outside";
     EXPECT_TRUE(listener.log.empty());
+}
+
+TEST_F(BoxSelect, ABoxIsHitFromItsTopLeftToItsBottomRightPixel) {
+    New();
+    Show();
+    EXPECT_EQ(ResultOfClick("click 40 20"), 2);
+    EXPECT_EQ(ResultOfClick("click 39 20"), 0);
+    EXPECT_EQ(ResultOfClick("click 89 49"), 3);
+    EXPECT_EQ(ResultOfClick("click 49 39"), 2);
 }
 
 TEST_F(BoxSelect, ListenersMayLeaveDuringTheMessage) {
@@ -275,6 +534,53 @@ TEST_F(BoxSelect, AListenerMayChangeOtherBoxes) {
     listener.onChange = [](BoxSelectPane *source) { source->SetOne(2, true); };
     pane->SetOne(0, true);
     EXPECT_EQ(listener.log, (Log{"0 on", "2 on"}));
+}
+
+TEST_F(BoxSelect, AListenerMayChooseAnotherBox) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    Listener listener;
+    listener.DependUpon(pane);
+    listener.onChange = [&](BoxSelectPane *source) {
+        if (listener.log.back() == "1 on")
+            source->RadSet(2);
+    };
+    Show();
+    EXPECT_EQ(ResultOfClick("click 45 25"), 2);
+    EXPECT_EQ(pane->RadGet(), 2);
+    EXPECT_EQ(listener.log, (Log{"0 off", "1 on", "1 off", "2 on"}));
+}
+
+TEST_F(BoxSelect, AListenerOfASwitchMayDeleteThePane) {
+    BoxSelectPane *const pane = New();
+    Listener listener;
+    listener.DependUpon(pane);
+    listener.onChange = [](BoxSelectPane *source) { delete source; };
+    Show();
+    EXPECT_EQ(ResultOfClick("click 15 25"), 1);
+    EXPECT_EQ(CountGlogItems(glog), 0);
+}
+
+TEST_F(BoxSelect, AListenerMayDeleteThePaneWhenTheNewBoxIsOn) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    Listener listener;
+    listener.DependUpon(pane);
+    listener.onChange = [&](BoxSelectPane *source) {
+        if (listener.log.back() == "1 on")
+            delete source;
+    };
+    Show();
+    EXPECT_EQ(ResultOfClick("click 45 25"), 2);
+    EXPECT_EQ(CountGlogItems(glog), 0);
+}
+
+TEST_F(BoxSelect, AListenerMayCloseTheWindow) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    Listener listener;
+    listener.DependUpon(pane);
+    listener.onChange = [this](BoxSelectPane *) { DisposeGlog(glog); };
+    Show();
+    desktop.Play("click 45 25");
+    EXPECT_EQ(listener.log, (Log{"0 off", "1 on"}));
 }
 
 TEST_F(BoxSelect, AListenerMayDeleteTheNeighbour) {
@@ -325,6 +631,39 @@ TEST_F(BoxSelect, OnlyBoxesThatAreUpdatedAreMarked) {
     EXPECT_EQ(MarksOf(*pane, Rect{20, 60, 50, 90}), ThinFrames(*pane, {kOverlapping}));
 }
 
+TEST_F(BoxSelect, AMarkIsDrawnInPartWhenPartOfItIsUpdated) {
+    BoxSelectPane *const pane = New(kOneAtATime, BoxSelectPane::kHighlight);
+    Show();
+    Picture const whole = PictureOf(glog);
+    SetPortToGlog(glog);
+    Rect const all = {0, 0, 200, 320}, part = {25, 0, 30, 20};
+    VelaDrawing::PaintRect(&all);
+    VelaDrawing::InvalRect(&part);
+    UpdateGlog(glog);
+    Picture const redrawn = PictureOf(glog);
+    for (short v = 0; v < 60; ++v)
+        for (short h = 0; h < 100; ++h)
+            ASSERT_EQ(redrawn[v][h], VelaDrawing::PtInRect(Point{v, h}, &part) ? whole[v][h] : redrawn[0][0])
+                << v << " " << h;
+    EXPECT_TRUE(pane->ReadOne(0));
+}
+
+TEST_F(BoxSelect, MarksLeaveTheColoursOfThePortToTheHost) {
+    New(kOneAtATime, BoxSelectPane::kHighlight);
+    Rect below = {100, 10, 120, 30};
+    class Frame : public BoxPane {
+    public:
+        using BoxPane::BoxPane;
+        void DrawGuts(OSRgn *) override { GetColors(&colors); }
+        SaveColorRec colors;
+    };
+    Frame *const later = new Frame(glog, below);
+    Show();
+    EXPECT_EQ(later->colors.fore.red, 0);
+    EXPECT_EQ(later->colors.fore.green, 0);
+    EXPECT_EQ(later->colors.fore.blue, 0);
+}
+
 TEST_F(BoxSelect, AHiddenPaneMarksNothing) {
     BoxSelectPane *const pane = New(kOneAtATime);
     pane->SetVisibility(0);
@@ -350,6 +689,41 @@ TEST_F(BoxSelect, ChangeStatusTurnsTheMarksOffAndRepaints) {
     pane->ChangeStatus(true);
     EXPECT_EQ(Repainted(), (std::vector<Rect>{kAround}));
     EXPECT_EQ(MarksOf(*pane), ThinFrames(*pane, {kFirst}));
+}
+
+TEST_F(BoxSelect, ChangeStatusInvalidatesAlsoWhenNothingChanges) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    pane->InitStatus(false);
+    Show();
+    pane->ChangeStatus(false);
+    EXPECT_EQ(Repainted(), (std::vector<Rect>{kAround}));
+    EXPECT_TRUE(MarksOf(*pane).empty());
+}
+
+TEST_F(BoxSelect, WhileMarksAreOffClicksAndValuesGoOn) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    pane->InitStatus(false);
+    Show();
+    EXPECT_EQ(ResultOfClick("click 45 25"), 2);
+    EXPECT_TRUE(pane->ReadOne(1));
+    EXPECT_TRUE(MarksOf(*pane).empty());
+}
+
+TEST_F(BoxSelect, SetOriginMovesItByItsVirtualOperation) {
+    boxSelResRec record = {boxSelResRec::kKind, 1, 0, kEachOnItsOwn};
+    Subclass *const pane = new Subclass(glog, &record);
+    Rect box = {20, 10, 50, 90};
+    pane->SetBox(&box);
+    pane->SetOrigin(Point{120, 110});
+    EXPECT_EQ(pane->boxesSet, (std::vector<Rect>{box, {120, 110, 150, 190}}));
+}
+
+TEST_F(BoxSelect, BoxesAndBoxFollowSetBoxInAContainerWithoutLayout) {
+    BoxSelectPane *const pane = New();
+    (new Group(glog, false))->Add(pane, -1);
+    Rect moved = Moved(kAround, 5, 7);
+    pane->SetBox(&moved);
+    EXPECT_EQ(BoundsOf(*pane, 1), Moved(kSecond, 5, 7));
 }
 
 TEST_F(BoxSelect, ItsBoxesMoveAlongWithIt) {
@@ -406,6 +780,89 @@ TEST_F(BoxSelect, InALayoutItsBoxesAreClickedWhereTheyAreDrawn) {
     EXPECT_EQ(MarksOf(*pane), ThinFrames(*pane, {second}));
 }
 
+TEST_F(BoxSelect, InALayoutEveryStyleMarksTheBoxesWhereTheyLie) {
+    for (int style : {BoxSelectPane::kHighlight, BoxSelectPane::kHighlightToo}) {
+        BoxSelectPane *const pane = NewInLayout(kOneAtATime, style);
+        Show();
+        Rect const first = InThatLayout(kFirst);
+        EXPECT_EQ(MarksOf(*pane), Traced(*pane,
+                                         [&] {
+                                             OSPort &port = OSPort::Current();
+                                             port.SetForeColor(kHiliteColor);
+                                             port.PaintRoundRect(first, kCorner);
+                                             WithDarkenDrawMode const darken(70, glog->GetStyleSheet(),
+                                                                             WithDarkenDrawMode::kMode1);
+                                             port.FrameRoundRect(first, kCorner);
+                                         }))
+            << style;
+    }
+    BoxSelectPane *const pane = NewInLayout(kOneAtATime, BoxSelectPane::kThinFrame);
+    Show();
+    EXPECT_EQ(MarksOf(*pane), ThinFrames(*pane, {InThatLayout(kFirst)}));
+    EXPECT_TRUE(MarksOf(*pane, Rect{0, 0, 10, 10}).empty());
+}
+
+TEST_F(BoxSelect, InALayoutClicksChangeAndRepaintItWhereItLies) {
+    BoxSelectPane *const pane = NewInLayout(kOneAtATime);
+    Listener listener;
+    listener.DependUpon(pane);
+    Show();
+    Rect const third = InThatWindow(kOverlapping);
+    EXPECT_EQ(ResultOfClick("click " + std::to_string(third.left) + " " + std::to_string(third.top)), 3);
+    EXPECT_EQ(listener.log, (Log{"0 off", "2 on"}));
+    std::vector<Rect> const presented = desktop.TakePresented(glog);
+    ASSERT_EQ(presented.size(), 1u);
+    EXPECT_EQ(presented[0].top, InThatWindow(kAround).top);
+    EXPECT_EQ(ResultOfClick("click " + std::to_string(third.right) + " " + std::to_string(third.top)), 0);
+}
+
+TEST_F(BoxSelect, InALayoutSetBoxMovesNoBoxWithinThePane) {
+    BoxSelectPane *const pane = NewInLayout();
+    Show();
+    Rect const before = BoundsOf(*pane, 1), box = BoxOf(*pane);
+    Rect elsewhere = Moved(box, 40, 20);
+    pane->SetBox(&elsewhere);
+    EXPECT_EQ(BoundsOf(*pane, 1), Moved(before, 40, 20)) << "counted from the corner of the box";
+    pane->SetOrigin(Point{box.top, box.left});
+    EXPECT_EQ(BoundsOf(*pane, 1), before);
+}
+
+TEST_F(BoxSelect, InALayoutAHelpTagHoldsForItsBoxWhereItLies) {
+    BoxSelectPane *const pane = NewInLayout();
+    Show();
+    LocalizedStrings::HelpTag const *const stock =
+        LocalizedStrings::HelpTagMgr::Instance().DemandHelpTag("kTrackSelector", "kTrackSelector");
+    pane->AttachHelpTag(1, stock);
+    Rect const second = InThatLayout(kSecond);
+    LocalizedStrings::HelpTag const *tag = nullptr;
+    Rect place = {0, 0, 0, 0};
+    OS::Help::Placement placement = OS::Help::Placement(0);
+    double delay = 0;
+    ASSERT_TRUE(pane->GetHelpTagForPoint(Point{static_cast<short>(second.top + 5), 35}, tag, place, placement,
+                                         delay));
+    EXPECT_EQ(place, (Rect{second.top, static_cast<short>(second.left + 2), second.bottom,
+                           static_cast<short>(second.right - 2)}));
+}
+
+TEST_F(BoxSelect, BoxesOfARecordComeIntoALayoutToo) {
+    boxSelResRec record = {boxSelResRec::kKind, 2, 0, kOneAtATime};
+    Group *const group = new Group(glog, true);
+    BoxSelectPane *const pane = BoxSelectPane::NewBoxSelectPane(glog, &record);
+    group->Add(pane, -1);
+    Show();
+    EXPECT_EQ(BoundsOf(*pane, 1), (Rect{0, 0, 0, 0}));
+}
+
+TEST_F(BoxSelect, TakenOutOfALayoutItsBoxesStayCountedFromTheirCorner) {
+    Group *const group = new Group(glog, true);
+    BoxSelectPane *const pane = New();
+    group->Add(pane, -1);
+    group->DelGuts(0, true);
+    pane->SetContainer(nullptr);
+    EXPECT_EQ(BoundsOf(*pane, 0), Moved(kFirst, -10, -20));
+    EXPECT_EQ(BoundsOf(*pane, 2), Moved(kOverlapping, -10, -20));
+}
+
 TEST_F(BoxSelect, WithoutBoxesItMayComeIntoALayout) {
     boxSelResRec record = {boxSelResRec::kKind, 0, 0, kEachOnItsOwn};
     BoxSelectPane *const pane = BoxSelectPane::NewBoxSelectPane(glog, &record);
@@ -430,6 +887,23 @@ TEST_F(BoxSelect, AHelpTagHoldsForItsBoxALittleNarrowed) {
     EXPECT_EQ(place, (Rect{20, 42, 40, 58}));
     EXPECT_EQ(placement, OS::Help::kPlacementForParts);
     EXPECT_DOUBLE_EQ(delay, 0.5);
+}
+
+TEST_F(BoxSelect, AProgramsOwnHelpTagHelperStaysInCharge) {
+    class Own : public HelpTagHelper {
+    public:
+        bool IsDefaultHelper() const override { return false; }
+        bool GetHelpTag(Point, LocalizedStrings::HelpTag const *&, Rect &, enum OS::Help::Placement &,
+                        double &) override {
+            return false;
+        }
+    };
+    BoxSelectPane *const pane = New();
+    Own *const own = new Own;
+    pane->SetHelpTagHelper(AutoPtr<HelpTagHelper>(own));
+    pane->AttachHelpTag(
+        0, LocalizedStrings::HelpTagMgr::Instance().DemandHelpTag("kTrackSelector", "kTrackSelector"));
+    EXPECT_EQ(pane->GetHelpTagHelper(), own);
 }
 
 TEST_F(BoxSelect, FurtherHelpTagsJoinTheFirst) {
@@ -474,11 +948,11 @@ TEST_F(BoxSelect, ItsProcedureVariablesForTheStatusStoreOrRepaint) {
     EXPECT_EQ(MarksOf(*pane), ThinFrames(*pane, {kFirst}));
 }
 
-TEST_F(BoxSelect, AProcedureVariableMayBeReplaced) {
+TEST_F(BoxSelect, ItsProcedureVariablesNarrowTheIndex) {
     BoxSelectPane *const pane = New();
-    auto const former = btnReadOneBS;
-    btnReadOneBS = [](BoxSelectPane *, int index) { return index == 77; };
-    EXPECT_TRUE(btnReadOneBS(pane, 77));
-    btnReadOneBS = former;
-    EXPECT_FALSE(btnReadOneBS(pane, 0));
+    btnSetOneBS(pane, 0x10001, true);
+    EXPECT_TRUE(pane->ReadOne(1));
+    EXPECT_TRUE(btnReadOneBS(pane, 0x10001));
+    radSetBS(pane, 0x10002);
+    EXPECT_EQ(radGetBS(pane), 2);
 }
