@@ -28,6 +28,7 @@ LayoutKey const kLayoutKeys[] = {
 
 UString Key(char const *ascii) { return UString(ascii, UString::ByteEncoding(1)); }
 
+// From the top left of the outer rectangle to its coordinates.
 Rect MovedTo(Rect const &inner, Rect const &outer) {
     return {static_cast<short>(outer.top + inner.top), static_cast<short>(outer.left + inner.left),
             static_cast<short>(outer.top + inner.bottom), static_cast<short>(outer.left + inner.right)};
@@ -100,15 +101,9 @@ void GlogLayoutItem::SetAttributeFromString(Attribute attribute, UString const &
 Rect GlogLayoutItem::GetBorderRect() {
     LayoutEngine::SettleFor(*this);
     if (rep->isPart && rep->pane && rep->pane->IsInLayout()) {
-        // A part keeps its place in its pane: it moves with the pane's rectangle. A size that it was told
-        // replaces its own.
-        Rect const pane = rep->pane->GetLayoutRect()->GetBorderRect();
-        Rect const made = LayoutEngine::Rep(*rep->pane->GetLayoutRect()).made;
-        int const top = rep->made.top + pane.top - made.top, left = rep->made.left + pane.left - made.left;
-        int const height = rep->height > 0 ? rep->height : rep->made.bottom - rep->made.top;
-        int const width = rep->width > 0 ? rep->width : rep->made.right - rep->made.left;
-        return {static_cast<short>(top), static_cast<short>(left), static_cast<short>(top + height),
-                static_cast<short>(left + width)};
+        // A part moves with its pane's rectangle.
+        GlogLayoutItem::Rep const &pane = LayoutEngine::Rep(*rep->pane->GetLayoutRect());
+        return MovedTo(LayoutEngine::PartInPane(*rep, pane), rep->pane->GetLayoutRect()->GetBorderRect());
     }
     return rep->hasPlace ? rep->place : rep->made;
 }

@@ -122,15 +122,19 @@ LayoutEngine::Extent LayoutEngine::MeasurePane(GlogLayoutItem::Rep &rep) {
         natural = Measure(*compound->GetLayout());
     if (rep.isPart || !rep.pane)
         return natural;
-    // A part that was told a larger size than it was made with makes its pane larger.
+    // Parts that reach beyond the pane as it was made make it larger.
     for (RCPtr<GlogLayoutRectItem> const &item : PaneAccess::Rep(*rep.pane).subItems) {
-        GlogLayoutItem::Rep const &part = Rep(*item);
-        if (part.width > 0)
-            natural.width = std::max(natural.width, part.made.left - rep.made.left + part.width);
-        if (part.height > 0)
-            natural.height = std::max(natural.height, part.made.top - rep.made.top + part.height);
+        Rect const part = PartInPane(Rep(*item), rep);
+        natural.width = std::max(natural.width, part.right + Rep(*item).insetRight);
+        natural.height = std::max(natural.height, part.bottom + Rep(*item).insetBottom);
     }
     return natural;
+}
+
+Rect LayoutEngine::PartInPane(GlogLayoutItem::Rep const &part, GlogLayoutItem::Rep const &pane) {
+    return MakeRect(
+        part.made.left - pane.made.left + part.insetLeft, part.made.top - pane.made.top + part.insetTop,
+        part.width > 0 ? part.width : Width(part.made), part.height > 0 ? part.height : Height(part.made));
 }
 
 LayoutEngine::Extent LayoutEngine::Measure(GlogLayoutItem &item) {

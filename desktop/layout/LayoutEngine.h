@@ -27,6 +27,9 @@ public:
         int width, height;
     };
     static Extent Measure(GlogLayoutItem &);
+    // Where a part of a pane lies in a layout, from the top left of its pane: in its own place, below and
+    // right of its insets. A size that it was told replaces its own.
+    static Rect PartInPane(GlogLayoutItem::Rep const &part, GlogLayoutItem::Rep const &pane);
     static void Place(GlogLayoutItem &, Rect const &);
 
 private:

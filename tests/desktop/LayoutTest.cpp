@@ -181,6 +181,21 @@ TEST_F(LayoutTest, PartsOfAPaneMoveWithIt) {
     EXPECT_EQ(part->GetBorderRect(), (Rect{24, 5, 34, 25}));
 }
 
+TEST_F(LayoutTest, InsetsOfAPartKeepItsDistanceAndEnlargeItsPane) {
+    ProbePane *pane = new ProbePane(glog, {0, 0, 20, 50}, calls, "parts");
+    pane->UseLayoutSubItemMode();
+    RCPtr<GlogLayoutRectItem> part = GlogLayout::MakeRectItem({4, 5, 20, 45}, -1, 0, "");
+    pane->AddLayoutSubItem(part);
+    box->Add(pane, -1);
+    box->SetUseLayout(true);
+    part->SetAttribute(Item::kInsetTop, 2, Item::kPixels, UString());
+    part->SetAttribute(Item::kInsetLeft, 3, Item::kPixels, UString());
+    part->SetAttribute(Item::kInsetBottom, 4, Item::kPixels, UString());
+    part->SetAttribute(Item::kInsetRight, 5, Item::kPixels, UString());
+    EXPECT_EQ(part->GetBorderRect(), (Rect{6, 8, 22, 48}));
+    EXPECT_EQ(pane->GetLayoutRect()->GetBorderRect(), (Rect{0, 0, 26, 53}));
+}
+
 TEST_F(LayoutTest, LayoutIsDoneOnceForManyChanges) {
     ProbePane *a = Add(30, 20), *b = Add(30, 20);
     box->SetUseLayout(true);

@@ -7,6 +7,7 @@
 #include "tests/resources/TemporaryDirectory.h"
 #include "tests/screens/GalleryPages.h"
 #include "tests/screens/GoldenPicture.h"
+#include "tools/gallery/GalleryItems.h"
 #include <gtest/gtest.h>
 #include <memory>
 #include <tuple>
@@ -31,6 +32,7 @@ class GoldenPage : public testing::TestWithParam<PageLook> {};
 TEST_P(GoldenPage, LooksAsItDid) {
     auto const &[page, look] = GetParam();
     SimulatedDesktop desktop(OptionsFor(look));
+    GalleryItems::Add();
     glogRec *const glog = LoadGlog(page.path);
     ShowGlog(glog, kShowGlog);
     EXPECT_TRUE(GoldenPicture::Matches(*Glog::From(glog).Pixels(), page.name + '-' + look.Name()));
@@ -44,19 +46,48 @@ INSTANTIATE_TEST_SUITE_P(Gallery, GoldenPage,
                                                std::get<1>(info.param).Name());
                          });
 
-// Something held down, as a script has it.
+// What a page at rest does not show, as a script has it: DIALOG-states.xml after these steps.
 struct Press {
+    char const *dialog;
     char const *name;
     char const *script;
+    std::string Name() const { return std::string(dialog) + '-' + name; }
 };
-Press const kPresses[] = {{"rest", ""},
-                          {"oval-pressed", "press 40 24\n"},
-                          {"stud-pressed", "press 40 56\n"},
-                          {"frame-pressed", "press 20 88\n"},
-                          {"oval-slid-off", "press 40 24\nmove 230 100\n"},
-                          {"disabled-refused", "press 160 24\n"}};
+Press const kPresses[] = {
+    {"push-button", "rest", ""},
+    {"push-button", "oval-pressed", "press 40 24\n"},
+    {"push-button", "stud-pressed", "press 40 56\n"},
+    {"push-button", "frame-pressed", "press 20 88\n"},
+    {"push-button", "oval-slid-off", "press 40 24\nmove 230 100\n"},
+    {"push-button", "disabled-refused", "press 160 24\n"},
+    {"choice", "rest", ""},
+    {"choice", "check-on-pressed", "press 22 22\n"},
+    {"choice", "check-off-pressed", "press 50 46\n"}, // on its label
+    {"choice", "radio-on-pressed", "press 142 22\n"},
+    {"choice", "radio-off-pressed", "press 142 46\n"},
+    {"choice", "radio-chosen", "click 160 46\n"},
+    {"choice", "option-click", "click 22 46 option\n"},
+    {"choice", "command-click", "click 22 22 command\n"},
+    {"box", "rest", ""},
+    {"box", "others-chosen", "click 140 26\nclick 110 78\n"},
+    {"box", "all-chosen", "click 30 52\nclick 180 52\nclick 200 78\nclick 270 78\n"},
+    {"icon", "rest", ""},
+    {"icon", "button-pressed", "press 28 48\n"},
+    {"icon", "on-pressed", "press 68 48\n"},
+    {"icon", "slid-off", "press 28 48\nmove 28 100\n"},
+    {"icon", "next-state", "click 28 48\n"},
+    {"icon", "badge-pressed", "press 22 72\n"},
+    {"icon", "held-down", "press 28 96\n"},
+    {"small-button", "rest", ""},
+    {"small-button", "upper-pressed", "press 47 20\n"},
+    {"small-button", "lower-pressed", "press 47 20\nmove 47 34\n"},
+    {"small-button", "stepped-down", "click 47 34\n"},
+    {"small-button", "open", "click 78 26\n"},
+    {"small-button", "selector-pressed", "press 110 26\n"},
+    {"small-button", "selector-on", "click 110 26\n"},
+};
 
-void PrintTo(Press const &press, std::ostream *out) { *out << press.name; }
+void PrintTo(Press const &press, std::ostream *out) { *out << press.Name(); }
 
 typedef std::tuple<Press, Look> PressLook;
 
@@ -67,19 +98,19 @@ TEST_P(GoldenPress, LooksAsItDid) {
     TemporaryDirectory directory;
     std::string const picture = directory.Path() + "/picture.png";
     SimulatedDesktop desktop(OptionsFor(look));
-    ShowGlog(LoadGlog(TreeDirectory() + "/tests/screens/push-button-states.xml"), kShowGlog);
+    GalleryItems::Add();
+    ShowGlog(LoadGlog(TreeDirectory() + "/tests/screens/" + press.dialog + "-states.xml"), kShowGlog);
     desktop.Play(std::string(press.script) + "wait 0.5\nsnapshot " + picture);
     std::string error;
     std::unique_ptr<Surface> const actual = Surface::ReadPng(picture, error);
     ASSERT_TRUE(actual) << error;
-    EXPECT_TRUE(
-        GoldenPicture::Matches(*actual, std::string("push-button-") + press.name + '-' + look.Name()));
+    EXPECT_TRUE(GoldenPicture::Matches(*actual, press.Name() + '-' + look.Name()));
 }
 
 INSTANTIATE_TEST_SUITE_P(Buttons, GoldenPress,
                          testing::Combine(testing::ValuesIn(kPresses), testing::ValuesIn(kLooks)),
                          [](testing::TestParamInfo<PressLook> const &info) {
-                             return AsTestName(std::string(std::get<0>(info.param).name) + '-' +
+                             return AsTestName(std::get<0>(info.param).Name() + '-' +
                                                std::get<1>(info.param).Name());
                          });
 

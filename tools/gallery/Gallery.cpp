@@ -1,13 +1,18 @@
 #include "tools/gallery/Gallery.h"
+#include "buttons/BoxSelectPane.h"
+#include "buttons/CheckBoxPane.h"
 #include "buttons/FrameButtonPane.h"
-#include "dialogs/ItemRegistry.h"
+#include "buttons/GIconButton.h"
+#include "buttons/RadioButtonPane.h"
+#include "buttons/TwistDownButton.h"
 #include "dialogs/LoadGlog.h"
 #include "dialogs/Utf8.h"
 #include "host/CompoundPane.h"
 #include "host/GlogLayout.h"
 #include "host/glogRec.h"
-#include "text/LabelPane.h"
 #include "tools/gallery/ChoiceButtonPane.h"
+#include "tools/gallery/GalleryItems.h"
+#include "tools/gallery/LabelText.h"
 
 namespace {
 
@@ -16,6 +21,9 @@ int const kPageList = 9000;
 int const kPagePlace = 9001;
 int const kStatus = 9002;
 int const kFirstPage = 9100; // and one more for each page
+
+// On a page: the group that a triangle opens has the triangle's number and this.
+int const kDetailsOffset = 100;
 
 struct ThemeChoice {
     int id;
@@ -32,29 +40,29 @@ ScaleChoice const kScales[] = {{9020, 1.0}, {9021, 1.5}, {9022, 2.0}};
 short const kPageButtonHeight = 28; // pixels
 int const kFill = 3;                // alignment: as wide as the group
 
-void AddChoiceItems() {
-    ItemRegistry::Instance().Add(
-        ItemType("Choice")
-            .Keys(KeyList().Rect("BoundsRect").String("ButtonText").Required().Integer("Align", 0, 2))
-            .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
-                return ChoiceButtonPane::NewChoiceButtonPane(glog, sheet);
-            }));
-}
-
 glogRec *LoadFrame(std::string const &path) {
-    AddChoiceItems();
+    GalleryItems::Add();
     return LoadGlog(path);
 }
 
-UString KindOf(GlogPane *pane) {
-    return Utf8::ToUString(dynamic_cast<FrameButtonPane *>(pane) ? "Frame button" : "Button");
+// What a hit pane without a name of its own is called.
+char const *KindOf(GlogPane *pane) {
+    if (dynamic_cast<FrameButtonPane *>(pane))
+        return "Frame button";
+    if (dynamic_cast<BoxSelectPane *>(pane))
+        return "Box select";
+    if (dynamic_cast<TwistDownButton *>(pane))
+        return "Triangle";
+    if (dynamic_cast<CheckBoxPane *>(pane))
+        return "Check boxes";
+    if (dynamic_cast<RadioButtonPane *>(pane))
+        return "Radio buttons";
+    if (dynamic_cast<GIconButton *>(pane))
+        return "Icon button";
+    return dynamic_cast<GIconPane *>(pane) ? "Icon" : "Button";
 }
 
-UString Number(int value) {
-    UString text;
-    tarn::NumToUString(value, tarn::kPlainNumber, text);
-    return text;
-}
+UString Text(char const *utf8) { return Utf8::ToUString(utf8); }
 
 } // namespace
 
@@ -62,6 +70,7 @@ Gallery::Gallery(Desktop &desktop_, PageFiles const &files_, double scale_)
     : desktop(desktop_)
     , files(files_)
     , window(LoadFrame(files_.Frame()))
+    , commands([this](CommandSpecifier const &command) { ReportCommand(command); })
     , scale(scale_) {
     AddPageButtons();
     ShowPage(0);
@@ -97,7 +106,7 @@ void Gallery::ShowPage(std::size_t index) {
         place->Del(0);
     page = index;
     MarkChoices();
-    SetStatus(Utf8::ToUString("Press something"));
+    SetStatus(Text("Press something"));
 }
 
 void Gallery::Choose(int id, bool on) {
@@ -120,9 +129,22 @@ void Gallery::Hit(int item, int value) {
         return;
     }
     GlogPane *const pane = Find(item);
-    if (FrameButtonPane *button = dynamic_cast<FrameButtonPane *>(pane))
-        button->ToggleState();
+    ShowEffect(pane, item);
     Report(pane, item, value);
+}
+
+// What a program would do about a hit, where the pane leaves it to the program.
+void Gallery::ShowEffect(GlogPane *pane, int item) {
+    if (FrameButtonPane *button = dynamic_cast<FrameButtonPane *>(pane)) {
+        button->ToggleState();
+    } else if (TwistDownButton *triangle = dynamic_cast<TwistDownButton *>(pane)) {
+        if (GlogPane *details = Find(item + kDetailsOffset))
+            triangle->IsOpen() ? details->Show() : details->Hide();
+    } else if (GIconPane *icon = dynamic_cast<GIconPane *>(pane);
+               icon && !dynamic_cast<GIconButton *>(pane)) {
+        icon->SetCurState(static_cast<short>((icon->GetCurState() + 1) % icon->GetNumStates()));
+        icon->Inval();
+    }
 }
 
 bool Gallery::Navigate(int item) {
@@ -150,15 +172,21 @@ void Gallery::Report(GlogPane *pane, int item, int value) {
     UString name;
     if (button)
         button->GetButtonText(name);
-    UString text = name.empty() ? KindOf(pane) : name;
-    text += Utf8::ToUString(", item ");
-    text += Number(item);
-    text += Utf8::ToUString(", was pressed and answered ");
-    text += Number(value);
+    UString text = name.empty() ? Text(KindOf(pane)) : name;
+    text += Text(", item ");
+    text += LabelText::OfNumber(item);
+    text += Text(", was pressed and answered ");
+    text += LabelText::OfNumber(value);
     SetStatus(text);
 }
 
-void Gallery::SetStatus(UString const &text) {
-    if (LabelPane *label = dynamic_cast<LabelPane *>(Find(kStatus)))
-        label->SetTextWithInval(text);
+void Gallery::ReportCommand(CommandSpecifier const &command) {
+    UString text = Text("Command ");
+    text += LabelText::OfNumber(command.commandID);
+    text += Text(" of class ");
+    text += LabelText::OfNumber(command.classID);
+    text += Text(" was sent");
+    SetStatus(text);
 }
+
+void Gallery::SetStatus(UString const &text) { LabelText::Show(window, kStatus, text); }

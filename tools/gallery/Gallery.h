@@ -3,6 +3,7 @@
 #pragma once
 #include "desktop/Desktop.h"
 #include "host/UString.h"
+#include "tools/gallery/CommandReport.h"
 #include "tools/gallery/PageFiles.h"
 #include <string>
 
@@ -23,10 +24,12 @@ public:
 private:
     void AddPageButtons();
     void Hit(int item, int value);
+    void ShowEffect(GlogPane *, int item);
     bool Navigate(int item);
     void SetScale(double);
     void MarkChoices();
     void Report(GlogPane *, int item, int value);
+    void ReportCommand(CommandSpecifier const &);
     void SetStatus(UString const &);
     GlogPane *Find(int id) const;
     CompoundPane *Container(int id) const;
@@ -35,6 +38,7 @@ private:
     Desktop &desktop;
     PageFiles const &files;
     glogRec *window;
+    CommandReport commands;
     std::size_t page = 0;
     double scale; // 0: the display's
 };

@@ -1,0 +1,72 @@
+#include "tools/gallery/GalleryItems.h"
+#include "buttons/GIconButton.h"
+#include "dialogs/ItemRegistry.h"
+#include "host/Icons.h"
+#include "tools/gallery/BackdropPane.h"
+#include "tools/gallery/ChoiceButtonPane.h"
+#include "tools/gallery/HoldButtonPane.h"
+#include "tools/gallery/StepperPane.h"
+
+namespace {
+
+short const kBadgeFamily = 2004;
+short const kRestBadge = 0, kPressedBadge = 1, kDisabledBadge = 2;
+short const kBadgeSide = 9; // pixels
+
+// At the upper right corner of the pane, which is a little wider than its icon.
+void DrawBadge(glogRec *, Rect box, bool enabled, bool pressed, GIconPane *) {
+    short const badge = !enabled ? kDisabledBadge : pressed ? kPressedBadge : kRestBadge;
+    Draw1Icon(kBadgeFamily, badge, static_cast<short>(box.right - kBadgeSide), box.top);
+}
+
+ItemType BadgeButtonType() {
+    ItemType const &plain = *ItemRegistry::Instance().Find("IconButton");
+    ItemType::Maker const make = plain.maker;
+    return ItemType("BadgeButton").Keys(plain.keys).MadeBy([make](glogRec *glog, GlogStyleSheet *sheet) {
+        GlogPane *const pane = make(glog, sheet);
+        if (GIconPane *icon = dynamic_cast<GIconPane *>(pane))
+            icon->SetDecalProc(DrawBadge);
+        return pane;
+    });
+}
+
+} // namespace
+
+void GalleryItems::Add() {
+    ItemRegistry &registry = ItemRegistry::Instance();
+    registry.Add(
+        ItemType("Choice")
+            .Keys(KeyList().Rect("BoundsRect").String("ButtonText").Required().Integer("Align", 0, 2))
+            .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                return ChoiceButtonPane::NewChoiceButtonPane(glog, sheet);
+            }));
+    registry.Add(ItemType("Backdrop")
+                     .Keys(KeyList().Rect("BoundsRect").Integer("Num").Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return BackdropPane::NewBackdropPane(glog, sheet);
+                     }));
+    registry.Add(ItemType("Stepper")
+                     .Keys(KeyList()
+                               .Point("Origin")
+                               .Integer("TextID")
+                               .Required()
+                               .Integer("Num")
+                               .Integer("CmdClassID")
+                               .Integer("CmdID"))
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return StepperPane::NewStepperPane(glog, sheet);
+                     }));
+    registry.Add(ItemType("HoldButton")
+                     .Keys(KeyList()
+                               .Rect("BoundsRect")
+                               .String("FamilyID")
+                               .Required()
+                               .Integer("Num")
+                               .Integer("TextID")
+                               .Required()
+                               .Flag("Mode"))
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return HoldButtonPane::NewHoldButtonPane(glog, sheet);
+                     }));
+    registry.Add(BadgeButtonType());
+}

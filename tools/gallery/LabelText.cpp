@@ -1,0 +1,14 @@
+#include "tools/gallery/LabelText.h"
+#include "host/glogRec.h"
+#include "text/LabelPane.h"
+
+void LabelText::Show(glogRec *glog, int labelID, UString const &text) {
+    if (LabelPane *label = dynamic_cast<LabelPane *>(GetGlogItem(glog, static_cast<short>(labelID))))
+        label->SetTextWithInval(text);
+}
+
+UString LabelText::OfNumber(int number) {
+    UString text;
+    tarn::NumToUString(number, tarn::kPlainNumber, text);
+    return text;
+}
