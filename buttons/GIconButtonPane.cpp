@@ -4,6 +4,7 @@
 #include "host/EventRecordAdapter.h"
 #include "host/Icons.h"
 #include "host/MouseTask.h"
+#include "host/PaneWatch.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
 #include <algorithm>
@@ -27,9 +28,10 @@ private:
     void ShowState(short);
 
     GIconButtonPane *pane;
-    short originalState; // before the press
-    short nextState;     // after a completed click
-    short downState;     // while the button is held down
+    PaneWatch const watch; // what a press sets off may delete the button
+    short originalState;   // before the press
+    short nextState;       // after a completed click
+    short downState;       // while the button is held down
     short canCancel;
     int result;
     bool outside; // where the mouse is
@@ -48,6 +50,7 @@ short const kStatesWithOwnDisabledIcons = 2; // from this number of disabled sta
 TrackButtonMouseTask::TrackButtonMouseTask(GIconButtonPane *button, EventRecordAdapter const &press)
     : MouseTask(0)
     , pane(button)
+    , watch(button)
     , originalState(0)
     , nextState(0)
     , downState(0)
@@ -59,10 +62,14 @@ TrackButtonMouseTask::TrackButtonMouseTask(GIconButtonPane *button, EventRecordA
 void TrackButtonMouseTask::MouseTaskBegin() {
     originalState = pane->GetState();
     nextState = pane->ClickAction(event.modifiers);
+    if (!watch.PaneExists())
+        return;
     int const look = std::min<int>(originalState, pane->numDownStates - 1);
     downState = static_cast<short>(pane->FirstDownState() + look);
     pane->SetState(downState);
     pane->DoButtonPress(event.modifiers);
+    if (!watch.PaneExists())
+        return;
     UpdateGlog(pane->GetGlog());
     SetSleepTime(kRepeatInterval);
 }
@@ -83,7 +90,8 @@ void TrackButtonMouseTask::FollowMouse(Point const &where) {
         ShowState(downState);
         pane->DoButtonPress(event.modifiers);
     }
-    UpdateGlog(pane->GetGlog());
+    if (watch.PaneExists())
+        UpdateGlog(pane->GetGlog());
 }
 
 void TrackButtonMouseTask::ShowState(short state) {

@@ -29,6 +29,7 @@ class MouseTask;
 class OldMouseTask;
 class OSRgn;
 class PaneAccess;
+class PaneWatch;
 class SelectStringPane;
 class UIEvent;
 struct glogRec;
@@ -85,7 +86,8 @@ public:
     // Sets the port's colours for the pane's active flag; by default black on white.
     virtual void ActivateColors();
     // Runs the task until the mouse button is released. The point is where it went down, in pane coordinates.
-    // Other windows and timers go on meanwhile.
+    // Other windows and timers go on meanwhile. A pane that is deleted meanwhile ends its task without
+    // MouseTaskEnd.
     virtual void TrackMouse(MouseTask &, Point const &start);
     // Older forms, for tasks that nothing makes any more.
     virtual void TrackMouse(OldMouseTask *, Point *);
@@ -253,6 +255,7 @@ private:
     friend class CompoundPane;
     friend struct glogRec;
     friend class PaneAccess;
+    friend class PaneWatch;
     struct Rep;
     Rep *rep;
 };

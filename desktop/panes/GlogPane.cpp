@@ -10,6 +10,7 @@
 #include "host/CompoundPane.h"
 #include "host/CustomEventHandler.h"
 #include "host/MouseTask.h"
+#include "host/PaneWatch.h"
 #include "host/Services.h"
 #include "host/VelaDrawing.h"
 
@@ -19,6 +20,8 @@ GlogPane::GlogPane()
     , rep(new Rep) {}
 
 GlogPane::~GlogPane() {
+    while (rep->watches)
+        rep->watches->Watch(nullptr);
     if (container)
         PaneAccess::TakeOut(*this);
     if (glog) {
@@ -375,13 +378,16 @@ int GlogPane::HandleSecondaryButtonClick(EventRecordAdapter *) { return 0; }
 void GlogPane::TrackMouse(MouseTask &task, Point const &start) {
     task.startPoint = start;
     task.trackingResult = MouseTracking::Result(0);
+    PaneWatch const self(this);
     PrepareDuringTrackMouse();
     task.MouseTaskBegin();
     Point where = start;
-    while (task.MouseIsDragging(where)) {
+    while (self.PaneExists() && task.MouseIsDragging(where) && self.PaneExists()) {
         PrepareDuringTrackMouse();
         task.MouseTaskContinue(where);
     }
+    if (!self.PaneExists())
+        return;
     PrepareDuringTrackMouse();
     task.MouseTaskEnd();
 }

@@ -19,6 +19,7 @@ struct GlogPane::Rep {
     bool subItemMode = false;
     std::vector<RCPtr<GlogLayoutRectItem>> subItems;
     std::unique_ptr<HelpTagHelper> help;
+    PaneWatch *watches = nullptr; // those who want to know when the pane goes away
 };
 
 struct CompoundPane::CompoundRep {

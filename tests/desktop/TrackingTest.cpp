@@ -1,6 +1,8 @@
 #include "desktop/drawing/Surface.h"
 #include "host/CIdleChore.h"
 #include "host/MouseTask.h"
+#include "host/PanePtr.h"
+#include "host/PaneWatch.h"
 #include "host/Services.h"
 #include "tests/PaneTest.h"
 #include "tests/desktop/ProbePane.h"
@@ -305,6 +307,67 @@ TEST_F(TrackingTest, AChoreMayCancelAnotherThatIsDueAtTheSameTime) {
     two.Assign();
     desktop.Play("click 1 1");
     EXPECT_EQ(runs, 0);
+}
+
+// A task that notes its calls and does what the test says when it goes on.
+class NotingTask : public MouseTask {
+public:
+    NotingTask(Calls &log_, std::function<void()> onContinue_)
+        : MouseTask(0)
+        , log(log_)
+        , onContinue(std::move(onContinue_)) {}
+
+    void MouseTaskBegin() override { log.push_back("begin"); }
+    void MouseTaskContinue(Point const &where) override {
+        log.push_back(Spelled(where));
+        onContinue();
+    }
+    void MouseTaskEnd() override { log.push_back("end"); }
+
+private:
+    Calls &log;
+    std::function<void()> onContinue;
+};
+
+TEST_F(TrackingTest, ATaskRunsFromThePressToTheRelease) {
+    Track("press 30 20\nmove 31 22\nrelease", [&] {
+        NotingTask task(log, [] {});
+        pane->TrackMouse(task, {20, 30});
+    });
+    EXPECT_EQ(log, (Calls{"begin", "31,22", "end"}));
+}
+
+TEST_F(TrackingTest, ATaskWhosePaneIsDeletedIsOverWithoutItsEnd) {
+    Track("press 30 20\nmove 31 22\nmove 32 22\nrelease", [&] {
+        NotingTask task(log, [&] {
+            delete pane;
+            pane = nullptr;
+        });
+        pane->TrackMouse(task, {20, 30});
+    });
+    EXPECT_EQ(pane, nullptr);
+    EXPECT_EQ(log, (Calls{"begin", "31,22"}));
+}
+
+TEST_F(TrackingTest, AWatchKnowsWhetherItsPaneExists) {
+    PaneWatch first(pane), second(pane);
+    ProbePane *other = new ProbePane(glog, {0, 0, 10, 10}, calls);
+    second.Watch(other);
+    EXPECT_TRUE(first.PaneExists());
+    delete pane;
+    EXPECT_FALSE(first.PaneExists());
+    EXPECT_TRUE(second.PaneExists());
+    second.Watch(nullptr);
+    EXPECT_FALSE(second.PaneExists());
+}
+
+TEST_F(TrackingTest, APointerToAPaneIsNullOnceThePaneIsGone) {
+    PanePtr<ProbePane> pointer;
+    EXPECT_FALSE(pointer);
+    pointer = pane;
+    EXPECT_EQ(pointer.Get(), pane);
+    delete pane;
+    EXPECT_EQ(pointer.Get(), nullptr);
 }
 
 } // namespace
