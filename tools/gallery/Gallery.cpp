@@ -3,6 +3,7 @@
 #include "buttons/CheckBoxPane.h"
 #include "buttons/FrameButtonPane.h"
 #include "buttons/GIconButton.h"
+#include "buttons/GIconButtonPane.h"
 #include "buttons/RadioButtonPane.h"
 #include "buttons/TwistDownButton.h"
 #include "dialogs/LoadGlog.h"
@@ -57,7 +58,7 @@ char const *KindOf(GlogPane *pane) {
         return "Check boxes";
     if (dynamic_cast<RadioButtonPane *>(pane))
         return "Radio buttons";
-    if (dynamic_cast<GIconButton *>(pane))
+    if (dynamic_cast<GIconButton *>(pane) || dynamic_cast<GIconButtonPane *>(pane))
         return "Icon button";
     return dynamic_cast<GIconPane *>(pane) ? "Icon" : "Button";
 }

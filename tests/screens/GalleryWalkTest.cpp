@@ -1,0 +1,213 @@
+// A walk through the gallery: each page is opened with its button, and each kind of control on it is used.
+//
+// gallery-walk.txt is the walk's record: lines without an indent are steps, and under each stands what it led
+// to: the messages as the desktop reports them, without time, and what a label says afterwards.
+//
+//     page NAME                     the page's button is clicked
+//     click ITEM[.PART] [MODIFIER]  the middle of an item of the page, or of a button, box or half of it
+//     slide ITEM[.PART]             the mouse is pressed there, moved off, and released
+//     hold ITEM[.PART]              the mouse is held there for half a second
+//     label ITEM                    nothing is done; the label's text follows
+//
+// After every step a full redraw must change nothing.
+#include "buttons/BoxSelectPane.h"
+#include "buttons/ButtonGroupPane.h"
+#include "desktop/SimulatedDesktop.h"
+#include "desktop/drawing/Surface.h"
+#include "desktop/observe/MessageTrace.h"
+#include "desktop/panes/Glog.h"
+#include "desktop/panes/PaneAccess.h"
+#include "dialogs/Utf8.h"
+#include "host/CompoundPane.h"
+#include "host/glogRec.h"
+#include "tests/screens/GalleryPages.h"
+#include "text/LabelPane.h"
+#include "tools/TextFile.h"
+#include "tools/gallery/Gallery.h"
+#include <filesystem>
+#include <fstream>
+#include <gtest/gtest.h>
+#include <set>
+#include <sstream>
+
+namespace {
+
+typedef std::vector<std::string> Lines;
+
+int const kStatus = 9002;       // the line that tells what was hit
+int const kPagePlace = 9001;    // what holds the page
+int const kFirstPage = 9100;    // the button of the first page
+char const kIndent[] = "    ";  // of what a step led to
+char const kAside[] = "890 10"; // in the window, off every control
+
+// Classes of panes that nobody clicks.
+std::set<std::string> const kStill = {"GroupPane", "LabelPane", "SpacerPane", "BackdropPane",
+                                      "SuccessiveIconsPane"};
+
+// Where a step is taken: "ITEM" or "ITEM.PART".
+struct Place {
+    explicit Place(std::string const &text)
+        : item(std::stoi(text))
+        , part(text.find('.') == std::string::npos ? -1 : std::stoi(text.substr(text.find('.') + 1))) {}
+    int item;
+    int part; // -1: all of it
+};
+
+Lines LinesOf(std::string const &text) {
+    Lines lines;
+    std::istringstream stream(text);
+    for (std::string line; std::getline(stream, line);)
+        lines.push_back(line);
+    return lines;
+}
+
+std::string OutputPath() {
+    std::string const directory = std::string(GLOG_TEST_OUTPUT_DIR) + "/screens";
+    std::filesystem::create_directories(directory);
+    return directory + "/gallery-walk.txt";
+}
+
+Rect HalfOf(Rect box, bool lower) {
+    short const middle = static_cast<short>((box.top + box.bottom) / 2);
+    (lower ? box.top : box.bottom) = middle;
+    return box;
+}
+
+class GalleryWalk : public testing::Test {
+protected:
+    GalleryWalk()
+        : desktop(DesktopOptions().Scale(1))
+        , gallery(desktop, GalleryFiles(), 1) {
+        desktop.TakeMessages();
+    }
+
+    GlogPane &Item(int id) const {
+        GlogPane *const pane = GetGlogItem(gallery.Window(), static_cast<short>(id));
+        if (!pane)
+            throw std::runtime_error("there is no item " + std::to_string(id));
+        return *pane;
+    }
+
+    Rect RectOf(Place const &place) const {
+        GlogPane &pane = Item(place.item);
+        short const part = static_cast<short>(place.part);
+        Rect rect;
+        if (ButtonGroupPane *group = dynamic_cast<ButtonGroupPane *>(&pane)) {
+            group->GetButtonBounds(part, &rect);
+            return rect;
+        }
+        if (BoxSelectPane *boxes = dynamic_cast<BoxSelectPane *>(&pane)) {
+            boxes->GetOneBox(part, &rect);
+            return rect;
+        }
+        rect = pane.GetDrawRectangle();
+        return place.part < 0 ? rect : HalfOf(rect, place.part == 1);
+    }
+
+    // The middle of the place in the window, as scripts have it.
+    std::string Spot(Place const &place) const {
+        Rect const rect = RectOf(place);
+        Point const origin = PaneAccess::Origin(Item(place.item));
+        return std::to_string(origin.h + (rect.left + rect.right) / 2) + ' ' +
+               std::to_string(origin.v + (rect.top + rect.bottom) / 2);
+    }
+
+    std::string LabelText(int id) const {
+        LabelPane *const label = dynamic_cast<LabelPane *>(&Item(id));
+        return label ? Utf8::FromUString(label->GetText()) : "no label";
+    }
+
+    void OpenPage(std::string const &name) {
+        int const index = static_cast<int>(GalleryFiles().Find(name));
+        ExpectEveryKindUsed();
+        visited.insert(name);
+        desktop.Play("click " + Spot(Place(std::to_string(kFirstPage + index))) + "\nwait 1\n");
+        unused = ClassesIn(Item(kPagePlace));
+    }
+
+    // Of the page that is about to be left.
+    void ExpectEveryKindUsed() const { EXPECT_EQ(unused, std::set<std::string>()); }
+
+    // The classes of what can be clicked in the container.
+    static std::set<std::string> ClassesIn(GlogPane &pane) {
+        std::set<std::string> classes;
+        CompoundPane *const container = dynamic_cast<CompoundPane *>(&pane);
+        for (short i = 0; container && i < container->NumSubpanes(); ++i)
+            classes.merge(ClassesIn(*container->Get(i)));
+        if (!kStill.count(MessageTrace::ClassName(pane)))
+            classes.insert(MessageTrace::ClassName(pane));
+        return classes;
+    }
+
+    void Use(std::string const &gesture, Place const &place, std::string const &modifier) {
+        unused.erase(MessageTrace::ClassName(Item(place.item)));
+        std::string const spot = Spot(place);
+        if (gesture == "click")
+            desktop.Play("click " + spot + ' ' + modifier + "\nwait 1\n");
+        else if (gesture == "slide")
+            desktop.Play("press " + spot + "\nmove " + kAside + "\nrelease\nwait 1\n");
+        else if (gesture == "hold")
+            desktop.Play("press " + spot + "\nwait 0.5\nrelease\nwait 1\n");
+        else
+            throw std::runtime_error("there is no step \"" + gesture + '"');
+    }
+
+    // Takes the step; the record gets what it led to.
+    void Take(std::string const &step) {
+        std::istringstream words(step);
+        std::string gesture, where, modifier;
+        words >> gesture >> where >> modifier;
+        record += step + '\n';
+        int told = kStatus;
+        if (gesture == "page")
+            OpenPage(where);
+        else if (gesture == "label")
+            told = Place(where).item;
+        else
+            Use(gesture, Place(where), modifier);
+        RecordMessages();
+        record += kIndent + LabelText(told) + '\n';
+        EXPECT_TRUE(IsWhole()) << step;
+    }
+
+    // All but what containers answer to clicks, which is what the pane in them answers.
+    void RecordMessages() {
+        for (std::string const &line : desktop.TakeMessages()) {
+            std::size_t const start = line.find(',') + 1; // after the time
+            if (line.find("\"pane\":\"GroupPane\"") == std::string::npos)
+                record += kIndent + line.substr(start, line.size() - start - 1) + '\n';
+        }
+    }
+
+    // Whether the window shows what a full redraw shows.
+    bool IsWhole() {
+        Glog &glog = Glog::From(gallery.Window());
+        glog.Update();
+        Surface const &picture = *glog.Pixels();
+        std::vector<std::uint32_t> const shown(picture.Pixels(),
+                                               picture.Pixels() + picture.Width() * picture.Height());
+        glog.DamageAll();
+        glog.Update();
+        return std::equal(shown.begin(), shown.end(), glog.Pixels()->Pixels());
+    }
+
+    SimulatedDesktop desktop;
+    Gallery gallery;
+    std::set<std::string> visited; // pages
+    std::set<std::string> unused;  // classes of controls of the page that no step has used
+    std::string record;
+};
+
+TEST_F(GalleryWalk, LeadsToTheMessagesOfTheRecord) {
+    std::string const kept = TextFile::Read(TreeDirectory() + "/tests/screens/gallery-walk.txt");
+    for (std::string const &line : LinesOf(kept)) {
+        if (line.compare(0, sizeof kIndent - 1, kIndent) != 0)
+            Take(line);
+    }
+    ExpectEveryKindUsed();
+    EXPECT_EQ(visited.size(), GalleryFiles().Pages().size());
+    std::ofstream(OutputPath()) << record;
+    EXPECT_EQ(kept, record) << "what it led to is in " << OutputPath();
+}
+
+} // namespace
