@@ -1,0 +1,15 @@
+// The record of a grow box.
+#pragma once
+#include "host/Geometry.h"
+
+// Field after field, without gaps. The XML keys stand beside the fields.
+struct growResRec {
+    static short const kKind = 3; // of a record that was made from a dialog; nothing reads it
+
+    short kind;
+    Rect limits;              // "LimitsRect": the window's least width and height (left, top), its greatest
+                              // (right, bottom)
+    unsigned char borderLeft; // "BorderLeft": not 0 for a line down the left side
+    unsigned char borderTop;  // "BorderTop": not 0 for a line along the top
+    int color;                // "Color": 1 or 2 for a box without lines on another ground
+};
