@@ -1,0 +1,180 @@
+// Measures one toolkit, and prints a line with a name and a value for each measurement.
+//
+//     peer_NAME window SERVER     in a window of the X server with that process number
+//     peer_NAME offscreen SERVER  in memory
+//     peer_NAME memory BOXES      the resident memory with so many check boxes
+//
+// Times are nanoseconds of the processor, of the program and the server together: so neither what else runs
+// on the machine counts, nor a wait for the next frame or for a press that is shown for a while, and work
+// that is left to the server does.
+#include "bench/peers/Peer.h"
+#include "bench/peers/PeerForm.h"
+#include <X11/Xlib.h>
+#include <X11/extensions/XTest.h>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <ctime>
+#include <fstream>
+#include <memory>
+#include <string>
+#include <unistd.h>
+
+namespace {
+
+int const kBuilds = 5, kRepaints = 15, kToggles = 40, kClicks = 8;
+int const kStep = 37;                // from box to box; has no factor in common with their number
+int const kPressH = 6, kPressV = 11; // within a check box: on its mark in each of the toolkits
+int const kPrimaryButton = 1;
+int const kSettlingMicroseconds = 20000;
+long const kPerSecond = 1000000000;
+
+clockid_t serverClock = CLOCK_PROCESS_CPUTIME_ID;
+bool hasServer = false;
+
+[[noreturn]] void Fail(char const *what) {
+    std::fprintf(stderr, "peer: %s\n", what);
+    std::exit(EXIT_FAILURE);
+}
+
+long long Read(clockid_t clock) {
+    timespec now = {};
+    if (clock_gettime(clock, &now) != 0)
+        Fail("a clock cannot be read");
+    return static_cast<long long>(now.tv_sec) * kPerSecond + now.tv_nsec;
+}
+
+long long Now() { return Read(CLOCK_PROCESS_CPUTIME_ID) + (hasServer ? Read(serverClock) : 0); }
+
+long long heardAt = 0;
+
+void Report(char const *name, long long value) { std::printf("%s %lld\n", name, value); }
+
+template <class Action> void Time(char const *name, Action action) {
+    long long const start = Now();
+    action();
+    Report(name, Now() - start);
+}
+
+void Settle(Peer &peer) {
+    for (int i = 0; i < 5; ++i) {
+        usleep(kSettlingMicroseconds);
+        peer.Settle();
+    }
+}
+
+// A pointer for the server to move and to press, on a connection of its own.
+class Pointer {
+public:
+    Pointer()
+        : display(XOpenDisplay(nullptr)) {
+        if (!display)
+            Fail("the X server cannot be reached");
+    }
+    ~Pointer() { XCloseDisplay(display); }
+    void MoveTo(int h, int v) {
+        XTestFakeMotionEvent(display, -1, h, v, CurrentTime);
+        XSync(display, False);
+    }
+    void Click() {
+        XTestFakeButtonEvent(display, kPrimaryButton, True, CurrentTime);
+        XTestFakeButtonEvent(display, kPrimaryButton, False, CurrentTime);
+        XSync(display, False);
+    }
+
+private:
+    Display *display;
+};
+
+void TimeClicks(Peer &peer) {
+    Pointer pointer;
+    for (int i = 0; i < kClicks; ++i) {
+        PeerForm::Place const place = PeerForm::OfBox(i * kStep % PeerForm::kBoxes);
+        pointer.MoveTo(place.h + kPressH, place.v + kPressV);
+        Settle(peer);
+        heardAt = 0;
+        long long const start = Now();
+        pointer.Click();
+        peer.WaitUntilHeard();
+        if (heardAt == 0)
+            Fail("a click has not been heard");
+        Report("click", heardAt - start);
+        Settle(peer);
+    }
+}
+
+void Build(Peer &peer) { peer.Build(PeerForm::kBoxes, PeerForm::HeightFor(PeerForm::kBoxes)); }
+
+void TimeToggles(Peer &peer, char const *name) {
+    for (int i = 0; i < kToggles; ++i)
+        Time(name, [&] { peer.Toggle(i * kStep % PeerForm::kBoxes); });
+}
+
+void MeasureWindow(Peer &peer) {
+    long long const start = Now();
+    Build(peer);
+    Report("first-build", Now() - start);
+    peer.Show();
+    Report("first-frame", Now() - start);
+    Settle(peer);
+    for (int i = 0; i < kRepaints; ++i)
+        Time("repaint", [&] { peer.Repaint(); });
+    TimeToggles(peer, "toggle");
+    TimeClicks(peer);
+    for (int i = 0; i < kBuilds; ++i) {
+        peer.Destroy();
+        Settle(peer);
+        Time("build", [&] { Build(peer); });
+    }
+    peer.Destroy();
+}
+
+void MeasureOffscreen(Peer &peer) {
+    Build(peer);
+    peer.Show();
+    for (int i = 0; i < kRepaints; ++i)
+        Time("repaint-offscreen", [&] { peer.RepaintOffscreen(); });
+    peer.Destroy();
+}
+
+long ResidentPages() {
+    long size = 0, resident = 0;
+    std::ifstream("/proc/self/statm") >> size >> resident;
+    return resident;
+}
+
+// The window is as large for few check boxes as for many, so that its pixels do not count.
+void MeasureMemory(Peer &peer, int boxes) {
+    peer.Build(boxes, PeerForm::HeightFor(PeerForm::kManyBoxes));
+    peer.Show();
+    Settle(peer);
+    peer.Repaint();
+    Report(("resident-" + std::to_string(boxes)).c_str(),
+           static_cast<long long>(ResidentPages()) * sysconf(_SC_PAGESIZE));
+    peer.Destroy();
+}
+
+} // namespace
+
+void Peer::Heard() { heardAt = Now(); }
+
+int main(int argc, char **argv) {
+    if (argc != 3)
+        Fail("expected what to measure and a number");
+    std::string const what = argv[1];
+    int const number = std::atoi(argv[2]);
+    if (what != "memory") {
+        hasServer = clock_getcpuclockid(number, &serverClock) == 0;
+        if (!hasServer)
+            Fail("there is no such server");
+    }
+    argc = 1; // toolkits take no arguments of ours
+    argv[1] = nullptr;
+    std::unique_ptr<Peer> const peer(NewPeer(what == "offscreen", argc, argv));
+    if (what == "window")
+        MeasureWindow(*peer);
+    else if (what == "offscreen")
+        MeasureOffscreen(*peer);
+    else
+        MeasureMemory(*peer, number);
+}

@@ -1,0 +1,103 @@
+#!/usr/bin/env python3
+"""Runs the same form in several toolkits and prints medians, and how ours compares.
+
+    Peers.py [--check] --rounds N --server PID DIRECTORY
+
+The programs of the directory take turns in each round, so that all meet the same conditions. With --check the exit
+status is 1 when a goal is missed.
+"""
+import argparse
+import os
+import statistics
+import subprocess
+import sys
+from collections import namedtuple
+
+OURS = "glog"
+PEERS = ("qt", "fltk", "gtk")
+FEW_BOXES, MANY_BOXES = 400, 1600
+LONGEST_RUN_SECONDS = 120
+
+# Goals are for our value over a peer's.
+AHEAD = {"qt": 1, "fltk": 1, "gtk": 1}
+# FLTK neither measures its labels when the form is made nor follows the mouse for as long.
+AHEAD_OR_NEAR = {"qt": 1, "fltk": 3, "gtk": 1}
+
+Row = namedtuple("Row", "what name unit size goals", defaults=({},))
+ROWS = (
+    Row("full repaint", "repaint", "us", 1e3, AHEAD),
+    Row("full repaint in memory", "repaint-offscreen", "us", 1e3, AHEAD),
+    Row("toggle with its repaint", "toggle", "us", 1e3, AHEAD),
+    Row("build of the form", "build", "us", 1e3, AHEAD_OR_NEAR),
+    Row("click to listener", "click", "us", 1e3, AHEAD_OR_NEAR),
+    Row("memory of a check box", "memory", "B", 1, AHEAD_OR_NEAR),
+    Row("first build of the program", "first-build", "us", 1e3),
+    Row("first build and frame", "first-frame", "us", 1e3),
+)
+
+
+def measure(program, *arguments):
+    """What one run of the program prints: values by name, in the order of their printing."""
+    run = subprocess.run([program, *map(str, arguments)], stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True,
+                         timeout=LONGEST_RUN_SECONDS, check=False)
+    if run.returncode != 0:
+        sys.exit(f"{program} ended with status {run.returncode}\n{run.stderr}")
+    values = {}
+    for line in run.stdout.splitlines():
+        name, value = line.split()
+        values.setdefault(name, []).append(int(value))
+    return values
+
+
+def run_round(directory, peer, server, values):
+    program = os.path.join(directory, f"peer_{peer}")
+    for what in ("window", "offscreen"):
+        for name, measured in measure(program, what, server).items():
+            # The median of a run counts once, so that no run counts for more than another.
+            values.setdefault((peer, name), []).append(statistics.median(measured))
+    resident = {boxes: measure(program, "memory", boxes)[f"resident-{boxes}"][0] for boxes in (FEW_BOXES, MANY_BOXES)}
+    growth = (resident[MANY_BOXES] - resident[FEW_BOXES]) / (MANY_BOXES - FEW_BOXES)
+    values.setdefault((peer, "memory"), []).append(growth)
+
+
+def print_row(row, medians):
+    """Prints a line; how many of its goals are missed."""
+    missed = 0
+    line = f"{row.what:27}"
+    for peer in (OURS,) + PEERS:
+        line += f"{medians[peer, row.name] / row.size:8.0f} {row.unit:2}"
+    for peer in PEERS:
+        ratio = medians[OURS, row.name] / medians[peer, row.name]
+        mark = ""
+        if peer in row.goals:
+            met = ratio <= row.goals[peer]
+            mark = f" of {row.goals[peer]} " + ("PASS" if met else "over")
+            missed += not met
+        line += f"  {ratio:6.2f}{mark:10}"
+    print(line.rstrip())
+    return missed
+
+
+def main():
+    parser = argparse.ArgumentParser()
+    parser.add_argument("--check", action="store_true")
+    parser.add_argument("--rounds", type=int, required=True)
+    parser.add_argument("--server", type=int, required=True)
+    parser.add_argument("directory")
+    options = parser.parse_args()
+
+    values = {}
+    for _ in range(options.rounds):
+        for peer in (OURS,) + PEERS:
+            run_round(options.directory, peer, options.server, values)
+    medians = {key: statistics.median(measured) for key, measured in values.items()}
+
+    print(f"{'':27}" + "".join(f"{peer:>9}  " for peer in (OURS,) + PEERS) +
+          "".join(f"  {OURS + ' / ' + peer:16}" for peer in PEERS).rstrip())
+    missed = sum(print_row(row, medians) for row in ROWS)
+    print(f"{missed} goal(s) missed" if missed else "All goals met")
+    return 1 if options.check and missed else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())
