@@ -92,8 +92,8 @@ def main():
             run_round(options.directory, peer, options.server, values)
     medians = {key: statistics.median(measured) for key, measured in values.items()}
 
-    print(f"{'':27}" + "".join(f"{peer:>9}  " for peer in (OURS,) + PEERS) +
-          "".join(f"  {OURS + ' / ' + peer:16}" for peer in PEERS).rstrip())
+    print((f"{'':27}" + "".join(f"{peer:>11}" for peer in (OURS,) + PEERS) +
+           "".join(f"   {OURS + ' / ' + peer:15}" for peer in PEERS)).rstrip())
     missed = sum(print_row(row, medians) for row in ROWS)
     print(f"{missed} goal(s) missed" if missed else "All goals met")
     return 1 if options.check and missed else 0
