@@ -147,9 +147,11 @@ void ButtonGroupPane::AddButtonText(short dh, short dv, UString const &text) {
         {bounds, origin, Short(CountButtons() - 1), kCodeFont, StringMgr::Instance().Store(text), item});
 }
 
+// Asked twice for each button, so that the key is kept.
 int ButtonGroupPane::SpacingOfGlog() const {
+    static UString const key = ResourceKey(kGroupSpacingKey);
     GlogStyleSheet *const sheet = glog->GetStyleSheet();
-    return sheet ? sheet->GetSInt32ItemValue(ResourceKey(kGroupSpacingKey)) : 0;
+    return sheet ? sheet->GetSInt32ItemValue(key) : 0;
 }
 
 RCPtr<GlogLayoutRectItem> ButtonGroupPane::MakeButtonItem(int spacing, Rect const &bounds) {
