@@ -394,8 +394,40 @@ void Glog::Click(InputEvent const &event) {
         return;
     if (value == 0 && event.button == 1 && HasItem(pane))
         pane->TryMouseControl(record.where);
+    if (value < 0 && event.button == 1 && IsGrowCorner(record.where))
+        GrowByDragging(record.where);
     if (value > 0)
         ReportHit(value);
+}
+
+// A pane in the corner that has taken the press and has not followed the mouse is a grow box.
+bool Glog::IsGrowCorner(Point p) const {
+    constexpr int kCornerSide = 15;
+    return options.growable && OS::Services::ShowsGrowBoxes() && p.h >= width - kCornerSide &&
+           p.v >= height - kCornerSide && EventLoop::Instance().HeldWindow() == window.get();
+}
+
+void Glog::GrowByDragging(Point start) {
+    constexpr double kNoLimit = -1;
+    int const startWidth = width, startHeight = height;
+    Point place = start;
+    double when = 0;
+    bool timedOut = false;
+    while (!disposed && window && EventLoop::Instance().NextDragPoint(kNoLimit, place, when, timedOut))
+        GrowTo(startWidth + place.h - start.h, startHeight + place.v - start.v);
+}
+
+void Glog::GrowTo(int newWidth, int newHeight) {
+    auto const limited = [](int size, int least, int greatest) {
+        return std::clamp(size, std::max(least, 1), greatest > 0 ? std::max(greatest, least) : kMaxSide);
+    };
+    newWidth = limited(newWidth, minWidth, maxWidth);
+    newHeight = limited(newHeight, minHeight, maxHeight);
+    if (newWidth == width && newHeight == height)
+        return;
+    window->SetContentSize(newWidth, newHeight);
+    Resized(newWidth, newHeight);
+    Update();
 }
 
 bool Glog::DispatchKey(EventRecordAdapter &record, InputEvent const &event) {

@@ -97,6 +97,9 @@ private:
     void Present(std::vector<DeviceRect> const &);
     void MakeSurface();
     void ReportHit(int value);
+    bool IsGrowCorner(Point) const;
+    void GrowByDragging(Point start);
+    void GrowTo(int newWidth, int newHeight);
     bool OfferTab(char direction);
     std::vector<GlogPane *> TabOrder(char direction) const;
     void AddToTabOrder(GlogPane &, std::vector<GlogPane *> &) const;
