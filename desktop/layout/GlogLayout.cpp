@@ -1,5 +1,7 @@
 #include "host/GlogLayout.h"
 #include "desktop/layout/LayoutEngine.h"
+#include "desktop/panes/Glog.h"
+#include "desktop/panes/PaneAccess.h"
 #include "desktop/resources/Utf.h"
 #include "host/GlogPane.h"
 #include "host/GlogStyleSheet.h"
@@ -32,6 +34,21 @@ UString Key(char const *ascii) { return UString(ascii, UString::ByteEncoding(1))
 Rect MovedTo(Rect const &inner, Rect const &outer) {
     return {static_cast<short>(outer.top + inner.top), static_cast<short>(outer.left + inner.left),
             static_cast<short>(outer.top + inner.bottom), static_cast<short>(outer.left + inner.right)};
+}
+
+Rect SettledPlace(GlogLayoutItem::Rep const &item) { return item.hasPlace ? item.place : item.made; }
+
+// A pane with thousands of parts asks all of them when it looks for the one that was clicked. So whatever is
+// known here is read without a call.
+Rect PlaceOfPart(GlogLayoutItem::Rep const &part) {
+    glogRec *const glog = PaneAccess::GlogOf(*part.pane);
+    if (glog && Glog::From(glog).layoutInvalid)
+        LayoutEngine::Settle(glog);
+    CompoundPane const *const container = PaneAccess::Container(*part.pane);
+    if (!container || !container->UsesLayout())
+        return SettledPlace(part);
+    GlogLayoutItem::Rep const &pane = LayoutEngine::Rep(*PaneAccess::Rep(*part.pane).layoutItem);
+    return MovedTo(LayoutEngine::PartInPane(part, pane), SettledPlace(pane)); // it moves with its pane
 }
 
 int *FieldOf(GlogLayoutItem::Attribute attribute, GlogLayoutItem::Rep &rep) {
@@ -99,13 +116,10 @@ void GlogLayoutItem::SetAttributeFromString(Attribute attribute, UString const &
 }
 
 Rect GlogLayoutItem::GetBorderRect() {
+    if (rep->isPart && rep->pane)
+        return PlaceOfPart(*rep);
     LayoutEngine::SettleFor(*this);
-    if (rep->isPart && rep->pane && rep->pane->IsInLayout()) {
-        // A part moves with its pane's rectangle.
-        GlogLayoutItem::Rep const &pane = LayoutEngine::Rep(*rep->pane->GetLayoutRect());
-        return MovedTo(LayoutEngine::PartInPane(*rep, pane), rep->pane->GetLayoutRect()->GetBorderRect());
-    }
-    return rep->hasPlace ? rep->place : rep->made;
+    return SettledPlace(*rep);
 }
 
 char const *GlogLayoutItem::GetName() const { return rep->name.c_str(); }

@@ -17,6 +17,7 @@ public:
     } // null for no container
     static CompoundPane *Container(GlogPane &pane) { return pane.container; }
     static void SetContainerField(GlogPane &pane, CompoundPane *container) { pane.container = container; }
+    static glogRec *GlogOf(GlogPane const &pane) { return pane.glog; }
     static void SetGlogField(GlogPane &pane, glogRec *glog) { pane.glog = glog; }
 
     static bool OwnVisibility(GlogPane &pane) { return pane.rep->visible; }
