@@ -234,6 +234,8 @@ void ScrollBarPane::Set(int newPosition, int newRange) {
 }
 
 void ScrollBarPane::EnableParts(bool enable) {
+    if (!thumb)
+        return; // not set up yet
     upArrow->SetEnable(enable);
     downArrow->SetEnable(enable);
     thumb->SetEnabled(enable);
@@ -308,6 +310,8 @@ CustomEventHandler *ScrollBarPane::CanHandleCustomEvent(UIEvent *event) {
 // Gestures
 
 void ScrollBarPane::BeginScrolling(bool byPage, ScrollDirection direction) {
+    if (!client)
+        return;
     client->InhibitAutoScroll(GetGlog());
     scrollAmount = 0;
     scrollMultiplier = 0;

@@ -39,7 +39,7 @@ public:
     ~ScrollBarPane() override;
 
     // Only stores: neither the old nor the new client hears of it, and the bar stays as it is until Set. The
-    // client may be null: the bar then takes no commands. It must not be null while a live bar is pressed.
+    // client may be null: commands, and presses on a bar that is live all the same, come to nothing then.
     void SetClient(ScrollBarClient *);
     ScrollBarClient *GetClient() const { return client; }
 
@@ -109,8 +109,7 @@ private:
     void ScrollOnce(bool byUnit, int times);
     bool TellScroll(int amount, int &multiplier);
 
-    // A gesture's begin, its repeats, each of which comes to nothing before its time, and its end. The client
-    // must be there.
+    // A gesture's begin, its repeats, each of which comes to nothing before its time, and its end.
     void BeginScrolling(bool byPage, ScrollDirection);
     void ContinueScrolling(ScrollDirection);
     void EndScrolling();
