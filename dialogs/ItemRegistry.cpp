@@ -10,6 +10,7 @@ ItemRegistry::ItemRegistry() {
     AddBoxItems(*this);
     AddLabelItems(*this);
     AddGroupItems(*this);
+    AddScrolledItems(*this);
 }
 
 ItemRegistry &ItemRegistry::Instance() {

@@ -4,9 +4,10 @@
 class ItemRegistry;
 
 // Each also tells the tree dump what its panes show.
-void AddButtonItems(ItemRegistry &); // OvalButton, StudButton, FrameButton
-void AddIconItems(ItemRegistry &);   // Icon, IconButton, SuccessiveIcons, TwistDown, TrackSelector
-void AddBoxItems(ItemRegistry &);    // Box, BoxSelect
-void AddChoiceItems(ItemRegistry &); // CheckBox, RadioButton
-void AddLabelItems(ItemRegistry &);  // Label
-void AddGroupItems(ItemRegistry &);  // Group, Spacer
+void AddButtonItems(ItemRegistry &);   // OvalButton, StudButton, FrameButton
+void AddIconItems(ItemRegistry &);     // Icon, IconButton, SuccessiveIcons, TwistDown, TrackSelector
+void AddBoxItems(ItemRegistry &);      // Box, BoxSelect
+void AddChoiceItems(ItemRegistry &);   // CheckBox, RadioButton
+void AddLabelItems(ItemRegistry &);    // Label
+void AddGroupItems(ItemRegistry &);    // Group, Spacer
+void AddScrolledItems(ItemRegistry &); // ScrollPane, Grid, ScrollGrid

@@ -40,10 +40,10 @@ void CollectElements(XmlNode const &node, std::set<std::string> &names) {
     }
 }
 
-std::set<std::string> const kStockTypes = {"OvalButton",  "StudButton",    "FrameButton", "CheckBox",
-                                           "RadioButton", "Icon",          "IconButton",  "SuccessiveIcons",
-                                           "TwistDown",   "TrackSelector", "Box",         "BoxSelect",
-                                           "Label",       "Group",         "Spacer"};
+std::set<std::string> const kStockTypes = {
+    "OvalButton", "StudButton",      "FrameButton", "CheckBox",      "RadioButton", "Icon",
+    "IconButton", "SuccessiveIcons", "TwistDown",   "TrackSelector", "Box",         "BoxSelect",
+    "Label",      "Group",           "Spacer",      "ScrollPane",    "Grid",        "ScrollGrid"};
 
 std::set<std::string> KeysOfStockTypes() {
     std::set<std::string> names = {"Items"};
@@ -59,8 +59,8 @@ std::set<std::string> KeysOfStockTypes() {
 TEST(Schema, KnowsTheKeysOfTheStockTypesAndNoOthers) {
     XmlFile const schema = XmlFile::Read(kSchema);
     std::set<std::string> known;
-    for (char const *group :
-         {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels", "Groups"})
+    for (char const *group : {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels",
+                              "Groups", "Scrolled"})
         CollectElements(*Named(schema.Root(), "xs:group", group), known);
     EXPECT_EQ(known, KeysOfStockTypes());
 }

@@ -1,0 +1,70 @@
+#include "scrolling/ScrollGridPlus.h"
+#include "scrolling/ScrollPane.h"
+#include "tests/dialogs/DialogTest.h"
+
+namespace {
+
+std::string const kPlace = "<BoundsRect top=\"10\" left=\"20\" bottom=\"110\" right=\"220\"/>";
+std::string const kBox =
+    "<Item type=\"Box\"><BoundsRect top=\"300\" left=\"30\" bottom=\"340\" right=\"530\"/></Item>";
+
+class ScrolledItems : public DialogTest {};
+
+} // namespace
+
+TEST_F(ScrolledItems, AScrollPaneIsAsLargeAsItsItemsNeed) {
+    ScrollPane *const pane = LoadOne<ScrollPane>("ScrollPane", kPlace + "<Items>" + kBox + "</Items>");
+    EXPECT_EQ(BoxOf(pane), (Rect{10, 20, 110, 220}));
+    EXPECT_EQ(pane->GetMaxHScrollValue(), 330);
+    EXPECT_EQ(pane->GetMaxVScrollValue(), 240);
+}
+
+TEST_F(ScrolledItems, AScrollPaneIsAsLargeAsItSays) {
+    ScrollPane *const pane = LoadOne<ScrollPane>(
+        "ScrollPane", kPlace +
+                          "<VirtualWidth>1000</VirtualWidth><VirtualHeight>30000</VirtualHeight><Items>" +
+                          kBox + "</Items>");
+    EXPECT_EQ(pane->GetMaxHScrollValue(), 800);
+    EXPECT_EQ(pane->GetMaxVScrollValue(), 29900);
+}
+
+TEST_F(ScrolledItems, TheDumpTellsHowFarAPaneIsScrolled) {
+    glogRec *const glog = Load(Dialog(Item("ScrollPane", kPlace + "<Items>" + kBox + "</Items>")));
+    dynamic_cast<ScrollPane *>(GetGlogItem(glog, 1))->SetVScrollPos(40);
+    EXPECT_TRUE(Holds(Dump(glog), "\"scrolledH\":0,\"scrolledV\":40")) << Dump(glog);
+}
+
+TEST_F(ScrolledItems, ABarThatIsNotThereIsAnError) {
+    for (std::string const key : {"HScrollBar", "VScrollBar"})
+        EXPECT_TRUE(Holds(ComplaintAboutItem("ScrollPane", kPlace + "<" + key + ">9</" + key + ">"),
+                          "there is no scroll bar of the number 9"))
+            << key;
+    for (std::string const key : {"ScrollBar", "LateralScrollBar"})
+        EXPECT_TRUE(Holds(ComplaintAboutItem("ScrollGrid", kPlace + "<" + key + ">1</" + key + ">"),
+                          "there is no scroll bar of the number 1"))
+            << key;
+}
+
+TEST_F(ScrolledItems, NeedABox) {
+    for (std::string const type : {"ScrollPane", "Grid", "ScrollGrid"})
+        EXPECT_TRUE(Holds(ComplaintAboutItem(type, ""), "<BoundsRect> is missing")) << type;
+}
+
+TEST_F(ScrolledItems, AGridStacksItsItems) {
+    std::string const items = "<Items>" + kBox + kBox + "</Items>";
+    Grid *const column = LoadOne<Grid>("Grid", kPlace + items);
+    EXPECT_EQ(BoxOf(column->Get(1)), (Rect{40, 0, 80, 500}));
+    Grid *const row = LoadOne<Grid>("Grid", kPlace + "<Direction>horiz</Direction>" + items);
+    EXPECT_EQ(BoxOf(row->Get(1)), (Rect{0, 500, 40, 1000}));
+    EXPECT_FALSE(row->GetMayHaveDifferentSizes());
+}
+
+TEST_F(ScrolledItems, AScrollGridScrollsAlongItsDirectionAndAcross) {
+    std::string items = "<DifferentSizes>1</DifferentSizes><Items>";
+    for (int i = 0; i < 5; ++i)
+        items += kBox;
+    ScrollGridPlus *const grid = LoadOne<ScrollGridPlus>("ScrollGrid", kPlace + items + "</Items>");
+    EXPECT_TRUE(grid->GetMayHaveDifferentSizes());
+    EXPECT_EQ(grid->GetMaxScroll(), 100);
+    EXPECT_EQ(grid->GetMaxLateralScroll(), 300);
+}
