@@ -39,16 +39,20 @@ private:
 SdlCapture::SdlCapture(std::vector<SdlWindow *> const &windows_)
     : windows(windows_) {}
 
+// Asked once for each window: the server takes two questions for it, at every press.
+long SdlCapture::EventMaskOf(SDL_Window *window) {
+    long &mask = eventMasks[window];
+    if (mask == 0)
+        mask = XWindow(window).EventMask();
+    return mask;
+}
+
 void SdlCapture::IgnoreEntering() {
     for (SdlWindow *window : windows) {
-        if (eventMasks.count(window->Raw()) != 0)
+        long mask = EventMaskOf(window->Raw());
+        if (mask == 0 || !ignoring.insert(window->Raw()).second)
             continue;
-        XWindow const xWindow(window->Raw());
-        long mask = xWindow.EventMask();
-        if (mask == 0)
-            continue;
-        xWindow.Select(mask & ~EnterWindowMask);
-        eventMasks[window->Raw()] = mask;
+        XWindow(window->Raw()).Select(mask & ~EnterWindowMask);
     }
     if (!windows.empty())
         XWindow(windows.front()->Raw()).Synchronize();
@@ -64,14 +68,14 @@ void SdlCapture::Hold(bool withoutButton) {
         SDL_CaptureMouse(SDL_TRUE);
 }
 
-void SdlCapture::Forget(SdlWindow const *window) { eventMasks.erase(window->Raw()); }
+void SdlCapture::Forget(SdlWindow const *window) {
+    ignoring.erase(window->Raw());
+    eventMasks.erase(window->Raw());
+}
 
 void SdlCapture::End() {
     SDL_CaptureMouse(SDL_FALSE);
-    for (SdlWindow *window : windows) {
-        auto found = eventMasks.find(window->Raw());
-        if (found != eventMasks.end())
-            XWindow(window->Raw()).Select(found->second);
-    }
-    eventMasks.clear();
+    for (SDL_Window *window : ignoring)
+        XWindow(window).Select(eventMasks[window]);
+    ignoring.clear();
 }

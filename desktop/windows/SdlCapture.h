@@ -1,6 +1,7 @@
 // SDL's capture of the mouse, made to last.
 #pragma once
 #include <map>
+#include <set>
 #include <vector>
 
 struct SDL_Window;
@@ -23,7 +24,9 @@ public:
 
 private:
     void IgnoreEntering();
+    long EventMaskOf(SDL_Window *);
 
     std::vector<SdlWindow *> const &windows;
-    std::map<SDL_Window *, long> eventMasks; // of the windows that ignore entering, as they were before
+    std::set<SDL_Window *> ignoring;         // the windows that are told of no entering
+    std::map<SDL_Window *, long> eventMasks; // as SDL has made the windows; it leaves them at that
 };
