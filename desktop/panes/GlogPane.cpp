@@ -41,11 +41,13 @@ GlogPane *GlogPane::GlogPaneInit(glogRec *glog_, short id) {
     rep->id = id;
     if (!glog_)
         return nullptr;
+    bool const attached = glog == glog_; // a creator may begin with what its base's creator has begun
     glog = glog_;
     rep->layoutItem = LayoutEngine::MakeForPane(this);
     for (RCPtr<GlogLayoutRectItem> const &part : rep->subItems)
         LayoutEngine::Rep(*part).pane = this;
-    Glog::From(glog).AddItem(this);
+    if (!attached)
+        Glog::From(glog).AddItem(this);
     Rect box;
     if (Glog::From(glog).DescribedBox(id, box)) {
         rep->box = box;
