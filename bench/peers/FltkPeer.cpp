@@ -10,6 +10,7 @@
 #include <FL/x.H>
 #include <X11/Xlib.h>
 #include <memory>
+#include <string>
 #include <vector>
 
 namespace {
@@ -20,7 +21,11 @@ int const kMostWaits = 100;    // it returns for every event
 // In a window without a second buffer, which is the faster kind.
 class FltkPeer : public Peer {
 public:
-    FltkPeer() { Fl::set_font(FL_HELVETICA, (std::string(" ") + PeerForm::kFontFamily).c_str()); }
+    // A space before the name stands for the upright face. FLTK keeps the pointer.
+    FltkPeer()
+        : font(std::string(" ") + PeerForm::kFontFamily) {
+        Fl::set_font(FL_HELVETICA, font.c_str());
+    }
 
     void Build(int count, int height) override {
         window.reset(new Fl_Window(0, 0, PeerForm::kWidth, height, PeerForm::kTitle));
@@ -100,6 +105,7 @@ private:
         XSync(fl_display, False);
     }
 
+    std::string font;
     std::unique_ptr<Fl_Window> window;
     std::vector<Fl_Check_Button *> boxes; // the window's
     bool heard = false;
