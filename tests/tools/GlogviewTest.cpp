@@ -76,6 +76,22 @@ TEST_F(Glogview, TellsMessagesOfTheScriptOnStandardOutput) {
     EXPECT_TRUE(Holds(result.output, "\"message\":\"HandleClick\",\"result\":1}\n")) << result.output;
 }
 
+TEST_F(Glogview, TellsTheCommandsOfIconButtons) {
+    directory.Write("icons.xml", "<Glog width=\"99\" height=\"50\"><Items><Item type=\"IconButton\" id=\"4\">"
+                                 "<BoundsRect top=\"10\" left=\"10\" bottom=\"26\" right=\"30\"/>"
+                                 "<FamilyID>kTransportIcons</FamilyID><NumStates>1</NumStates>"
+                                 "<NumDownStates>1</NumDownStates><CmdClassID>15</CmdClassID>"
+                                 "<CmdID>11</CmdID><OptCmdClassID>16</OptCmdClassID><OptCmdID>12</OptCmdID>"
+                                 "</Item></Items></Glog>");
+    directory.Write("script", "click 20 18\nclick 20 18 option\n");
+    ProgramResult const result = Run("icons.xml --script script --messages -");
+    EXPECT_EQ(result.status, 0) << result.errors;
+    EXPECT_TRUE(Holds(result.output, "\"message\":\"ExecuteCommand\",\"class\":15,\"command\":11}\n"))
+        << result.output;
+    EXPECT_TRUE(Holds(result.output, "\"message\":\"ExecuteCommand\",\"class\":16,\"command\":12}\n"))
+        << result.output;
+}
+
 TEST_F(Glogview, WritesMessagesToAFile) {
     directory.Write("script", "click 40 30\n");
     EXPECT_EQ(Run("good.xml --script script --messages m.json").status, 0);
