@@ -69,6 +69,23 @@ void Unite(Rect &sum, Rect const &r) {
     sum.right = std::max(sum.right, r.right);
 }
 
+// Which parts an update concerns; without a region all of them. Most parts of a large group lie outside of
+// the region's bounds, and are not looked for in the region itself.
+class Updated {
+public:
+    explicit Updated(OSRgn *region_)
+        : region(region_)
+        , bounds(region ? CarbonUtils::GetRgnBounds(region) : Rect()) {}
+    bool operator()(Rect const &r) const {
+        return !region || (r.left < bounds.right && bounds.left < r.right && r.top < bounds.bottom &&
+                           bounds.top < r.bottom && VelaDrawing::RectInRgn(&r, region));
+    }
+
+private:
+    OSRgn *region;
+    Rect bounds;
+};
+
 // The rectangle of a text in the port's font.
 Rect TextBounds(UString const &text, Point origin, TarnQuickDrawText::FontInfo const &info) {
     return {Short(origin.v - info.ascent), origin.h, Short(origin.v + info.descent),
@@ -442,7 +459,8 @@ void ButtonGroupPane::OffsetButtons(short dh, short dv) {
 void ButtonGroupPane::DrawGuts(OSRgn *region) {
     Rect box;
     GetBox(&box);
-    if (!VelaDrawing::RectInRgn(&box, region))
+    Updated const updated(region);
+    if (!updated(box))
         return;
     SaveColors const colors;
     ClearColors();
@@ -450,8 +468,7 @@ void ButtonGroupPane::DrawGuts(OSRgn *region) {
     DrawTexts(region);
     ClearColors();
     for (int i = 0; i < CountButtons(); ++i) {
-        Rect const rect = RectOf(buttons[static_cast<std::size_t>(i)]);
-        if (VelaDrawing::RectInRgn(&rect, region))
+        if (updated(RectOf(buttons[static_cast<std::size_t>(i)])))
             RedrawButton(Short(i));
     }
 }
@@ -459,11 +476,12 @@ void ButtonGroupPane::DrawGuts(OSRgn *region) {
 // Leaves the last font in the port, where SetNthButtonName finds it.
 void ButtonGroupPane::DrawTexts(OSRgn *region) {
     bool const inLayout = IsInLayout();
+    Updated const updated(region);
     short lastFont = kNoFont;
     TarnQuickDrawText::FontInfo info = PortFontInfo();
     for (ButtonTextRec const &text : texts) {
         Rect const rect = RectOf(text);
-        if (!VelaDrawing::RectInRgn(&rect, region))
+        if (!updated(rect))
             continue;
         if (text.font != lastFont) {
             lastFont = text.font;
