@@ -1,6 +1,8 @@
 #include "buttons/GIconButtonPane.h"
+#include "desktop/layout/LayoutEngine.h"
 #include "host/CallbackAPI.h"
 #include "host/Icons.h"
+#include "host/OSRgn.h"
 #include "host/glogRec.h"
 #include "tests/PaneTest.h"
 #include "tests/VirtualPlace.h"
@@ -40,6 +42,8 @@ public:
     void DoButtonPress(int modifiers) override {
         log.push_back("press " + std::to_string(modifiers));
         presses.push_back(clock.Now());
+        if (onPress)
+            onPress();
     }
     void DrawMore(short icon) override { drawnMore.push_back(icon); }
 
@@ -47,6 +51,7 @@ public:
     std::vector<double> presses;
     std::vector<short> drawnMore;
     int releaseResult = 5;
+    std::function<void()> onPress;
 
 private:
     SimulatedDesktop &clock;
@@ -114,6 +119,88 @@ TEST_F(IconButtonPane, KeepsItsEmptyBox) {
 
 TEST_F(IconButtonPane, IsMadeWithoutAFamily) {
     EXPECT_NE(GIconButtonPane::NewGIconButtonPane(glog, 0, 0, kIcon, 2, 1, 1), nullptr);
+}
+
+TEST_F(IconButtonPane, ItsNaturalSizeIsThatOfItsIconsOrOfTheBoxThatItHas) {
+    class Boxed : public GIconButtonPane {
+    public:
+        Boxed(glogRec *owner, Rect box, short family) {
+            SetBox(&box);
+            GIconButtonPaneInit(owner, 0, family, kIcon, 2, 1, 1);
+        }
+    };
+    auto const size = [](GIconButtonPane *button) {
+        GlogLayoutItem::Rep const &rep = LayoutEngine::Rep(*button->GetLayoutRect());
+        return std::pair<int, int>(rep.width, rep.height);
+    };
+    Rect const icon = GetIconBounds(kFamily);
+    Rect const none = {0, 0, 0, 0}, box = {10, 20, 33, 61};
+    EXPECT_EQ(size(new Boxed(glog, none, kFamily)),
+              std::make_pair(icon.right - icon.left, icon.bottom - icon.top));
+    EXPECT_EQ(size(new Boxed(glog, box, kFamily)), std::make_pair(41, 23));
+    EXPECT_EQ(size(new Boxed(glog, box, 0)), std::make_pair(41, 23));
+    EXPECT_EQ(size(new Boxed(glog, none, 0)), std::make_pair(0, 0)) << "left alone";
+    EXPECT_EQ(size(new Boxed(glog, none, -3)), std::make_pair(0, 0));
+}
+
+TEST_F(IconButtonPane, TransparentPartsOfItsIconTakeClicksToo) {
+    short const shaped = 1821;
+    Rect const bounds = GetIconBounds(shaped);
+    OSRgn const shape = GetIconRegion(shaped, kIcon);
+    std::string out;
+    for (short v = 0; v < std::min<short>(bounds.bottom, 16); ++v)
+        for (short h = 0; h < std::min<short>(bounds.right, 16); ++h)
+            if (!shape.Contains(Point{v, h}))
+                out = std::to_string(h + 10) + ' ' + std::to_string(v + 20);
+    ASSERT_FALSE(out.empty());
+    NotedButton *const button = New();
+    button->SetIconSet(shaped);
+    Show();
+    EXPECT_EQ(ResultOfClick("click " + out), 5);
+}
+
+TEST_F(IconButtonPane, WhileItIsHeldDownItsStateIsTheDownState) {
+    NotedButton *const button = New({3, 2, 0});
+    Show();
+    std::vector<short> states;
+    button->onPress = [&] { states.push_back(button->GetState()); };
+    desktop.Play("press 12 22\nwait 0.15\nrelease");
+    EXPECT_EQ(states, (std::vector<short>{3, 3}));
+    EXPECT_EQ(button->GetState(), 1);
+}
+
+TEST_F(IconButtonPane, APressMayDeleteTheNeighbour) {
+    NotedButton *const button = New();
+    GIconButtonPane *const neighbour = GIconButtonPane::NewGIconButtonPane(glog, 0, kFamily, kIcon, 2, 1, 1);
+    button->onPress = [&] {
+        if (button->presses.size() == 1)
+            delete neighbour;
+    };
+    Show();
+    EXPECT_EQ(ResultOfClick("press 12 22\nwait 0.35\nrelease"), 5);
+    EXPECT_EQ(CountGlogItems(glog), 1);
+    EXPECT_EQ(button->presses.size(), 4u);
+}
+
+TEST_F(IconButtonPane, APressMayCloseTheWindow) {
+    NotedButton *const button = New();
+    int presses = 0;
+    button->onPress = [&] {
+        ++presses;
+        DisposeGlog(glog);
+    };
+    Show();
+    desktop.Play("press 12 22\nwait 0.35\nrelease");
+    EXPECT_EQ(presses, 1) << "a window that closes releases the button";
+}
+
+TEST_F(IconButtonPane, APressMayDisableTheButtonWhichCompletesItsClick) {
+    NotedButton *const button = New();
+    button->onPress = [&] { button->Disable(); };
+    Show();
+    EXPECT_EQ(ResultOfClick(kClick), 5);
+    EXPECT_FALSE(button->IsEnabled());
+    EXPECT_EQ(ResultOfClick(kClick), -1);
 }
 
 TEST_F(IconButtonPane, ShowsItsStateAndDrawsMoreOnTop) {

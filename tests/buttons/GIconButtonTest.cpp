@@ -2,6 +2,7 @@
 #include "host/CallbackAPI.h"
 #include "host/CompoundPane.h"
 #include "host/Icons.h"
+#include "host/OSRgn.h"
 #include "host/glogRec.h"
 #include "tests/PaneTest.h"
 #include <cstddef>
@@ -352,6 +353,71 @@ TEST_F(IconButton, DisabledItLetsClicksFallThrough) {
     Show();
     EXPECT_EQ(ResultOfClick(kClick), 0);
     EXPECT_TRUE(commands.log.empty());
+}
+
+TEST_F(IconButton, APressIsMetByTheShapeButFollowedInTheRectangle) {
+    short const shaped = 1821; // its icons leave parts of their rectangle transparent
+    GIconButtonResRec record = Record();
+    record.family = shaped;
+    Rect const bounds = GetIconBounds(shaped);
+    OSRgn const shape = GetIconRegion(shaped, kIcon);
+    std::string in, out;
+    for (short v = 0; v < bounds.bottom; ++v)
+        for (short h = 0; h < std::min<short>(bounds.right, 20); ++h)
+            (shape.Contains(Point{v, h}) ? in : out) = std::to_string(h + 30) + ' ' + std::to_string(v + 40);
+    ASSERT_FALSE(in.empty() || out.empty());
+    GIconButton *const button = New(record);
+    Show();
+    EXPECT_EQ(ResultOfClick("click " + out), 0);
+    EXPECT_EQ(button->GetCurState(), 0);
+    EXPECT_EQ(ResultOfClick("press " + in + "\nwait 0.2\nmove " + out + "\nwait 0.2\nrelease"), 1);
+    EXPECT_EQ(button->GetCurState(), 1);
+}
+
+TEST_F(IconButton, TheNextStateIsCountedFromThatOfThePress) {
+    Handler handler(commands.log);
+    GIconButton *const button = New();
+    button->SetClickHandler(&handler);
+    class Step : public VelaFoundationCallbackAPI {
+    public:
+        explicit Step(GIconButton *button_)
+            : former(gInstance)
+            , button(button_) {
+            gInstance = this;
+        }
+        ~Step() override { gInstance = former; }
+        void TrackingStep() override { button->SetCurState(2); }
+        void ListTrackingStep() override {}
+        bool IsCancelKey(EventRecordAdapter *, bool) override { return false; }
+        bool IsDoubleClick() override { return false; }
+        VelaFoundationCallbackAPI *former;
+        GIconButton *button;
+    } const step(button);
+    Show();
+    ResultOfClick("press 36 46\nwait 0.3\nrelease");
+    EXPECT_EQ(button->GetCurState(), 1);
+}
+
+TEST_F(IconButton, AnyValueButZeroOfAnItemIsAFlag) {
+    TestItem item;
+    item.Box("BoundsRect", {40, 30, 56, 50}).String("FamilyID", "9999").Integer("NumStates", 2);
+    item.Integer("NumDownStates", 1).Integer("CanCancel", -1).Integer("NotifyWindow", 256);
+    GIconButton::NewGIconButton(glog, item.Container());
+    Show();
+    EXPECT_EQ(ResultOfClick(kPressAndSlideOff), -1);
+    EXPECT_EQ(ResultOfClick(kClick), 1);
+}
+
+TEST_F(IconButton, ItsCommandMayDeleteTheNeighbour) {
+    GIconButton *const button = New();
+    GIconButtonResRec record = Record();
+    record.top = 100;
+    GIconButton *const neighbour = New(record);
+    commands.onCommand = [neighbour] { delete neighbour; };
+    Show();
+    EXPECT_EQ(ResultOfClick(kClick), 1);
+    EXPECT_EQ(CountGlogItems(glog), 1);
+    EXPECT_EQ(button->GetCurState(), 1);
 }
 
 TEST_F(IconButton, AHandlerMayDeleteTheButton) {

@@ -1,4 +1,6 @@
 #include "buttons/GIconPane.h"
+#include "desktop/layout/LayoutEngine.h"
+#include "host/CompoundPane.h"
 #include "host/Icons.h"
 #include "host/OSRgn.h"
 #include "host/VelaDrawing.h"
@@ -81,6 +83,28 @@ TEST_F(IconPane, ItsBoxWrapsAtSixteenBits) {
     GIconResRec record = RecordOf(kFamily);
     record.top = record.left = 32760;
     EXPECT_EQ(BoxOf(*GIconPane::NewGIconPane(glog, &record)), (Rect{32760, 32760, -32760, -32756}));
+}
+
+TEST_F(IconPane, ItsSizeIsItsNaturalSize) {
+    GlogLayoutItem::Rep const &rep = LayoutEngine::Rep(*New()->GetLayoutRect());
+    EXPECT_EQ(rep.width, 20);
+    EXPECT_EQ(rep.height, 16);
+}
+
+TEST_F(IconPane, TakesItsBoxByItsVirtualOperation) {
+    class Subclass : public GIconPane {
+    public:
+        explicit Subclass(glogRec *owner) {
+            GIconResRec record = RecordOf(kFamily);
+            InitGIconPane(owner, record);
+        }
+        void SetBox(Rect *box) override {
+            given = *box;
+            GIconPane::SetBox(box);
+        }
+        Rect given = {0, 0, 0, 0};
+    };
+    EXPECT_EQ((new Subclass(glog))->given, (Rect{40, 30, 56, 50}));
 }
 
 TEST_F(IconPane, StartsInStateZeroEnabledWithoutDecalUnderNumberZero) {
@@ -179,6 +203,45 @@ TEST_F(IconPane, AClickInTheBoxButOutsideTheShapeFallsThrough) {
     EXPECT_EQ(ResultOfClickAt(Point{static_cast<short>(place.v + 40), static_cast<short>(place.h + 30)}), 0);
 }
 
+TEST_F(IconPane, TheShapeIsThatOfTheIconShown) {
+    // An icon, and a place in its shape that the next icon has not.
+    short icon = -1;
+    Point place = {0, 0};
+    Rect const bounds = GetIconBounds(kShapedFamily);
+    for (short i = 0; i < 20 && icon < 0; ++i) {
+        OSRgn const shape = GetIconRegion(kShapedFamily, i);
+        OSRgn const next = GetIconRegion(kShapedFamily, static_cast<short>(i + 1));
+        for (short v = 0; v < bounds.bottom; ++v)
+            for (short h = 0; h < std::min<short>(bounds.right, 20); ++h)
+                if (shape.Contains(Point{v, h}) && !next.Contains(Point{v, h})) {
+                    icon = i;
+                    place = {static_cast<short>(v + 40), static_cast<short>(h + 30)};
+                }
+    }
+    ASSERT_GE(icon, 0) << "all icons have the same shape";
+    GIconPane *const pane = New(kShapedFamily);
+    pane->SetIconNum(icon);
+    Show();
+    EXPECT_EQ(ResultOfClickAt(place), 1);
+    pane->SetCurState(1);
+    EXPECT_EQ(ResultOfClickAt(place), 0);
+}
+
+TEST_F(IconPane, InALayoutTheShapeLiesWhereThePaneDoes) {
+    CompoundPane *const column = new CompoundPane;
+    column->CompoundPaneInit(glog, 0);
+    Rect box = {0, 0, 200, 300};
+    column->SetBox(&box);
+    column->GetLayout()->SetAttribute(GlogLayoutItem::kInsetTop, 100, GlogLayoutItem::kPixels, UString());
+    column->Add(New(kShapedFamily), -1);
+    column->SetUseLayout(true);
+    Show();
+    Point const inside = PlaceInShape(kShapedFamily, kIcon, true);
+    Point const outside = PlaceInShape(kShapedFamily, kIcon, false);
+    EXPECT_EQ(ResultOfClickAt(Point{static_cast<short>(inside.v + 100), inside.h}), 1);
+    EXPECT_EQ(ResultOfClickAt(Point{static_cast<short>(outside.v + 100), outside.h}), 0);
+}
+
 TEST_F(IconPane, AClickOnADisabledPaneFallsThrough) {
     GIconPane *const pane = New(kShapedFamily);
     pane->SetEnabled(0);
@@ -244,6 +307,21 @@ TEST_F(IconPane, TheVariableForTheStateClampsIt) {
     EXPECT_EQ(pane->GetCurState(), 2);
     gcStateIconSetCurState(pane, 65536);
     EXPECT_EQ(pane->GetCurState(), 2);
+}
+
+TEST_F(IconPane, WithoutStatesTheVariableForTheStateGoesBelowZero) {
+    GIconPane *const pane = New();
+    gcStateIconSetNumStates(pane, 0);
+    gcStateIconSetCurState(pane, 0);
+    EXPECT_EQ(pane->GetCurState(), -1);
+}
+
+TEST_F(IconPane, TheVariablesNarrowToSixteenBits) {
+    GIconPane *const pane = New();
+    gcIconSetIconNum(pane, 65536 + 9);
+    gcStateIconSetNumStates(pane, 65536 + 6);
+    EXPECT_EQ(gcIconGetIconNum(pane), 9);
+    EXPECT_EQ(gcStateIconGetNumStates(pane), 6);
 }
 
 TEST_F(IconPane, OnlyTheVariableForEnablingRepaints) {

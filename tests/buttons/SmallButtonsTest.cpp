@@ -2,6 +2,7 @@
 #include "buttons/NextPrevButton.h"
 #include "buttons/TrackSelectorButtonPane.h"
 #include "buttons/TwistDownButton.h"
+#include "desktop/layout/LayoutEngine.h"
 #include "host/Icons.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
@@ -137,6 +138,22 @@ TEST_F(NextPrev, AMovementWithinTheHalfRepaintsNothing) {
     EXPECT_EQ(DrawnDuring("press 12 22\nwait 0.1\nmove 13 23\nwait 0.1\nrelease"), Icons({69, 68}));
 }
 
+TEST_F(NextPrev, MayBeDeletedWhenItIsClicked) {
+    class Mayfly : public NextPrevButton {
+    public:
+        explicit Mayfly(glogRec *owner)
+            : NextPrevButton(owner) {
+            Rect box = {80, 10, 101, 26};
+            SetBox(&box);
+        }
+        void NextPrevClicked(int) override { delete this; }
+    };
+    new Mayfly(glog);
+    Show();
+    EXPECT_EQ(ResultOfClick("click 12 82"), -1);
+    EXPECT_EQ(CountGlogItems(glog), 1);
+}
+
 TEST_F(NextPrev, StaysUnattachedWithoutAGlog) {
     Chooser lonely(nullptr);
     EXPECT_EQ(lonely.GetGlog(), nullptr);
@@ -176,6 +193,24 @@ TEST_F(TwistDown, DisabledItDoesNotFlip) {
     Show();
     EXPECT_EQ(ResultOfClick("click 5 5"), 0);
     EXPECT_FALSE(button->IsOpen());
+}
+
+TEST_F(TwistDown, AReleaseThatIsNotTrackedFlipsIt) {
+    btnRelease(button);
+    EXPECT_TRUE(button->IsOpen());
+    EXPECT_EQ(button->Flash(0), 1);
+    EXPECT_FALSE(button->IsOpen());
+}
+
+TEST_F(TwistDown, AListenerMayDeleteIt) {
+    class Deleting : public GlogButtonPaneListener {
+    public:
+        void GlogButtonPressed(GlogButtonPane *source) override { delete source; }
+    } deleting;
+    deleting.DependUpon(button);
+    Show();
+    EXPECT_EQ(ResultOfClick("click 5 5"), 1);
+    EXPECT_EQ(CountGlogItems(glog), 0);
 }
 
 TEST_F(TwistDown, IsOpenWhenItsListenersAreTold) {
@@ -287,6 +322,20 @@ TEST_F(TrackSelector, HasAHelpTagForAllOfIt) {
     EXPECT_EQ(tag,
               LocalizedStrings::HelpTagMgr::Instance().DemandHelpTag("kTrackSelector", "kTrackSelector"));
     EXPECT_NE(tag, nullptr);
+}
+
+TEST_F(TrackSelector, IsFifteenBySixteenPixelsByNature) {
+    GlogLayoutItem::Rep const &rep = LayoutEngine::Rep(*button->GetLayoutRect());
+    EXPECT_EQ(rep.width, 15);
+    EXPECT_EQ(rep.height, 16);
+}
+
+TEST_F(TrackSelector, TellsOnceHoweverLongItIsHeld) {
+    Listener listener;
+    listener.DependUpon(button);
+    Show();
+    desktop.Play("press 12 22\nwait 0.55\nrelease");
+    EXPECT_EQ(listener.releases, 1);
 }
 
 TEST_F(TrackSelector, StaysUnattachedWithoutAGlog) {

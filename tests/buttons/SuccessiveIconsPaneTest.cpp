@@ -2,6 +2,7 @@
 #include "host/Icons.h"
 #include "host/OSRgn.h"
 #include "host/VelaDrawing.h"
+#include "host/glogRec.h"
 #include "tests/PaneTest.h"
 #include "tests/VirtualPlace.h"
 
@@ -57,6 +58,21 @@ TEST_F(SuccessiveIcons, TheLastIconIsCutByTheClipAlone) {
 
 TEST_F(SuccessiveIcons, AnEmptyBoxDrawsNothing) {
     EXPECT_TRUE(IconsOf(*New(20, Rect{20, 10, 36, 10})).empty());
+}
+
+TEST_F(SuccessiveIcons, TheLargestNumbersEndToo) {
+    Rect const wide = {0, 0, 16, 32767};
+    EXPECT_EQ(IconsOf(*New(32767, wide)).size(), 1u);
+    EXPECT_EQ(IconsOf(*New(32766, wide)).size(), 2u);
+}
+
+TEST_F(SuccessiveIcons, NothingOutsideOfTheUpdateIsDrawn) {
+    New(20);
+    Show();
+    SetPortToGlog(glog);
+    Rect const part = {22, 12, 30, 20};
+    VelaDrawing::InvalRect(&part);
+    EXPECT_EQ(Repainted(), (std::vector<Rect>{part}));
 }
 
 TEST_F(SuccessiveIcons, NarrowsTheClipToWhatIsUpdated) {
