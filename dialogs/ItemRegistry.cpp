@@ -10,6 +10,7 @@ ItemRegistry::ItemRegistry() {
     AddBoxItems(*this);
     AddLabelItems(*this);
     AddGroupItems(*this);
+    AddScrollItems(*this);
     AddScrolledItems(*this);
 }
 

@@ -80,8 +80,11 @@ glogRec *MakeGlog(Dialog const &dialog) {
     PaneMaker maker(growing.Get());
     for (DialogItem const &item : dialog.items)
         maker.Make(item);
-    growing.Get()->SetMinSize(dialog.minWidth, dialog.minHeight);
-    growing.Get()->SetMaxSize(dialog.maxWidth, dialog.maxHeight);
+    // A dialog that names no limits keeps those of its grow box.
+    if (dialog.minWidth || dialog.minHeight)
+        growing.Get()->SetMinSize(dialog.minWidth, dialog.minHeight);
+    if (dialog.maxWidth || dialog.maxHeight)
+        growing.Get()->SetMaxSize(dialog.maxWidth, dialog.maxHeight);
     return growing.Finish(dialog.file);
 }
 

@@ -10,4 +10,5 @@ void AddBoxItems(ItemRegistry &);      // Box, BoxSelect
 void AddChoiceItems(ItemRegistry &);   // CheckBox, RadioButton
 void AddLabelItems(ItemRegistry &);    // Label
 void AddGroupItems(ItemRegistry &);    // Group, Spacer
+void AddScrollItems(ItemRegistry &);   // ScrollBar, GrowBox
 void AddScrolledItems(ItemRegistry &); // ScrollPane, Grid, ScrollGrid

@@ -4,7 +4,7 @@
 
 // Field after field, without gaps. The XML keys stand beside the fields.
 struct growResRec {
-    static short const kKind = 3; // of a record that was made from a dialog; nothing reads it
+    static short const kKind = 3; // tells records of grow boxes from others; the box does not read it
 
     short kind;
     Rect limits;              // "LimitsRect": the window's least width and height (left, top), its greatest

@@ -4,7 +4,7 @@
 
 // Field after field, without gaps. The XML keys stand beside the fields.
 struct sbarResRec {
-    static short const kType = 2; // what the makers write; nothing reads it
+    static short const kType = 2; // tells records of bars from others; the bar does not read it
 
     short type;
     short flags; // "Flags": see ScrollBarPane
