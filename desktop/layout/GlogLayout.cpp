@@ -51,7 +51,7 @@ Rect PlaceOfPart(GlogLayoutItem::Rep const &part) {
     return MovedTo(LayoutEngine::PartInPane(part, pane), SettledPlace(pane)); // it moves with its pane
 }
 
-int *FieldOf(GlogLayoutItem::Attribute attribute, GlogLayoutItem::Rep &rep) {
+short *FieldOf(GlogLayoutItem::Attribute attribute, GlogLayoutItem::Rep &rep) {
     switch (attribute) {
     case GlogLayoutItem::kInsetTop:
         return &rep.insetTop;
@@ -95,8 +95,8 @@ GlogLayoutItem::~GlogLayoutItem() {
 }
 
 void GlogLayoutItem::SetAttribute(Attribute attribute, int value, CoordinateType, UString const &) {
-    int *field = FieldOf(attribute, *rep);
-    int bounded = std::clamp(value, -32768, 32767);
+    short *field = FieldOf(attribute, *rep);
+    short bounded = static_cast<short>(std::clamp(value, -32768, 32767));
     if (!field || *field == bounded)
         return;
     if ((attribute == kGrowWidth || attribute == kGrowHeight) && bounded < 0)
@@ -133,7 +133,8 @@ Rect GlogLayoutRectItem::GetItemRect() {
 void GlogLayoutRectItem::ReadLayoutProperties(int, GlogStyleSheet *sheet) {
     if (!sheet || !sheet->GetItemRes())
         return;
-    boost::shared_ptr<XMLLib::ContainerItem> layout = sheet->GetContainerItem(Key("Layout"));
+    static UString const layoutKey = Key("Layout"); // asked for every pane
+    boost::shared_ptr<XMLLib::ContainerItem> layout = sheet->GetContainerItem(layoutKey);
     if (!layout)
         return;
     for (LayoutKey const &known : kLayoutKeys)

@@ -150,7 +150,7 @@ LayoutEngine::Extent LayoutEngine::Measure(GlogLayoutItem &item) {
         natural.width = rep.width <= 0 ? inside.width : rep.width;
         natural.height = rep.height <= 0 ? inside.height : rep.height;
     }
-    return {std::max(natural.width, rep.minWidth), std::max(natural.height, rep.minHeight)};
+    return {std::max<int>(natural.width, rep.minWidth), std::max<int>(natural.height, rep.minHeight)};
 }
 
 void LayoutEngine::Place(GlogLayoutItem &item, Rect const &place) {
