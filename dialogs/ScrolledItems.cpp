@@ -1,5 +1,6 @@
 // Scrolled panes and grids in dialogs.
 #include "desktop/observe/TreeDump.h"
+#include "desktop/panes/PaneAccess.h"
 #include "dialogs/ItemRegistry.h"
 #include "dialogs/KeyFault.h"
 #include "dialogs/StockItems.h"
@@ -24,18 +25,31 @@ public:
         , number(static_cast<short>(sheet->GetSInt32ItemValue(ResourceKey(key)))) {}
 
     // Null when the dialog names none. Only once the whole dialog stands.
-    ScrollBarPane *Find(glogRec *glog) const {
+    ScrollBarPane *FindFor(GlogPane &scrolled) const {
         if (number == 0)
             return nullptr;
-        GlogPane *const pane = GetGlogItem(glog, number);
-        ScrollBarPane *const bar =
-            pane && pane->GetID() == number ? dynamic_cast<ScrollBarPane *>(pane) : nullptr;
+        ScrollBarPane *const bar = dynamic_cast<ScrollBarPane *>(Nearest(scrolled));
         if (!bar)
             throw KeyFault(key, "there is no scroll bar of the number " + std::to_string(number));
         return bar;
     }
 
 private:
+    // Numbers may occur again in what was loaded into the same window before, such as what is about to be
+    // exchanged for this. So whoever shares the innermost container comes first, and of these the topmost.
+    GlogPane *Nearest(GlogPane &scrolled) const {
+        GlogPane *inner = &scrolled;
+        while (CompoundPane *const around = PaneAccess::Container(*inner)) {
+            for (short i = around->NumSubpanes(); i-- > 0;) {
+                if (GlogPane *const found = around->Get(i)->FindByID(number))
+                    return found;
+            }
+            inner = around;
+        }
+        GlogPane *const found = GetGlogItem(scrolled.GetGlog(), number);
+        return found && found->GetID() == number ? found : nullptr;
+    }
+
     char const *key;
     short number;
 };
@@ -52,8 +66,8 @@ public:
 
     void GlogItemInit() override {
         ScrollPane::GlogItemInit();
-        SetHScrollBar(h.Find(GetGlog()));
-        SetVScrollBar(v.Find(GetGlog()));
+        SetHScrollBar(h.FindFor(*this));
+        SetVScrollBar(v.FindFor(*this));
         Rect const extent = Extent();
         SetVirtualWidth(width ? width : extent.right);
         SetVirtualHeight(height ? height : extent.bottom);
@@ -98,8 +112,8 @@ public:
 
     void GlogItemInit() override {
         ScrollGridPlus::GlogItemInit();
-        SetLateralScrollbar(across.Find(GetGlog()));
-        SetScrollbar(along.Find(GetGlog()));
+        SetLateralScrollbar(across.FindFor(*this));
+        SetScrollbar(along.FindFor(*this));
     }
 
 private:

@@ -1,6 +1,7 @@
 #include "scrolling/ScrollGridPlus.h"
 #include "scrolling/ScrollPane.h"
 #include "tests/dialogs/DialogTest.h"
+#include "tests/resources/TemporaryDirectory.h"
 
 namespace {
 
@@ -67,4 +68,26 @@ TEST_F(ScrolledItems, AScrollGridScrollsAlongItsDirectionAndAcross) {
     EXPECT_TRUE(grid->GetMayHaveDifferentSizes());
     EXPECT_EQ(grid->GetMaxScroll(), 100);
     EXPECT_EQ(grid->GetMaxLateralScroll(), 300);
+}
+
+TEST_F(ScrolledItems, AreScrolledByTheBarsThatCameWithThem) {
+    TemporaryDirectory directory;
+    std::string const bar = "<Item type=\"ScrollBar\" id=\"5\"/>",
+                      view = Item("ScrollPane", kPlace + "<VScrollBar>5</VScrollBar>");
+    for (std::string const &items :
+         {bar + view, view + bar, "<Item type=\"Group\"><Items>" + bar + view + "</Items></Item>"}) {
+        std::string const path = directory.Write("page.xml", Dialog(items));
+        glogRec *const glog = Load(Dialog("<Item type=\"Group\" id=\"9\"/>"));
+        CompoundPane *const place = dynamic_cast<CompoundPane *>(GetGlogItem(glog, 9));
+        LoadItems(path, place);
+        short const before = place->NumSubpanes();
+        LoadItems(path, place);
+        ScrollBarPane *const former = dynamic_cast<ScrollBarPane *>(place->FindByID(5));
+        ScrollPane *const formerView = dynamic_cast<ScrollPane *>(place->FindByID(1));
+        EXPECT_EQ(former->GetClient(), formerView);
+        for (short i = 0; i < before; ++i)
+            place->Del(0);
+        ScrollBarPane *const fresh = dynamic_cast<ScrollBarPane *>(place->FindByID(5));
+        EXPECT_EQ(fresh->GetClient(), dynamic_cast<ScrollPane *>(place->FindByID(1)));
+    }
 }
