@@ -43,7 +43,7 @@ public:
     void Scroll(ScrollBarPane *bar, int &amount, int &multiplier) override {
         Note("scroll " + std::to_string(amount) + " x " + std::to_string(multiplier));
         steps.push_back({TarnSystemTime::GetCurrentEventTime(), amount, multiplier});
-        position = std::max(0, std::min(position + amount, greatest));
+        position = static_cast<int>(std::clamp<long long>(0LL + position + amount, 0, std::max(greatest, 0)));
         multiplier += acceleration;
         if (setsBar)
             bar->Set(position, greatest);
