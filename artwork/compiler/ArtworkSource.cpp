@@ -5,6 +5,8 @@
 
 namespace {
 
+constexpr int kLargestPictureSide = 4096; // logical pixels; pictures are in no atlas
+
 // The files of a folder with this ending, in the order of their names; none when there is no such folder.
 std::vector<std::filesystem::path> FilesIn(std::filesystem::path const &folder, char const *extension) {
     std::vector<std::filesystem::path> result;
@@ -16,10 +18,10 @@ std::vector<std::filesystem::path> FilesIn(std::filesystem::path const &folder, 
     return result;
 }
 
-std::vector<IconFamily> ReadFamilies(std::filesystem::path const &folder) {
+std::vector<IconFamily> ReadFamilies(std::filesystem::path const &folder, int largestSide) {
     std::vector<IconFamily> result;
     for (std::filesystem::path const &file : FilesIn(folder, ".svg"))
-        result.emplace_back(file);
+        result.emplace_back(file, largestSide);
     std::sort(result.begin(), result.end(),
               [](IconFamily const &a, IconFamily const &b) { return a.Number() < b.Number(); });
     auto const twice =
@@ -34,8 +36,8 @@ std::vector<IconFamily> ReadFamilies(std::filesystem::path const &folder) {
 } // namespace
 
 ArtworkSource::ArtworkSource(std::filesystem::path const &folder)
-    : families(ReadFamilies(folder / "icons"))
-    , pictures(ReadFamilies(folder / "pictures")) {
+    : families(ReadFamilies(folder / "icons", AtlasFormat::kMaxIconSide))
+    , pictures(ReadFamilies(folder / "pictures", kLargestPictureSide)) {
     for (std::filesystem::path const &file : FilesIn(folder / "themes", ".xml"))
         themes.emplace_back(file);
     if (themes.empty())

@@ -1,5 +1,4 @@
 #include "artwork/compiler/IconFamily.h"
-#include "desktop/resources/AtlasFormat.h"
 #include <algorithm>
 #include <limits>
 #include <set>
@@ -55,8 +54,9 @@ std::string ReferredId(pugi::xml_attribute attribute) {
 
 } // namespace
 
-IconFamily::IconFamily(std::filesystem::path const &file)
-    : source(std::make_unique<ArtworkFile>(file, "svg")) {
+IconFamily::IconFamily(std::filesystem::path const &file, int largestSide_)
+    : largestSide(largestSide_)
+    , source(std::make_unique<ArtworkFile>(file, "svg")) {
     ReadMetadata();
     CheckElements();
     for (pugi::xml_node node : source->Root().children())
@@ -79,11 +79,11 @@ void IconFamily::ReadMetadata() {
     name = source->Text(root, "data-name");
     std::string const size = source->Text(root, "data-size");
     std::size_t const space = size.find(' ');
-    auto const validSide = [](int side) { return side >= 1 && side <= AtlasFormat::kMaxIconSide; };
+    auto const validSide = [this](int side) { return side >= 1 && side <= largestSide; };
     if (space == std::string::npos || !ParseInteger(size.substr(0, space), width) ||
         !ParseInteger(size.substr(space + 1), height) || !validSide(width) || !validSide(height))
         source->Fail(root, "data-size must be two whole numbers, width and height, from 1 to " +
-                               std::to_string(AtlasFormat::kMaxIconSide));
+                               std::to_string(largestSide));
 }
 
 void IconFamily::ReadIcon(pugi::xml_node group) {
@@ -103,9 +103,8 @@ void IconFamily::ReadIcon(pugi::xml_node group) {
         source->Fail(group, "the frame must begin at 0, 0");
     if (std::string(frame.attribute("fill").value()) != "none")
         source->Fail(group, "the frame must have fill=\"none\"");
-    icons.push_back({static_cast<std::int16_t>(index),
-                     source->Integer(frame, "width", 1, AtlasFormat::kMaxIconSide),
-                     source->Integer(frame, "height", 1, AtlasFormat::kMaxIconSide), group});
+    icons.push_back({static_cast<std::int16_t>(index), source->Integer(frame, "width", 1, largestSide),
+                     source->Integer(frame, "height", 1, largestSide), group});
 }
 
 void IconFamily::CheckElements() const {

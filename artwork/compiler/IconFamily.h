@@ -19,9 +19,9 @@ public:
     };
 
     // Throws ArtworkError for anything that would be drawn wrongly or not at all: stray elements, icons
-    // without a frame, sides outside 1 to 512, an index twice, styles of the file's own, references to
-    // nothing.
-    explicit IconFamily(std::filesystem::path const &file);
+    // without a frame, sides outside 1 to the largest, an index twice, styles of the file's own, references
+    // to nothing.
+    IconFamily(std::filesystem::path const &file, int largestSide);
 
     std::int16_t Number() const { return number; }
     std::string const &Name() const { return name; }
@@ -37,6 +37,7 @@ private:
     void ReadIcon(pugi::xml_node);
     void CheckElements() const;
 
+    int largestSide;                     // logical pixels
     std::unique_ptr<ArtworkFile> source; // on the heap, so that nodes stay valid when the family moves
     std::int16_t number = 0;
     std::string name;

@@ -10,6 +10,14 @@ std::string Icon(std::string const &id, std::string const &drawing) {
     return "<g id=\"" + id + "\">" + kFrame + drawing + "</g>";
 }
 
+// The file of a picture of that width, without a drawing in it.
+std::string Picture(int width) {
+    std::string const size = std::to_string(width);
+    return "<svg xmlns=\"http://www.w3.org/2000/svg\" data-family=\"9\" data-name=\"Wide\" data-size=\"" +
+           size + " 8\"><g id=\"i0\"><rect class=\"frame\" width=\"" + size +
+           "\" height=\"8\" fill=\"none\"/></g></svg>";
+}
+
 // Compiles a family with this content, expects a refusal, and returns the message.
 std::string MessageFor(std::string const &familyContent) {
     SampleArtwork sample;
@@ -146,6 +154,24 @@ TEST(ArtworkCompiler, RefusesAFrameThatIsTooLarge) {
     EXPECT_TRUE(
         Says(MessageFor("<g id=\"i0\"><rect class=\"frame\" width=\"513\" height=\"1\" fill=\"none\"/></g>"),
              "width=\"513\" must be a whole number from 1 to 512"));
+}
+
+TEST(ArtworkCompiler, DrawsPicturesThatAreLargerThanAnIconMayBe) {
+    SampleArtwork sample;
+    sample.WriteFamily(Icon("i0", ""));
+    sample.Write("pictures/9.svg", Picture(1200));
+    ASSERT_EQ(0, RunCompiler(sample.Folder(), {"--out", sample.Output().string()}).status);
+    EXPECT_TRUE(std::filesystem::exists(sample.Output() / "pictures/day/9@2x.png"));
+}
+
+TEST(ArtworkCompiler, RefusesAPictureThatIsTooLarge) {
+    SampleArtwork sample;
+    sample.WriteFamily(Icon("i0", ""));
+    sample.Write("pictures/9.svg", Picture(4097));
+    CompilerRun const run = RunCompiler(sample.Folder(), {"--out", sample.Output().string()});
+    EXPECT_EQ(1, run.status);
+    EXPECT_TRUE(Says(run.messages, "pictures/9.svg:1:2: <svg>: data-size must be two whole numbers"));
+    EXPECT_TRUE(Says(run.messages, "from 1 to 4096"));
 }
 
 TEST(ArtworkCompiler, RefusesAFrameWithoutArea) {

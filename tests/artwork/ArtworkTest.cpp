@@ -206,6 +206,7 @@ TEST_F(Artwork, ShowsEveryStateDifferently) {
         differ(2000, {0, 1, 2, 3, 4});
         differ(2002, {0, 1, 2, 3, 4});
         differ(2004, {0, 1, 2});
+        differ(2005, {0, 1, 2, 3, 4});
     });
 }
 
