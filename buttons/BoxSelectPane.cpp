@@ -6,6 +6,7 @@
 #include "host/EventRecordAdapter.h"
 #include "host/NamedColors.h"
 #include "host/OSPort.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/TarnError.h"
 #include "host/VelaDrawing.h"
@@ -146,7 +147,10 @@ void BoxSelectPane::SetOne(short index, bool value) {
 void BoxSelectPane::RadSet(short index) {
     if (index == radioValue)
         return;
+    PaneWatch const self(this);
     SetOne(radioValue, false);
+    if (!self.PaneExists())
+        return;
     radioValue = index;
     SetOne(index, true);
 }

@@ -39,7 +39,8 @@ public:
 
     // The box that is on, where one at a time is; at first 0.
     short RadGet() const { return radioValue; }
-    // Goes over to another box: SetOne of the old and of the new one. Without effect for the current one.
+    // Goes over to another box: SetOne of the old and of the new one. Without effect for the current one. A
+    // listener may delete the pane.
     void RadSet(short index);
 
     // Whether boxes that are on are marked at all; at first true. InitStatus only stores it, ChangeStatus

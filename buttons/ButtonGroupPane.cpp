@@ -10,6 +10,7 @@
 #include "host/NamedColors.h"
 #include "host/OSFont.h"
 #include "host/OSRgn.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/StringMgr.h"
 #include "host/TextLayout.h"
@@ -350,7 +351,8 @@ void ButtonGroupPane::SetAllEnable(bool enabled) { SetAllButtons(enabled, true, 
 void ButtonGroupPane::SetAllButtons(bool value, bool isEnable, short except) {
     // Not those that a listener adds on the way.
     int const count = CountButtons();
-    for (int i = 0; i < count; ++i)
+    PaneWatch const self(this);
+    for (int i = 0; i < count && self.PaneExists(); ++i)
         if (i != except)
             SetButton(Short(i), value, isEnable);
 }
@@ -363,10 +365,13 @@ void ButtonGroupPane::SetButton(short index, bool value, bool isEnable) {
     if (value == field)
         return;
     field = value;
+    PaneWatch const self(this);
     if (isEnable)
         Inval(); // the label changes its colour too
     else if (Provider<ButtonGroupPaneListener>::HasDependents())
         Provider<ButtonGroupPaneListener>::BroadcastChange(ButtonValueChangeMsg(this, index, value), nullptr);
+    if (!self.PaneExists())
+        return;
     if (GetVisibility()) {
         WithPerformLayoutRectUpdate const update(this);
         Prepare();
@@ -560,5 +565,6 @@ bool ButtonGroupPane::TrackButton(short index, short) {
     // Over the label the button stays pressed too.
     Rect rect;
     GetButtonBounds(index, &rect);
-    return TrackSpecialIconButton(true, &rect, &rec, IconButtonTransitionProc);
+    PaneWatch const self(this);
+    return TrackSpecialIconButton(true, &rect, &rec, IconButtonTransitionProc) && self.PaneExists();
 }

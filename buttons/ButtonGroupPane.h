@@ -118,11 +118,10 @@ protected:
     void TurnOnQuietly(short index);
     // Sets the button's enabling, or else its value. What it is already, and an index that does not exist,
     // does nothing. A new value sends ButtonValueChanged, then the redraw is asked for if the pane is
-    // visible, then ButtonGroupPaneChanged is sent for either. A listener of the first must not delete the
-    // pane.
+    // visible, then ButtonGroupPaneChanged is sent for either. A listener may delete the pane.
     void SetButton(short index, bool value, bool isEnable);
     // SetButton for all but one, in order; -1: for all. Buttons that a listener adds meanwhile stay as they
-    // are. A listener must not delete the pane.
+    // are.
     void SetAllButtons(bool value, bool isEnable, short except);
     // Invalidates the button and a margin of 3 pixels, if the pane is visible. The pane must be prepared.
     void InvalButton(short index);

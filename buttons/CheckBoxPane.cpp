@@ -2,6 +2,7 @@
 #include "buttons/ckRadItemResRec.h"
 #include "frame/ResourceReading.h"
 #include "host/GlogStyleSheet.h"
+#include "host/PaneWatch.h"
 #include "host/glogRec.h"
 #include <memory>
 #include <new>
@@ -27,8 +28,9 @@ void SetOneBox(CheckBoxPane *group, int index, bool value) {
 bool ReadOneBox(CheckBoxPane *group, int index) { return group->ReadOne(static_cast<short>(index)); }
 
 bool ToggleOneBox(CheckBoxPane *group, int index) {
+    PaneWatch const watch(group);
     group->ToggleOne(static_cast<short>(index));
-    return group->ReadOne(static_cast<short>(index));
+    return watch.PaneExists() && group->ReadOne(static_cast<short>(index));
 }
 
 } // namespace
@@ -92,9 +94,9 @@ bool CheckBoxPane::TrackButton(short index, short modifiers) {
     bool const isPlain = !turnsOn && (modifiers & kCommandKey) == 0;
     bool const value = isPlain ? !ReadOne(index) : turnsOn;
     bool const changesOthers = !isPlain && (flags & kModifiersChangeOthers) != 0;
-    // Nothing of this pane is touched after the last call: a listener may have deleted it.
+    PaneWatch const self(this);
     SetButton(index, value, false);
-    if (changesOthers)
+    if (changesOthers && self.PaneExists())
         SetAllButtons(!value, false, index);
     return true;
 }

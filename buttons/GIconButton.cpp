@@ -3,6 +3,7 @@
 #include "host/CallbackAPI.h"
 #include "host/EventRecordAdapter.h"
 #include "host/Icons.h"
+#include "host/PaneWatch.h"
 #include "host/glogRec.h"
 #include <memory>
 #include <new>
@@ -116,18 +117,21 @@ int GIconButton::HandleClick(EventRecordAdapter *event) {
     CommandSpecifier const chosen = event->modifiers & kOptionKey ? optionCommand : command;
     if (!GIconPane::HandleClick(event))
         return 0;
+    PaneWatch const self(this);
     if (clickHandler) {
         if (int const result = clickHandler->ClickStarted(this, event))
             return result;
     }
-    if (!canCancel)
+    if (self.PaneExists() && !canCancel)
         Execute(chosen);
+    if (!self.PaneExists())
+        return -1;
 
     Prepare();
-    Tracking tracking = {this, NextState()};
+    Tracking tracking = {this, &self, NextState()};
     Rect box;
     GetBox(&box);
-    if (!GenericButtonTrackingLoop(canCancel, &box, TransitionProc, &tracking))
+    if (!GenericButtonTrackingLoop(canCancel, &box, TransitionProc, &tracking) || !self.PaneExists())
         return -1;
     // Handler and command may delete the button: nothing of it is touched after each of them.
     int const result = notifyWindow ? 1 : -1;
@@ -141,6 +145,8 @@ int GIconButton::HandleClick(EventRecordAdapter *event) {
 
 void GIconButton::TransitionProc(void *data, TransitionTo to) {
     Tracking const &tracking = *static_cast<Tracking const *>(data);
+    if (!tracking.watch->PaneExists())
+        return;
     switch (to) {
     case kTransitionToPressed:
         tracking.button->PushOrPopButton(true);

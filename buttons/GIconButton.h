@@ -9,6 +9,8 @@
 #include "buttons/GIconPane.h"
 #include "host/CommandSpecifier.h"
 
+class PaneWatch;
+
 class GIconButton : public GIconPane {
 public:
     // Takes part in clicks.
@@ -58,7 +60,8 @@ private:
     // What the tracking loop hands on to TransitionProc.
     struct Tracking {
         GIconButton *button;
-        short next; // the state after a completed click
+        PaneWatch const *watch; // of the button
+        short next;             // the state after a completed click
     };
     static void TransitionProc(void *tracking, TransitionTo);
 

@@ -2,6 +2,7 @@
 #include "host/EventRecordAdapter.h"
 #include "host/Icons.h"
 #include "host/MouseTask.h"
+#include "host/PaneWatch.h"
 #include "host/VelaDrawing.h"
 
 namespace {
@@ -70,7 +71,9 @@ int NextPrevButton::HandleClick(EventRecordAdapter *event) {
     upper.bottom = middle;
     lower.top = static_cast<short>(middle + 1); // the row in the middle belongs to neither half
     MouseTracker tracker(this, upper, lower);
+    PaneWatch const self(this);
     TrackMouse(tracker, event->where);
-    NextPrevClicked(tracker.Which());
+    if (self.PaneExists())
+        NextPrevClicked(tracker.Which());
     return -1;
 }

@@ -2,6 +2,7 @@
 #include "buttons/ckRadItemResRec.h"
 #include "frame/ResourceReading.h"
 #include "host/GlogStyleSheet.h"
+#include "host/PaneWatch.h"
 #include "host/glogRec.h"
 #include <memory>
 #include <new>
@@ -83,9 +84,10 @@ void RadioButtonPane::RadioSet(short index) {
     if (index == old || index < 0 || index >= CountButtons())
         return;
     radioValue = index;
+    PaneWatch const self(this);
     SetButton(old, false, false);
     // A listener may have made another button the current one: there is never more than one on.
-    if (radioValue == index)
+    if (self.PaneExists() && radioValue == index)
         SetButton(index, true, false);
 }
 

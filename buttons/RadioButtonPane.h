@@ -26,8 +26,8 @@ public:
 
     // Makes the button the current one. Both kinds of listeners hear first of the old one going off, then of
     // the new one going on, and both are invalidated. When a listener of the former makes yet another button
-    // the current one, that one alone goes on; the group may be deleted at the last message only. The current
-    // button, and an index that does not exist, do nothing.
+    // the current one, that one alone goes on. The current button, and an index that does not exist, do
+    // nothing.
     virtual void RadioSet(short index);
     // The index of the current button; 0 also while there are no buttons.
     virtual short RadioGet();

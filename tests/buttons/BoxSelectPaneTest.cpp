@@ -560,6 +560,17 @@ TEST_F(BoxSelect, AListenerOfASwitchMayDeleteThePane) {
     EXPECT_EQ(CountGlogItems(glog), 0);
 }
 
+TEST_F(BoxSelect, AListenerMayDeleteThePaneWhenTheOldBoxIsOff) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    Listener listener;
+    listener.DependUpon(pane);
+    listener.onChange = [](BoxSelectPane *source) { delete source; };
+    Show();
+    EXPECT_EQ(ResultOfClick("click 45 25"), 2);
+    EXPECT_EQ(listener.log, (Log{"0 off"}));
+    EXPECT_EQ(CountGlogItems(glog), 0);
+}
+
 TEST_F(BoxSelect, AListenerMayDeleteThePaneWhenTheNewBoxIsOn) {
     BoxSelectPane *const pane = New(kOneAtATime);
     Listener listener;

@@ -140,6 +140,66 @@ TEST_F(GroupReentrancy, AListenerMayDeleteAnotherListener) {
     EXPECT_EQ(first.heard, (Heard{"0 on", "0 changed"}));
 }
 
+TEST_F(GroupReentrancy, AListenerMayDeleteTheGroupAtEitherMessage) {
+    for (bool atValue : {true, false}) {
+        CheckBoxPane *const group = ThreeBoxes(CheckBoxPane::kModifiersChangeOthers);
+        group->SetOne(1, true);
+        GroupListener listener;
+        listener.HangOn(group);
+        (atValue ? listener.onValue : listener.onChange) = [&] { delete group; };
+        Show();
+        EXPECT_EQ(ResultOfClick("click 25 35 command"), 2);
+        EXPECT_EQ(listener.heard, atValue ? Heard({"1 off"}) : Heard({"1 off", "1 changed"}));
+        EXPECT_EQ(CountGlogItems(glog), 0);
+    }
+}
+
+TEST_F(GroupReentrancy, AListenerMayDeleteTheGroupWhileAllAreSet) {
+    for (bool enabling : {true, false}) {
+        CheckBoxPane *const group = ThreeBoxes();
+        GroupListener listener;
+        listener.HangOn(group);
+        listener.onChange = [&] {
+            if (listener.heard.back() == "1 changed")
+                delete group;
+        };
+        if (enabling)
+            group->SetAllEnable(false);
+        else
+            group->SetAllToSame(true);
+        EXPECT_EQ(listener.heard.back(), "1 changed");
+        EXPECT_EQ(CountGlogItems(glog), 0);
+    }
+}
+
+TEST_F(GroupReentrancy, AListenerMayDeleteAGroupThatIsToggledThroughItsProcedure) {
+    CheckBoxPane *const group = ThreeBoxes();
+    GroupListener listener;
+    listener.HangOn(group);
+    listener.onValue = [&] { delete group; };
+    EXPECT_FALSE(btnToggleOne(group, 1));
+}
+
+TEST_F(GroupReentrancy, AListenerMayDeleteRadioButtonsWhenTheOldOneGoesOff) {
+    RadioButtonPane *const group = ThreeRadios();
+    GroupListener listener;
+    listener.HangOn(group);
+    listener.onValue = [&] { delete group; };
+    Show();
+    EXPECT_EQ(ResultOfClick("click 25 55"), 3);
+    EXPECT_EQ(listener.heard, (Heard{"0 off"}));
+}
+
+TEST_F(GroupReentrancy, TheGroupMayBeDeletedWhileAButtonIsTracked) {
+    for (char const *modifier : {"", " option"}) {
+        CheckBoxPane *const group = ThreeBoxes(CheckBoxPane::kModifiersChangeOthers);
+        FirstStep step([&] { delete group; });
+        Show();
+        EXPECT_EQ(ResultOfClick("press 25 35" + std::string(modifier) + "\nwait 0.3\nrelease"), -1);
+        EXPECT_EQ(CountGlogItems(glog), 0);
+    }
+}
+
 TEST_F(GroupReentrancy, AListenerMayCloseTheWindow) {
     CheckBoxPane *const group = ThreeBoxes(CheckBoxPane::kModifiersChangeOthers);
     GroupListener listener;

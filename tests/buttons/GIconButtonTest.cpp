@@ -420,6 +420,59 @@ TEST_F(IconButton, ItsCommandMayDeleteTheNeighbour) {
     EXPECT_EQ(button->GetCurState(), 1);
 }
 
+TEST_F(IconButton, AHandlerMayDeleteTheButtonWhenTheClickStarts) {
+    class Deleting : public GIconButton::ClickHandler {
+    public:
+        int ClickStarted(GIconButton *button, EventRecordAdapter *) override {
+            delete button;
+            return 0;
+        }
+        void ClickFinished(GIconButton *) override { ADD_FAILURE() << "there is no button"; }
+    } deleting;
+    New(WithoutCancel())->SetClickHandler(&deleting);
+    Show();
+    EXPECT_EQ(ResultOfClick(kClick), -1);
+    EXPECT_TRUE(commands.log.empty());
+    EXPECT_EQ(CountGlogItems(glog), 0);
+}
+
+TEST_F(IconButton, ACommandThatGoesOutAtThePressMayDeleteTheButton) {
+    GIconButton *const button = New(WithoutCancel());
+    commands.onCommand = [button] { delete button; };
+    Show();
+    EXPECT_EQ(ResultOfClick(kClick), -1);
+    EXPECT_EQ(CountGlogItems(glog), 0);
+}
+
+TEST_F(IconButton, MayBeDeletedWhileItIsTracked) {
+    for (unsigned char canCancel : {0, 1}) {
+        GIconButtonResRec record = Record();
+        record.canCancel = canCancel;
+        GIconButton *const button = New(record);
+        class Deleting : public VelaFoundationCallbackAPI {
+        public:
+            explicit Deleting(GIconButton *button_)
+                : former(gInstance)
+                , button(button_) {
+                gInstance = this;
+            }
+            ~Deleting() override { gInstance = former; }
+            void TrackingStep() override {
+                delete button;
+                button = nullptr;
+            }
+            void ListTrackingStep() override {}
+            bool IsCancelKey(EventRecordAdapter *, bool) override { return false; }
+            bool IsDoubleClick() override { return false; }
+            VelaFoundationCallbackAPI *former;
+            GIconButton *button;
+        } const deleting(button);
+        Show();
+        EXPECT_EQ(ResultOfClick("press 36 46\nwait 0.3\nmove 200 150\nmove 36 46\nrelease"), -1);
+        EXPECT_EQ(CountGlogItems(glog), 0);
+    }
+}
+
 TEST_F(IconButton, AHandlerMayDeleteTheButton) {
     Handler handler(commands.log);
     GIconButton *const button = New();

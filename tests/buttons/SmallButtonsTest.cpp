@@ -3,6 +3,7 @@
 #include "buttons/TrackSelectorButtonPane.h"
 #include "buttons/TwistDownButton.h"
 #include "desktop/layout/LayoutEngine.h"
+#include "host/CIdleChore.h"
 #include "host/Icons.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
@@ -136,6 +137,25 @@ TEST_F(NextPrev, ShowsTheHalfUnderTheMouseAsPressed) {
 TEST_F(NextPrev, AMovementWithinTheHalfRepaintsNothing) {
     Show();
     EXPECT_EQ(DrawnDuring("press 12 22\nwait 0.1\nmove 13 23\nwait 0.1\nrelease"), Icons({69, 68}));
+}
+
+TEST_F(NextPrev, MayBeDeletedWhileItIsTracked) {
+    class Deleting : public CIdleChore {
+    public:
+        explicit Deleting(Chooser *button_)
+            : CIdleChore(6, kInitialDelay)
+            , button(button_) {
+            Assign();
+        }
+        void DoIdle() override {
+            Cancel();
+            delete button;
+        }
+        Chooser *button;
+    } const deleting(button);
+    Show();
+    EXPECT_EQ(ResultOfClick("press 12 22\nwait 0.3\nmove 12 38\nrelease"), -1);
+    EXPECT_EQ(CountGlogItems(glog), 0);
 }
 
 TEST_F(NextPrev, MayBeDeletedWhenItIsClicked) {
