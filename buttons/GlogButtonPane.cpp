@@ -1,4 +1,5 @@
 #include "buttons/GlogButtonPane.h"
+#include "host/PaneWatch.h"
 #include "host/Services.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
@@ -74,14 +75,19 @@ bool GlogButtonPane::Track(short key) {
     Rect box;
     GetBox(&box);
 
+    PaneWatch const self(this);
     stillTracking = true;
     ChangeState(btnDepress);
     Yield(kShortestPress);
+    if (!self.PaneExists())
+        return false;
     Prepare();
     if (key != kNoKey)
         WaitForKeyUp(key);
     else
         FollowMouse(box);
+    if (!self.PaneExists())
+        return false;
     stillTracking = false;
 
     if (!buttonIsDown)
@@ -95,7 +101,8 @@ bool GlogButtonPane::Track(short key) {
 
 void GlogButtonPane::FollowMouse(Rect const &box) {
     Point where = {box.top, box.left};
-    while (MouseIsDragging(&where, nullptr)) {
+    PaneWatch const self(this);
+    while (MouseIsDragging(&where, nullptr) && self.PaneExists()) {
         if (buttonIsDown != VelaDrawing::PtInRect(where, &box))
             ChangeState(buttonIsDown ? btnRelease : btnDepress);
         Prepare(); // whatever ran during the wait may have left another port

@@ -45,8 +45,8 @@ public:
     // until the key is up; 0 stands for the mouse. The press shows for an eighth of a second at least, also
     // when the mouse button or key is up already. If the button is pressed at the end, it is released and
     // redrawn, then GlogButtonPanePressedMsg goes out, and the result is true. If the mouse has slid off, the
-    // result is false and nobody is told. The application runs on meanwhile, and a listener may delete the
-    // pane.
+    // result is false and nobody is told. The application runs on meanwhile. It may delete the pane, as a
+    // listener may: deleted before the release, the result is false.
     bool Track(short key);
     // What a key equivalent does: 1 after a press, -1 when the mouse slid off or the button is not enabled.
     int Flash(short key);

@@ -1,5 +1,6 @@
 #include "buttons/GlogButtonPane.h"
 #include "desktop/windows/SimulatedWindowSystem.h"
+#include "host/CIdleChore.h"
 #include "host/CompoundPane.h"
 #include "host/Services.h"
 #include "host/TarnError.h"
@@ -408,6 +409,29 @@ TEST_F(ButtonPane, AListenerMayDeleteTheButton) {
     EXPECT_EQ(ResultOfClick("click 30 20"), 1);
     EXPECT_EQ(listener.sources.size(), 1u);
     EXPECT_EQ(ResultOfClick("click 30 20"), kNoClick);
+}
+
+TEST_F(ButtonPane, MayBeDeletedWhileThePressShowsAndWhileTheMouseIsFollowed) {
+    class Deleting : public CIdleChore {
+    public:
+        Deleting(long long ticks, GlogButtonPane *button_)
+            : CIdleChore(ticks, kInitialDelay)
+            , button(button_) {
+            Assign();
+        }
+        void DoIdle() override {
+            Cancel();
+            delete button;
+        }
+        GlogButtonPane *button;
+    };
+    for (int ticks : {3, 18}) {
+        ProbeButton *const doomed = ProbeButton::New(glog); // on top of the other
+        Deleting const deleting(ticks, doomed);
+        listener.DependUpon(doomed);
+        EXPECT_EQ(ResultOfClick("press 30 20\nwait 0.5\nmove 31 21\nrelease"), -1) << ticks;
+        EXPECT_TRUE(listener.sources.empty());
+    }
 }
 
 TEST_F(ButtonPane, AListenerMayRemoveItself) {
