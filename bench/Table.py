@@ -25,6 +25,8 @@ BUILDS = "/iterations:8/manual_time"
 POINTER_TEST = 1.5
 # Of ten times as many check boxes each takes as long, but for the caches of the processor.
 LINEAR = 1.5
+# What is out of sight costs nothing but a look at where it lies.
+OUT_OF_SIGHT = 1.2
 
 RATIOS = (
     Ratio("message to nobody / pointer test", "Broadcast/ours/0", "Broadcast/bare/0", POINTER_TEST),
@@ -49,6 +51,9 @@ RATIOS = (
           None, "real_time"),
     Ratio("toggle 1 of 10,000 buttons / of 1,000", "Toggle/group/10000", "Toggle/group/1000"),
     Ratio("toggle 1 of 10,000 panes / of 1,000", "Toggle/panes/10000", "Toggle/panes/1000"),
+    Ratio("scroll step among 2,000 members / 100", "Scroll/grid/2000/manual_time", "Scroll/grid/100/manual_time",
+          OUT_OF_SIGHT),
+    Ratio("scroll step in 30,000 pixels / 600", "Scroll/pane/30000", "Scroll/pane/600", OUT_OF_SIGHT),
     Ratio("start to first frame / bare program", "Start/ours", "Start/bare", 1.15, "real_time"),
     Ratio("processor time of it / bare program", "Start/ours", "Start/bare"),
 )

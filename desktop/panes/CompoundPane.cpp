@@ -6,6 +6,7 @@
 #include "desktop/panes/PaneEvents.h"
 #include "host/VelaDrawing.h"
 #include <algorithm>
+#include <iterator>
 
 namespace {
 
@@ -15,13 +16,12 @@ Point ToContent(CompoundPane &pane, Point p) {
     return p;
 }
 
-// Calls an operation on every subpane. The list may change meanwhile: what was removed is not called, what
-// was added may be.
-template <class Operation> void ForEach(std::vector<GlogPane *> const &subpanes, Operation operation) {
-    std::vector<GlogPane *> const snapshot = subpanes;
-    for (GlogPane *pane : snapshot)
-        if (std::find(subpanes.begin(), subpanes.end(), pane) != subpanes.end())
-            operation(*pane);
+// A pane whose place depends on where it is asked must not keep a container busy for ever.
+int const kMaxRounds = 4;
+
+bool Meet(Rect const &a, Rect const &b) {
+    // Without jumps: mostly it is no, but never for the same reason.
+    return ((a.left < b.right) & (b.left < a.right) & (a.top < b.bottom) & (b.top < a.bottom)) != 0;
 }
 
 GlogPane *TopmostAt(std::vector<GlogPane *> const &subpanes, Point p) {
@@ -32,6 +32,42 @@ GlogPane *TopmostAt(std::vector<GlogPane *> const &subpanes, Point p) {
 }
 
 } // namespace
+
+void CompoundPane::CompoundRep::Insert(short index, GlogPane *pane) {
+    subpanes.insert(subpanes.begin() + index, pane);
+    ++changes;
+    ForgetReaches();
+}
+
+void CompoundPane::CompoundRep::Remove(GlogPane *pane) {
+    auto const found = std::find(subpanes.rbegin(), subpanes.rend(), pane);
+    if (found != subpanes.rend())
+        subpanes.erase(std::next(found).base());
+    ++changes;
+    ForgetReaches();
+}
+
+bool CompoundPane::CompoundRep::Has(GlogPane *pane, unsigned long changesThen) const {
+    return changes == changesThen || std::find(subpanes.begin(), subpanes.end(), pane) != subpanes.end();
+}
+
+// Asking for a place may settle the layout and so move what was asked before.
+std::vector<GlogPane *> CompoundPane::CompoundRep::Within(Rect const &area) {
+    for (int round = 0; !reachesKnown && round < kMaxRounds; ++round) {
+        reachesKnown = true;
+        reaches.assign(subpanes.size(), Rect{0, 0, 0, 0});
+        for (std::size_t i = 0; i < subpanes.size() && i < reaches.size(); ++i)
+            if (PaneAccess::OwnVisibility(*subpanes[i]))
+                reaches[i] = subpanes[i]->GetDrawRectangle();
+    }
+    if (!reachesKnown)
+        return subpanes;
+    std::vector<GlogPane *> found;
+    for (std::size_t i = 0; i < subpanes.size(); ++i)
+        if (Meet(reaches[i], area))
+            found.push_back(subpanes[i]);
+    return found;
+}
 
 CompoundPane::CompoundPane()
     : usesLayout(false)
@@ -99,9 +135,8 @@ short CompoundPane::AddGuts(GlogPane *pane, short position) {
     PaneAccess::SetContainerField(*pane, this);
     if (pane->GetGlog() != glog)
         PaneAccess::Adopt(*pane, glog);
-    auto &list = compoundRep->subpanes;
     short const index = position < 0 || position > NumSubpanes() ? NumSubpanes() : position;
-    list.insert(list.begin() + index, pane);
+    compoundRep->Insert(index, pane);
     PaneAccess::JoinLayout(*pane);
     if (glog)
         Glog::From(glog).NotePanesAdded();
@@ -122,7 +157,7 @@ void CompoundPane::DelGuts(short index, bool keep) {
         delete pane;
         return;
     }
-    compoundRep->subpanes.erase(compoundRep->subpanes.begin() + index);
+    compoundRep->Remove(pane);
     if (pane->GetLayoutRect().get())
         LayoutEngine::TakeOut(*pane->GetLayoutRect());
     PaneAccess::SetContainerField(*pane, nullptr);
@@ -148,27 +183,27 @@ bool CompoundPane::FindGophers(GopherInfo &info) {
 
 void CompoundPane::Activate() {
     GlogPane::Activate();
-    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.Activate(); });
+    compoundRep->ForEach(*this, [](GlogPane &pane) { pane.Activate(); });
 }
 
 void CompoundPane::Deactivate() {
     GlogPane::Deactivate();
-    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.Deactivate(); });
+    compoundRep->ForEach(*this, [](GlogPane &pane) { pane.Deactivate(); });
 }
 
 void CompoundPane::SetActive() {
     GlogPane::SetActive();
-    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.SetActive(); });
+    compoundRep->ForEach(*this, [](GlogPane &pane) { pane.SetActive(); });
 }
 
 void CompoundPane::ContainmentChanged() {
     GlogPane::ContainmentChanged();
-    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.ContainmentChanged(); });
+    compoundRep->ForEach(*this, [](GlogPane &pane) { pane.ContainmentChanged(); });
 }
 
 void CompoundPane::PanePositionChanged() {
     GlogPane::PanePositionChanged();
-    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.PanePositionChanged(); });
+    compoundRep->ForEach(*this, [](GlogPane &pane) { pane.PanePositionChanged(); });
 }
 
 void CompoundPane::SetVisibility(unsigned char visible) {
@@ -180,11 +215,11 @@ void CompoundPane::SetVisibility(unsigned char visible) {
 
 void CompoundPane::ContainerChangedVisibility() {
     GlogPane::ContainerChangedVisibility();
-    ForEach(compoundRep->subpanes, [](GlogPane &pane) { pane.ContainerChangedVisibility(); });
+    compoundRep->ForEach(*this, [](GlogPane &pane) { pane.ContainerChangedVisibility(); });
 }
 
 void CompoundPane::SelectSubpanes(char select) {
-    ForEach(compoundRep->subpanes, [=](GlogPane &pane) { pane.Select(select != 0); });
+    compoundRep->ForEach(*this, [=](GlogPane &pane) { pane.Select(select != 0); });
 }
 
 // Bounds and layout
@@ -197,7 +232,7 @@ char CompoundPane::Intersects(Rect *r, char mode) { return GlogPane::Intersects(
 
 void CompoundPane::AutoResize(short dh, short dv) {
     GlogPane::AutoResize(dh, dv);
-    ForEach(compoundRep->subpanes, [=](GlogPane &pane) { pane.AutoResize(dh, dv); });
+    compoundRep->ForEach(*this, [=](GlogPane &pane) { pane.AutoResize(dh, dv); });
 }
 
 RCPtr<GlogLayoutGroup> CompoundPane::GetLayout() { return compoundRep->layout; }
@@ -206,6 +241,7 @@ void CompoundPane::SetUseLayout(bool use) {
     if (use == usesLayout)
         return;
     usesLayout = use;
+    compoundRep->ForgetReaches();
     LayoutIsNowInvalid();
 }
 
@@ -255,13 +291,14 @@ void CompoundPane::DrawGuts(OSRgn *region) {
     if (compoundRep->subpanes.empty())
         return;
     Point const shift = ToContent(*this, {0, 0});
-    OSRgn content;
-    if (region) {
-        content = *region;
-        Region::Translate(content, shift.h, shift.v);
+    if (!region) {
+        compoundRep->ForEach(*this, [](GlogPane &pane) { PaneAccess::Draw(pane, nullptr); });
+        return;
     }
-    ForEach(compoundRep->subpanes,
-            [&](GlogPane &pane) { PaneAccess::Draw(pane, region ? &content : nullptr); });
+    OSRgn content(*region);
+    Region::Translate(content, shift.h, shift.v);
+    compoundRep->ForEachOf(*this, compoundRep->Within(Region::Bounds(content)),
+                           [&](GlogPane &pane) { PaneAccess::Draw(pane, &content); });
 }
 
 // Input
@@ -282,14 +319,15 @@ int CompoundPane::HandleSecondaryButtonClick(EventRecordAdapter *event) {
 
 bool CompoundPane::DispatchCustomEvent(UIEvent *event) {
     PointedEvent *pointed = dynamic_cast<PointedEvent *>(event);
+    PaneWatch const watch(this);
     std::vector<GlogPane *> const snapshot = compoundRep->subpanes;
+    unsigned long const changes = compoundRep->changes;
     for (auto i = snapshot.rbegin(); i != snapshot.rend(); ++i) {
-        if (std::find(compoundRep->subpanes.begin(), compoundRep->subpanes.end(), *i) ==
-            compoundRep->subpanes.end())
+        if (!compoundRep->Has(*i, changes))
             continue;
         if (!PaneAccess::OwnVisibility(**i) || (pointed && !pointed->LiesIn(**i)))
             continue;
-        if ((*i)->DispatchCustomEvent(event))
+        if ((*i)->DispatchCustomEvent(event) || !watch.PaneExists())
             return true;
     }
     return GlogPane::DispatchCustomEvent(event);

@@ -80,6 +80,7 @@ void GlogPane::GlogItemInit() {}
 void GlogPane::CopyPaneAttributes(GlogPane *from) {
     rep->box = from->rep->box;
     rep->visible = from->rep->visible;
+    PaneAccess::ForgetReach(*this);
     rep->id = from->rep->id;
 }
 
@@ -114,6 +115,7 @@ void GlogPane::SetBox(Rect *box) {
         LayoutEngine::Rep(*rep->layoutItem).made = *box;
     if (old.top == box->top && old.left == box->left && old.bottom == box->bottom && old.right == box->right)
         return;
+    PaneAccess::ForgetReach(*this);
     if (CanUpdateLayoutRect())
         LayoutIsNowInvalid();
     PanePositionChanged();
@@ -236,6 +238,7 @@ void GlogPane::SetVisibility(unsigned char visible) {
     if (on == rep->visible)
         return;
     rep->visible = on;
+    PaneAccess::ForgetReach(*this);
     if (!on)
         HelpTagWindow::HideAny();
     if (IsInLayout())
@@ -271,6 +274,7 @@ void GlogPane::ContainerChangedVisibility() {}
 // Drawing
 
 void GlogPane::Inval() {
+    PaneAccess::ForgetReach(*this); // a box that is calculated may have changed without a word
     // The first picture is drawn as a whole, so a glog that is being made need not look where its panes lie.
     if (!glog || !Glog::From(glog).Pixels() || !GetVisibility())
         return;

@@ -49,6 +49,11 @@ void PaneAccess::Draw(GlogPane &pane, OSRgn *region) {
     pane.DrawGuts(region);
 }
 
+void PaneAccess::ForgetReach(GlogPane &pane) {
+    if (pane.container)
+        pane.container->compoundRep->ForgetReaches();
+}
+
 void PaneAccess::MoveTo(GlogPane &pane, Rect const &box) {
     pane.Inval();
     Rect target = box;
@@ -75,16 +80,10 @@ void PaneAccess::ResizeSubpanes(GlogPane &pane, Point delta) {
     CompoundPane *const container = AsContainer(pane);
     if (!container)
         return;
-    std::vector<GlogPane *> const snapshot = container->compoundRep->subpanes;
-    for (GlogPane *inside : snapshot)
-        if (container->Find(inside) >= 0)
-            inside->Resize(delta);
+    container->compoundRep->ForEach(*container, [=](GlogPane &inside) { inside.Resize(delta); });
 }
 
-void PaneAccess::TakeOut(GlogPane &pane) {
-    auto &siblings = pane.container->compoundRep->subpanes;
-    siblings.erase(std::remove(siblings.begin(), siblings.end(), &pane), siblings.end());
-}
+void PaneAccess::TakeOut(GlogPane &pane) { pane.container->compoundRep->Remove(&pane); }
 
 void PaneAccess::Adopt(GlogPane &pane, glogRec *glog) {
     if (pane.glog && pane.glog != glog)

@@ -20,6 +20,8 @@ public:
     static glogRec *GlogOf(GlogPane const &pane) { return pane.glog; }
     static void SetGlogField(GlogPane &pane, glogRec *glog) { pane.glog = glog; }
 
+    // The pane draws elsewhere, or has been shown or hidden, or may have: its container looks anew.
+    static void ForgetReach(GlogPane &pane);
     static bool OwnVisibility(GlogPane &pane) { return pane.rep->visible; }
     static bool SizesToLayout(CompoundPane &pane) { return pane.compoundRep->sizesToLayout; }
 

@@ -2,6 +2,7 @@
 #pragma once
 #include "host/CompoundPane.h"
 #include "host/GlogPane.h"
+#include "host/PaneWatch.h"
 #include <memory>
 #include <vector>
 
@@ -23,7 +24,39 @@ struct GlogPane::Rep {
 };
 
 struct CompoundPane::CompoundRep {
+    void Insert(short index, GlogPane *);
+    // From the end: a container that goes away deletes its subpanes from there.
+    void Remove(GlogPane *);
+    // Calls an operation on every subpane, from the bottom to the top. The list may change meanwhile, and the
+    // container may go away: what was removed is not called, what was added may be.
+    template <class Operation> void ForEach(CompoundPane &container, Operation operation) const {
+        ForEachOf(container, std::vector<GlogPane *>(subpanes), operation);
+    }
+    // The same for those of some subpanes that are left.
+    template <class Operation>
+    void ForEachOf(CompoundPane &container, std::vector<GlogPane *> const &some, Operation operation) const {
+        PaneWatch const watch(&container);
+        unsigned long const before = changes;
+        for (GlogPane *pane : some) {
+            if (Has(pane, before))
+                operation(*pane);
+            if (!watch.PaneExists())
+                return;
+        }
+    }
+    // Whether a subpane of then is still one. Looking it up takes longer than most operations.
+    bool Has(GlogPane *, unsigned long changesThen) const;
+
+    // The subpanes that are shown and draw somewhere in the rectangle. Whoever scrolls through thousands asks
+    // none of those that are out of sight.
+    std::vector<GlogPane *> Within(Rect const &);
+    // A subpane has come or gone, or draws elsewhere, or has been shown or hidden, or may have.
+    void ForgetReaches() { reachesKnown = false; }
+
     std::vector<GlogPane *> subpanes; // owned, from the bottom to the top
+    unsigned long changes = 0;        // how often a subpane has come or gone
+    std::vector<Rect> reaches;        // where each subpane draws; empty for one that is hidden
+    bool reachesKnown = false;
     RCPtr<GlogLayoutGroup> layout;
     bool sizesToLayout = false;
     bool noErase = false;
