@@ -210,4 +210,118 @@ TEST_F(CompoundPaneTest, ASubpaneMayRemoveItsNeighbourWhileItIsActivated) {
     EXPECT_EQ(Count(calls, "removed: Activate"), 0);
 }
 
+TEST_F(CompoundPaneTest, ASubpaneMayDeleteTheContainerWhileItIsTold) {
+    class Deleter : public ProbePane {
+    public:
+        Deleter(glogRec *glog, Calls &calls, CompoundPane *container_)
+            : ProbePane(glog, {0, 0, 5, 5}, calls, "deleter")
+            , whole(container_) {}
+        void Activate() override { delete whole; }
+        CompoundPane *whole;
+    };
+    container->Add(new Deleter(glog, calls, container), -1);
+    container->Add(NewPane({0, 0, 5, 5}, "second"), -1);
+    container->Activate();
+    EXPECT_EQ(Count(calls, "second: gone"), 1);
+    EXPECT_EQ(Count(calls, "second: Activate"), 0);
+}
+
+// Counts how often it is asked where it draws; the box may be another one than was set.
+class AskedPane : public ProbePane {
+public:
+    using ProbePane::ProbePane;
+    Rect GetDrawRectangle() override {
+        ++asked;
+        return calculated ? elsewhere : ProbePane::GetDrawRectangle();
+    }
+    int asked = 0;
+    bool calculated = false;
+    Rect elsewhere = {50, 10, 60, 60};
+};
+
+class DrawnSubpanes : public CompoundPaneTest {
+protected:
+    DrawnSubpanes() {
+        container->Add(inSight, -1);
+        container->Add(outOfSight, -1);
+        Show();
+        calls.clear();
+    }
+    // Draws what lies at these rows of the container.
+    void Redraw(short top, short bottom) {
+        container->Prepare();
+        Rect const rows = {static_cast<short>(20 + top), 30, static_cast<short>(20 + bottom), 230};
+        VelaDrawing::InvalRect(&rows);
+        UpdateGlog(glog);
+    }
+    bool Drawn(char const *name) {
+        bool const drawn = Count(calls, std::string(name) + ": draw") > 0;
+        calls.clear();
+        return drawn;
+    }
+
+    AskedPane *inSight = new AskedPane(glog, {10, 10, 20, 60}, calls, "in sight");
+    AskedPane *outOfSight = new AskedPane(glog, {30, 10, 40, 60}, calls, "out of sight");
+};
+
+TEST_F(DrawnSubpanes, ThoseOutOfSightAreNotAskedAnything) {
+    Redraw(10, 15);
+    outOfSight->asked = 0;
+    Redraw(12, 18);
+    EXPECT_TRUE(Drawn("in sight"));
+    EXPECT_FALSE(Drawn("out of sight"));
+    EXPECT_EQ(outOfSight->asked, 0);
+}
+
+TEST_F(DrawnSubpanes, OneThatHasMovedIsDrawnInItsNewPlace) {
+    Redraw(10, 15);
+    Rect box = {12, 10, 22, 60};
+    outOfSight->SetBox(&box);
+    calls.clear();
+    Redraw(10, 15);
+    EXPECT_TRUE(Drawn("out of sight"));
+}
+
+TEST_F(DrawnSubpanes, OneThatIsHiddenIsNotDrawnUntilItIsShown) {
+    Redraw(10, 15);
+    inSight->SetVisibility(0);
+    calls.clear();
+    Redraw(10, 15);
+    EXPECT_FALSE(Drawn("in sight"));
+    inSight->SetVisibility(1);
+    Redraw(10, 15);
+    EXPECT_TRUE(Drawn("in sight"));
+}
+
+TEST_F(DrawnSubpanes, OneThatComesIsDrawn) {
+    Redraw(10, 15);
+    container->Add(NewPane({10, 70, 20, 90}, "late"), -1);
+    UpdateGlog(glog);
+    calls.clear();
+    Redraw(10, 15);
+    EXPECT_TRUE(Drawn("late"));
+}
+
+TEST_F(DrawnSubpanes, OneThatCalculatesItsPlaceIsDrawnThereOnceItInvalidatesItself) {
+    Redraw(50, 55);
+    EXPECT_FALSE(Drawn("out of sight"));
+    outOfSight->calculated = true;
+    outOfSight->Inval();
+    UpdateGlog(glog);
+    calls.clear();
+    Redraw(50, 55);
+    EXPECT_TRUE(Drawn("out of sight"));
+}
+
+TEST_F(DrawnSubpanes, InALayoutTheyAreDrawnWhereItHasThem) {
+    Redraw(10, 15);
+    container->SetUseLayout(true);
+    UpdateGlog(glog);
+    calls.clear();
+    Redraw(0, 5);
+    EXPECT_TRUE(Drawn("in sight"));
+    Redraw(12, 15);
+    EXPECT_TRUE(Drawn("out of sight"));
+}
+
 } // namespace
