@@ -4,7 +4,7 @@
 // to: the messages as the desktop reports them, without time, and what a label says afterwards.
 //
 //     page NAME                     the page's button is clicked
-//     click ITEM[.PART] [MODIFIER]  the middle of an item of the page, or of a button, box or half of it
+//     click ITEM[.PART] [MODIFIER]  the middle of an item of the page, or of a part or half of it
 //     slide ITEM[.PART]             the mouse is pressed there, moved off, and released
 //     hold ITEM[.PART]              the mouse is held there for half a second
 //     label ITEM                    nothing is done; the label's text follows
@@ -20,6 +20,7 @@
 #include "dialogs/Utf8.h"
 #include "host/CompoundPane.h"
 #include "host/glogRec.h"
+#include "scrolling/ScrollBarPane.h"
 #include "tests/screens/GalleryPages.h"
 #include "text/LabelPane.h"
 #include "tools/TextFile.h"
@@ -41,8 +42,9 @@ char const kIndent[] = "    ";  // of what a step led to
 char const kAside[] = "890 10"; // in the window, off every control
 
 // Classes of panes that nobody clicks.
-std::set<std::string> const kStill = {"GroupPane", "LabelPane", "SpacerPane", "BackdropPane",
-                                      "SuccessiveIconsPane"};
+std::set<std::string> const kStill = {"GroupPane",           "LabelPane",
+                                      "SpacerPane",          "BackdropPane",
+                                      "SuccessiveIconsPane", "(anonymous namespace)::DialogScrollPane"};
 
 // Where a step is taken: "ITEM" or "ITEM.PART".
 struct Place {
@@ -88,8 +90,14 @@ protected:
         return *pane;
     }
 
+    // The item, or a scroll bar's arrow or trough.
+    GlogPane &PaneAt(Place const &place) const {
+        ScrollBarPane *const bar = dynamic_cast<ScrollBarPane *>(&Item(place.item));
+        return bar && place.part >= 0 ? *bar->Get(static_cast<short>(place.part)) : Item(place.item);
+    }
+
     Rect RectOf(Place const &place) const {
-        GlogPane &pane = Item(place.item);
+        GlogPane &pane = PaneAt(place);
         short const part = static_cast<short>(place.part);
         Rect rect;
         if (ButtonGroupPane *group = dynamic_cast<ButtonGroupPane *>(&pane)) {
@@ -101,13 +109,13 @@ protected:
             return rect;
         }
         rect = pane.GetDrawRectangle();
-        return place.part < 0 ? rect : HalfOf(rect, place.part == 1);
+        return place.part < 0 || &pane != &Item(place.item) ? rect : HalfOf(rect, place.part == 1);
     }
 
     // The middle of the place in the window, as scripts have it.
     std::string Spot(Place const &place) const {
         Rect const rect = RectOf(place);
-        Point const origin = PaneAccess::Origin(Item(place.item));
+        Point const origin = PaneAccess::Origin(PaneAt(place));
         return std::to_string(origin.h + (rect.left + rect.right) / 2) + ' ' +
                std::to_string(origin.v + (rect.top + rect.bottom) / 2);
     }
@@ -141,6 +149,7 @@ protected:
 
     void Use(std::string const &gesture, Place const &place, std::string const &modifier) {
         unused.erase(MessageTrace::ClassName(Item(place.item)));
+        unused.erase(MessageTrace::ClassName(PaneAt(place)));
         std::string const spot = Spot(place);
         if (gesture == "click")
             desktop.Play("click " + spot + ' ' + modifier + "\nwait 1\n");

@@ -85,6 +85,10 @@ Press const kPresses[] = {
     {"small-button", "open", "click 78 26\n"},
     {"small-button", "selector-pressed", "press 110 26\n"},
     {"small-button", "selector-on", "click 110 26\n"},
+    {"scroll-bar", "rest", ""},
+    {"scroll-bar", "arrow-held", "press 24 152\n"},
+    {"scroll-bar", "thumb-dragged", "press 120 24\nmove 140 24\n"},
+    {"scroll-bar", "behind", "activate off\n"},
 };
 
 void PrintTo(Press const &press, std::ostream *out) { *out << press.Name(); }
