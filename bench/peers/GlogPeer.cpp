@@ -1,4 +1,4 @@
-// The form in our panes, each check box in a pane of its own, as the others have a widget for each.
+// The form in our panes: one group of all check boxes, or with PEER_PANE_EACH a pane for each of them.
 #include "bench/peers/Peer.h"
 #include "bench/peers/PeerForm.h"
 #include "buttons/CheckBoxPane.h"
@@ -19,6 +19,12 @@ short const kLineSpacing = 16, kInsetTop = 3; // pixels: a button in its row
 double const kWait = 0.2;                     // seconds; a press is shown for half of it
 int const kMostWaits = 25;
 
+#ifdef PEER_PANE_EACH
+bool const kPaneEach = true;
+#else
+bool const kPaneEach = false;
+#endif
+
 UString Text(std::string const &ascii) { return UString(ascii.c_str(), UString::kByteEncoding1); }
 
 std::shared_ptr<GlogStyleSheet> NewSheet() {
@@ -32,9 +38,9 @@ Rect RectAt(PeerForm::Place corner, int width, int height) {
             static_cast<short>(corner.h + width)};
 }
 
-void AddButton(ButtonGroupPane &pane, Rect const &box, PeerForm::Place place, std::string const &text) {
-    pane.AddButton(static_cast<short>(box.left + place.h), static_cast<short>(box.top + place.v + kInsetTop),
-                   Text(text));
+// `place`: in the glog.
+void AddButton(ButtonGroupPane &pane, PeerForm::Place place, std::string const &text) {
+    pane.AddButton(static_cast<short>(place.h), static_cast<short>(place.v + kInsetTop), Text(text));
 }
 
 class GlogPeer : public Peer, private ButtonGroupPaneListener {
@@ -47,20 +53,18 @@ public:
             GlogOptions().Title(PeerForm::kTitle).Size(PeerForm::kWidth, height).StyleSheet(NewSheet()));
         for (int group = 0; group < PeerForm::kGroups; ++group)
             AddGroup(PeerForm::OfGroup(group));
-        for (int box = 0; box < count; ++box) {
-            ckRadItemResRec record = {ckRadItemResRec::kCheckKind, 0};
-            CheckBoxPane *const pane = CheckBoxPane::NewCheckBoxPane(glog, &record);
-            Rect cell = RectAt(PeerForm::OfBox(box), PeerForm::kColumnWidth, PeerForm::kRowHeight);
-            pane->SetBox(&cell); // before it has buttons, which would move along
-            AddButton(*pane, cell, {0, 0}, PeerForm::TextOfBox(box));
-            DependUpon(pane);
-            boxes.push_back(pane);
-        }
+        if (kPaneEach)
+            for (int box = 0; box < count; ++box)
+                AddCheckBoxes(box, 1,
+                              RectAt(PeerForm::OfBox(box), PeerForm::kColumnWidth, PeerForm::kRowHeight));
+        else
+            AddCheckBoxes(0, count,
+                          RectAt(PeerForm::OfBox(0), PeerForm::kWidth, height - PeerForm::kGroupHeight));
         Rect place = RectAt({0, 0}, PeerForm::kWidth, height);
         PositionGlog(glog, &place, false);
     }
     void Destroy() override {
-        boxes.clear();
+        panes.clear();
         DisposeGlog(glog);
     }
     void Show() override {
@@ -75,7 +79,10 @@ public:
         UpdateGlog(glog); // returns when the server has the pixels
     }
     void Toggle(int box) override {
-        boxes[static_cast<std::size_t>(box)]->ToggleOne(0);
+        if (kPaneEach)
+            panes[static_cast<std::size_t>(box)]->ToggleOne(0);
+        else
+            panes.front()->ToggleOne(static_cast<short>(box));
         UpdateGlog(glog);
     }
     void RepaintOffscreen() override { Repaint(); }
@@ -88,13 +95,24 @@ public:
     }
 
 private:
+    void AddCheckBoxes(int first, int count, Rect bounds) {
+        ckRadItemResRec record = {ckRadItemResRec::kCheckKind, 0};
+        CheckBoxPane *const pane = CheckBoxPane::NewCheckBoxPane(glog, &record);
+        pane->SetBox(&bounds); // before it has buttons, which would move along
+        for (int box = first; box < first + count; ++box)
+            AddButton(*pane, PeerForm::OfBox(box), PeerForm::TextOfBox(box));
+        DependUpon(pane);
+        panes.push_back(pane);
+    }
     void AddGroup(PeerForm::Place corner) {
         ckRadItemResRec record = {ckRadItemResRec::kRadioKind, 0};
         RadioButtonPane *const pane = RadioButtonPane::NewRadioButtonPane(glog, &record);
         Rect box = RectAt(corner, PeerForm::kGroupWidth, PeerForm::kGroupHeight);
         pane->SetBox(&box);
-        for (int radio = 0; radio < PeerForm::kRadiosPerGroup; ++radio)
-            AddButton(*pane, box, PeerForm::OfRadio(radio), PeerForm::TextOfRadio(radio));
+        for (int radio = 0; radio < PeerForm::kRadiosPerGroup; ++radio) {
+            PeerForm::Place const place = PeerForm::OfRadio(radio);
+            AddButton(*pane, {corner.h + place.h, corner.v + place.v}, PeerForm::TextOfRadio(radio));
+        }
     }
     void ButtonValueChanged(ButtonGroupPane *, short, bool) override {
         Heard();
@@ -103,7 +121,7 @@ private:
 
     std::unique_ptr<Desktop> desktop;
     glogRec *glog = nullptr;
-    std::vector<CheckBoxPane *> boxes; // the glog's
+    std::vector<CheckBoxPane *> panes; // of check boxes; the glog's
     bool heard = false;
 };
 

@@ -3,12 +3,14 @@
 //     peer_NAME window SERVER     in a window of the X server with that process number
 //     peer_NAME offscreen SERVER  in memory
 //     peer_NAME memory BOXES      the resident memory with so many check boxes
+//     peer_NAME list SERVER       steps through a list
 //
 // Times are nanoseconds of the processor, of the program and the server together: so neither what else runs
 // on the machine counts, nor a wait for the next frame or for a press that is shown for a while, and work
 // that is left to the server does.
 #include "bench/peers/Peer.h"
 #include "bench/peers/PeerForm.h"
+#include "bench/peers/PeerList.h"
 #include <X11/Xlib.h>
 #include <X11/extensions/XTest.h>
 #include <cstdio>
@@ -23,8 +25,9 @@
 namespace {
 
 int const kBuilds = 5, kRepaints = 15, kToggles = 40, kClicks = 8;
-int const kStep = 37;                // from box to box; has no factor in common with their number
-int const kPressH = 6, kPressV = 11; // within a check box: on its mark in each of the toolkits
+int const kScrollSteps = 200, kScrollStep = 10; // pixels
+int const kStep = 37;                           // from box to box; has no factor in common with their number
+int const kPressH = 6, kPressV = 11;            // within a check box: on its mark in each of the toolkits
 int const kPrimaryButton = 1;
 int const kSettlingMicroseconds = 20000;
 long const kPerSecond = 1000000000;
@@ -154,6 +157,17 @@ void MeasureMemory(Peer &peer, int boxes) {
     peer.Destroy();
 }
 
+// Every step shows rows that have not been seen.
+void MeasureList(PeerList &list) {
+    list.Show();
+    for (int i = 0; i < 5; ++i) {
+        usleep(kSettlingMicroseconds);
+        list.Settle();
+    }
+    for (int i = 1; i <= kScrollSteps; ++i)
+        Time("scroll-step", [&] { list.ScrollTo(i * kScrollStep); });
+}
+
 } // namespace
 
 void Peer::Heard() { heardAt = Now(); }
@@ -170,6 +184,10 @@ int main(int argc, char **argv) {
     }
     argc = 1; // toolkits take no arguments of ours
     argv[1] = nullptr;
+    if (what == "list") {
+        MeasureList(*std::unique_ptr<PeerList>(NewPeerList(argc, argv)));
+        return EXIT_SUCCESS;
+    }
     std::unique_ptr<Peer> const peer(NewPeer(what == "offscreen", argc, argv));
     if (what == "window")
         MeasureWindow(*peer);
