@@ -869,6 +869,7 @@ TEST_F(BoxSelect, TakenOutOfALayoutItsBoxesStayCountedFromTheirCorner) {
     BoxSelectPane *const pane = New();
     group->Add(pane, -1);
     group->DelGuts(0, true);
+    std::unique_ptr<BoxSelectPane> const kept(pane);
     pane->SetContainer(nullptr);
     EXPECT_EQ(BoundsOf(*pane, 0), Moved(kFirst, -10, -20));
     EXPECT_EQ(BoundsOf(*pane, 2), Moved(kOverlapping, -10, -20));
