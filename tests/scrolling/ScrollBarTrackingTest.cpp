@@ -91,6 +91,14 @@ TEST_F(ScrollBarTracking, ADelayBelowZeroRepeatsAtEveryWakeUp) {
     EXPECT_EQ(TimesOf(kDown + "wait 0.25\nrelease"), (Times{0, 0, 0.1, 0.2}));
 }
 
+// The wait until the next step begins when the client is done.
+TEST_F(ScrollBarTracking, TheTimeThatAClientTakesIsNoneOfTheDelay) {
+    client.arrowDelay = 12;
+    client.onScroll = [this] { desktop.ProcessEvents(0.25); };
+    EXPECT_EQ(TimesOf(kDown + "wait 2\nrelease"),
+              (Times{0, 0.85, 1.3, 1.75})); // 36 ticks after 0.25, then 12 after each end
+}
+
 TEST_F(ScrollBarTracking, AVeryLongDelayNeverRepeats) {
     client.arrowDelay = std::numeric_limits<int>::max();
     EXPECT_EQ(TimesOf(kDown + "wait 5\nrelease"), (Times{0}));
