@@ -30,7 +30,8 @@ function(glog_program name)
   target_link_libraries(${name} PRIVATE glog_flags)
 endfunction()
 
-# glog_add_test(NAME FOLDER LIBS...): one GoogleTest program from all sources of tests/FOLDER, its tests known to ctest.
+# glog_add_test(NAME FOLDER LIBS...): one GoogleTest program from all sources of tests/FOLDER. Its tests are known to
+# ctest, each a process of its own; with GLOG_TEST_SHARDS it runs in so many processes instead.
 function(glog_add_test name folder)
   file(GLOB sources CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/tests/${folder}/*.cpp)
   if(NOT sources)
@@ -42,5 +43,14 @@ function(glog_add_test name folder)
   target_precompile_headers(${name} PRIVATE <gtest/gtest.h>)
   target_compile_definitions(${name} PRIVATE GLOG_TEST_SOURCE_DIR="${CMAKE_SOURCE_DIR}/tests"
                              GLOG_TEST_OUTPUT_DIR="${CMAKE_BINARY_DIR}/test-output")
-  gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 120)
+  if(NOT GLOG_TEST_SHARDS)
+    gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 120)
+    return()
+  endif()
+  math(EXPR last "${GLOG_TEST_SHARDS} - 1")
+  foreach(shard RANGE ${last})
+    add_test(NAME ${name}.${shard} COMMAND ${name})
+    set_tests_properties(${name}.${shard} PROPERTIES TIMEOUT 600 ENVIRONMENT
+                         "GTEST_TOTAL_SHARDS=${GLOG_TEST_SHARDS};GTEST_SHARD_INDEX=${shard}")
+  endforeach()
 endfunction()
