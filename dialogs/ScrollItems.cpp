@@ -68,6 +68,16 @@ void RequirePosition(int position, int range) {
                                        std::to_string(range));
 }
 
+// In a group a bar is as long as its box says; its parts alone would not tell, since they follow its length.
+void GiveNaturalLength(ScrollBarPane *bar) {
+    Rect const box = bar->GetBounds();
+    int const length = bar->IsHorizontal() ? box.right - box.left : box.bottom - box.top;
+    if (length > 0)
+        bar->GetLayoutRect()->SetAttribute(bar->IsHorizontal() ? GlogLayoutItem::kWidth
+                                                               : GlogLayoutItem::kHeight,
+                                           length, GlogLayoutItem::kPixels, UString());
+}
+
 GlogPane *MakeScrollBar(glogRec *glog, GlogStyleSheet *sheet) {
     auto const number = [sheet](char const *key) { return sheet->GetSInt32ItemValue(ResourceKey(key)); };
     int const range = number("Range"), position = number("Position");
@@ -75,6 +85,7 @@ GlogPane *MakeScrollBar(glogRec *glog, GlogStyleSheet *sheet) {
     ScrollBarPane *const bar = ScrollBarPane::NewScrollBarPane(glog, sheet);
     if (!bar)
         return nullptr;
+    GiveNaturalLength(bar);
     if (number("ActiveInBackground") != 0)
         bar->SetActiveInBackground();
     if (range > 0) {

@@ -176,6 +176,19 @@ TEST_F(ScrollItems, ABarInALayoutFillsIt) {
     EXPECT_EQ(BoxOf(GetGlogItem(glog, 1)), (Rect{0, 0, 100, 16}));
 }
 
+TEST_F(ScrollItems, ABarInALayoutKeepsTheLengthOfItsBox) {
+    glogRec *const glog = Load(
+        Dialog("<Item type=\"Group\"><BoundsRect top=\"0\" left=\"0\" bottom=\"200\" right=\"300\"/><Items>"
+               "<Item type=\"ScrollBar\" id=\"1\">" +
+               kUpright +
+               "</Item><Item type=\"ScrollBar\" id=\"2\"><Flags>1</Flags>"
+               "<BoundsRect top=\"0\" left=\"0\" bottom=\"16\" right=\"120\"/></Item></Items></Item>"));
+    ShowGlog(glog, kShowGlog);
+    desktop.Play("resize 330 210\nresize 320 200");
+    EXPECT_EQ(BoxOf(GetGlogItem(glog, 1)), (Rect{0, 0, 130, 16}));
+    EXPECT_EQ(BoxOf(GetGlogItem(glog, 2)), (Rect{130, 0, 146, 120}));
+}
+
 TEST_F(ScrollItems, ARecordMakesABar) {
     glogRec *const glog = FromNumbers({2, 1, 10, 20, 26, 120, 0, 0});
     ScrollBarPane *const made = dynamic_cast<ScrollBarPane *>(GetGlogItem(glog, 1));
