@@ -5,7 +5,8 @@
 // Becomes null when the pane is deleted. `P` is a class of panes.
 template <class P> class PanePtr {
 public:
-    PanePtr() {}
+    PanePtr() {} // null
+    // Points to another pane from now on, or, with null, to none.
     PanePtr &operator=(P *newPane) {
         pane = newPane;
         watch.Watch(newPane);
@@ -14,9 +15,9 @@ public:
     PanePtr(PanePtr const &) = delete;
     PanePtr &operator=(PanePtr const &) = delete;
 
-    P *Get() const { return watch.PaneExists() ? pane : nullptr; }
-    P *operator->() const { return Get(); }
-    explicit operator bool() const { return Get() != nullptr; }
+    P *Get() const { return watch.PaneExists() ? pane : nullptr; } // the pane, while it exists
+    P *operator->() const { return Get(); }                        // must not be null
+    explicit operator bool() const { return Get() != nullptr; }    // whether there is a pane
 
 private:
     P *pane = nullptr;

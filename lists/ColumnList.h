@@ -29,23 +29,24 @@ public:
     ColumnList(short count, Data const *);
     virtual ~ColumnList();
 
-    int GetNumColumns() const;
-    int GetLeftEdge(int column) const;
-    int GetRightEdge(int column) const;
-    int GetWidth(int column) const;
+    int GetNumColumns() const;          // how many there are
+    int GetLeftEdge(int column) const;  // of one column
+    int GetRightEdge(int column) const; // of one column
+    int GetWidth(int column) const;     // the right edge less the left one
+    // Write both edges of a column.
     void GetBothEdges(int column, int &left, int &right) const;
-    void GetBothEdges(int column, short &left, short &right) const;
+    void GetBothEdges(int column, short &left, short &right) const; // the same
     // The smallest left and the largest right edge of all columns; without columns the greatest and the least
     // integer.
     int GetColumnListLeftEdge() const;
     int GetColumnListRightEdge() const;
 
-    UString const &GetName(int column) const;
-    void SetName(int column, UString const &);
-    TextSettings::Alignment GetAlignment(int column);
-    void SetAlignment(int column, TextSettings::Alignment);
-    int GetColumnMargin(int column) const;
-    void SetColumnMargin(int column, int pixels);
+    UString const &GetName(int column) const;               // the title
+    void SetName(int column, UString const &);              // leaves the edges alone
+    TextSettings::Alignment GetAlignment(int column);       // of the texts
+    void SetAlignment(int column, TextSettings::Alignment); // only stores
+    int GetColumnMargin(int column) const;                  // pixels at either side of a text
+    void SetColumnMargin(int column, int pixels);           // only stores
     // The tag stays the caller's; null is none.
     LocalizedStrings::HelpTag const *GetHelpTag(int column) const;
     void SetHelpTag(int column, LocalizedStrings::HelpTag const *);

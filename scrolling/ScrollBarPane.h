@@ -15,7 +15,7 @@ class ScrollBarClient;
 // Sends ScrollBarPane_Listener::ScrollBarPaneDying from its destructor.
 class ScrollBarPane : public CompoundPane, public Provider<ScrollBarPane_Listener> {
 public:
-    enum Orientation { kHorizontal = 0, kVertical = 1 };
+    enum Orientation { kHorizontal = 0, kVertical = 1 };       // of the way that the thumb moves
     enum ScrollDirection { kTowardStart = 0, kTowardEnd = 1 }; // up or left, down or right
 
     // Flags; other bits mean nothing.

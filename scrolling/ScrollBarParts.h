@@ -23,10 +23,12 @@ private:
 // The trough with the thumb. A press on the thumb drags it, one beside it scrolls by pages.
 class ScrollBarPane::ThumbPane : public GlogPane {
 public:
+    // Not enabled at first.
     ThumbPane(glogRec *, Orientation, ScrollBarPane *owner);
 
     // Only stores.
     void SetEnabled(bool enable) { enabled = enable; }
+    // The axis that the thumb moves along.
     SingleAxis Along() const { return SingleAxis(orientation == kVertical); }
     // Where the thumb lies: 16 pixels across, and from 16 pixels to the whole trough along the bar.
     Rect GetThumbRect() const;

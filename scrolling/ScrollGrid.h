@@ -83,6 +83,7 @@ public:
     void Scroll(ScrollBarPane *, int &amount, int &multiplier) override;
 
 protected:
+    // The axis that the members follow each other along.
     SingleAxis Along() const { return SingleAxis(IsVerticalGrid()); }
     // Of the grid itself and of all members together; pixels.
     int BoxLength(SingleAxis);
@@ -122,6 +123,7 @@ private:
     bool before;
 };
 
+// The same for the other flag.
 class WithScrollGridSuppressSBarUpdate {
 public:
     WithScrollGridSuppressSBarUpdate(ScrollGrid *, bool suppress);

@@ -6,7 +6,7 @@
 struct growResRec {
     static short const kKind = 3; // tells records of grow boxes from others; the box does not read it
 
-    short kind;
+    short kind;               // kKind
     Rect limits;              // "LimitsRect": the window's least width and height (left, top), its greatest
                               // (right, bottom)
     unsigned char borderLeft; // "BorderLeft": not 0 for a line down the left side

@@ -6,7 +6,7 @@
 struct sbarResRec {
     static short const kType = 2; // tells records of bars from others; the bar does not read it
 
-    short type;
+    short type;  // kType
     short flags; // "Flags": see ScrollBarPane
     Rect bounds; // "BoundsRect"
     short edgeH; // "EdgeH": pixels from the bar's right side to the glog's, with kRightFollowsGlog
