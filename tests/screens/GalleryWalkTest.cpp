@@ -7,7 +7,10 @@
 //     click ITEM[.PART] [MODIFIER]  the middle of an item of the page, or of a part or half of it
 //     slide ITEM[.PART]             the mouse is pressed there, moved off, and released
 //     hold ITEM[.PART]              the mouse is held there for half a second
+//     drag ITEM[.PART] H V          the mouse is pressed there, moved that far right and down, and released
+//     wheel ITEM[.PART] H V         the wheel is turned there
 //     label ITEM                    nothing is done; the label's text follows
+//     bar ITEM                      the same with where a scroll bar stands
 //
 // After every step a full redraw must change nothing.
 #include "buttons/BoxSelectPane.h"
@@ -20,11 +23,13 @@
 #include "dialogs/Utf8.h"
 #include "host/CompoundPane.h"
 #include "host/glogRec.h"
+#include "scrolling/ScrollBarClient.h"
 #include "scrolling/ScrollBarPane.h"
 #include "tests/screens/GalleryPages.h"
 #include "text/LabelPane.h"
 #include "tools/TextFile.h"
 #include "tools/gallery/Gallery.h"
+#include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <gtest/gtest.h>
@@ -41,10 +46,22 @@ int const kFirstPage = 9100;    // the button of the first page
 char const kIndent[] = "    ";  // of what a step led to
 char const kAside[] = "890 10"; // in the window, off every control
 
-// Classes of panes that nobody clicks.
-std::set<std::string> const kStill = {"GroupPane",           "LabelPane",
-                                      "SpacerPane",          "BackdropPane",
-                                      "SuccessiveIconsPane", "(anonymous namespace)::DialogScrollPane"};
+int const kTrough = 1, kThumb = 3; // parts of a scroll bar; 0 and 2 are its arrows
+double const kLeastThumb = 16;     // pixels
+
+// Classes of panes that nobody clicks, or that are clicked as the list that they are parts of.
+std::set<std::string> const kStill = {"GroupPane",
+                                      "LabelPane",
+                                      "SpacerPane",
+                                      "BackdropPane",
+                                      "WellPane",
+                                      "SuccessiveIconsPane",
+                                      "(anonymous namespace)::DialogScrollPane",
+                                      "(anonymous namespace)::RowNumberPane",
+                                      "TrackListPane::Table",
+                                      "TrackListPane::Rows",
+                                      "TrackListPane::Numbers",
+                                      "TrackRowPane"};
 
 // Where a step is taken: "ITEM" or "ITEM.PART".
 struct Place {
@@ -90,10 +107,22 @@ protected:
         return *pane;
     }
 
-    // The item, or a scroll bar's arrow or trough.
+    // The item, or a scroll bar's arrow or trough, in which its thumb lies.
     GlogPane &PaneAt(Place const &place) const {
         ScrollBarPane *const bar = dynamic_cast<ScrollBarPane *>(&Item(place.item));
-        return bar && place.part >= 0 ? *bar->Get(static_cast<short>(place.part)) : Item(place.item);
+        int const part = place.part == kThumb ? kTrough : place.part;
+        return bar && part >= 0 ? *bar->Get(static_cast<short>(part)) : Item(place.item);
+    }
+
+    // Of the bar's thumb as its client has it, in the trough.
+    static Rect ThumbIn(Rect trough, ScrollBarPane &bar) {
+        SingleAxis const along(!bar.IsHorizontal());
+        double const length = along.Length(trough);
+        double const thumb = std::max(bar.GetClient()->GetThumbRatio(&bar) * length, kLeastThumb);
+        double const way = (length - thumb) * bar.GetPosition() / bar.GetRange();
+        along.Start(trough) = static_cast<short>(along.Start(trough) + way);
+        along.End(trough) = static_cast<short>(along.Start(trough) + thumb);
+        return trough;
     }
 
     Rect RectOf(Place const &place) const {
@@ -109,20 +138,27 @@ protected:
             return rect;
         }
         rect = pane.GetDrawRectangle();
+        if (place.part == kThumb)
+            return ThumbIn(rect, dynamic_cast<ScrollBarPane &>(Item(place.item)));
         return place.part < 0 || &pane != &Item(place.item) ? rect : HalfOf(rect, place.part == 1);
     }
 
-    // The middle of the place in the window, as scripts have it.
-    std::string Spot(Place const &place) const {
+    // The middle of the place in the window, or what lies that far from it, as scripts have it.
+    std::string Spot(Place const &place, int right = 0, int down = 0) const {
         Rect const rect = RectOf(place);
         Point const origin = PaneAccess::Origin(PaneAt(place));
-        return std::to_string(origin.h + (rect.left + rect.right) / 2) + ' ' +
-               std::to_string(origin.v + (rect.top + rect.bottom) / 2);
+        return std::to_string(origin.h + (rect.left + rect.right) / 2 + right) + ' ' +
+               std::to_string(origin.v + (rect.top + rect.bottom) / 2 + down);
     }
 
     std::string LabelText(int id) const {
         LabelPane *const label = dynamic_cast<LabelPane *>(&Item(id));
         return label ? Utf8::FromUString(label->GetText()) : "no label";
+    }
+
+    std::string BarText(int id) const {
+        ScrollBarPane &bar = dynamic_cast<ScrollBarPane &>(Item(id));
+        return std::to_string(bar.GetPosition()) + " of " + std::to_string(bar.GetRange());
     }
 
     void OpenPage(std::string const &name) {
@@ -147,12 +183,20 @@ protected:
         return classes;
     }
 
-    void Use(std::string const &gesture, Place const &place, std::string const &modifier) {
+    // What stands behind the place in the step is left in the words.
+    void Use(std::string const &gesture, Place const &place, std::istream &words) {
         unused.erase(MessageTrace::ClassName(Item(place.item)));
         unused.erase(MessageTrace::ClassName(PaneAt(place)));
         std::string const spot = Spot(place);
+        std::string modifier;
+        int right = 0, down = 0;
         if (gesture == "click")
-            desktop.Play("click " + spot + ' ' + modifier + "\nwait 1\n");
+            desktop.Play("click " + spot + (words >> modifier ? ' ' + modifier : "") + "\nwait 1\n");
+        else if (gesture == "drag" && words >> right >> down)
+            desktop.Play("press " + spot + "\nmove " + Spot(place, right, down) + "\nrelease\nwait 1\n");
+        else if (gesture == "wheel" && words >> right >> down)
+            desktop.Play("wheel " + spot + ' ' + std::to_string(right) + ' ' + std::to_string(down) +
+                         "\nwait 1\n");
         else if (gesture == "slide")
             desktop.Play("press " + spot + "\nmove " + kAside + "\nrelease\nwait 1\n");
         else if (gesture == "hold")
@@ -164,19 +208,23 @@ protected:
     // Takes the step; the record gets what it led to.
     void Take(std::string const &step) {
         std::istringstream words(step);
-        std::string gesture, where, modifier;
-        words >> gesture >> where >> modifier;
+        std::string gesture, where;
+        words >> gesture >> where;
         record += step + '\n';
-        int told = kStatus;
         if (gesture == "page")
             OpenPage(where);
-        else if (gesture == "label")
-            told = Place(where).item;
-        else
-            Use(gesture, Place(where), modifier);
+        else if (gesture != "label" && gesture != "bar")
+            Use(gesture, Place(where), words);
         RecordMessages();
-        record += kIndent + LabelText(told) + '\n';
+        record += kIndent + Told(gesture, where) + '\n';
         EXPECT_TRUE(IsWhole()) << step;
+    }
+
+    // What the window says after a step.
+    std::string Told(std::string const &gesture, std::string const &where) const {
+        if (gesture == "bar")
+            return BarText(Place(where).item);
+        return LabelText(gesture == "label" ? Place(where).item : kStatus);
     }
 
     // All but what containers answer to clicks, which is what the pane in them answers.

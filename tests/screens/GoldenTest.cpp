@@ -89,6 +89,15 @@ Press const kPresses[] = {
     {"scroll-bar", "arrow-held", "press 24 152\n"},
     {"scroll-bar", "thumb-dragged", "press 120 24\nmove 140 24\n"},
     {"scroll-bar", "behind", "activate off\n"},
+    {"scroll-pane", "thumb-dragged", "press 60 180\nmove 110 180\n"},
+    {"scroll-pane", "middle", "wheel 150 90 -92 -50\n"},
+    {"scroll-pane", "clicked-where-scrolled", "wheel 150 90 -10 -6\nclick 102 41\n"},
+    {"grid", "thumb-dragged", "press 380 34\nmove 380 100\n"},
+    {"grid", "middle", "wheel 200 100 -60 -500\n"},
+    {"grid", "deleted", "click 210 74\nwait 1\nclick 92 218\n"},
+    {"grid", "moved", "click 210 74\nwait 1\nclick 192 218\n"},
+    {"grid", "revealed", "click 210 74\nwait 1\nwheel 200 100 0 -500\nwait 1\nclick 244 218\n"},
+    {"grid", "stuck-to-end", "wheel 200 100 -1000 0\nclick 206 246\nwait 1\nclick 52 246\n"},
 };
 
 void PrintTo(Press const &press, std::ostream *out) { *out << press.Name(); }

@@ -24,7 +24,7 @@ TEST_F(GalleryProgram, WritesEveryPageInBothThemesAndTwoScales) {
     ProgramResult const result = Run("--png-dir pictures");
     EXPECT_EQ(result.status, 0) << result.errors;
     for (char const *page : {"push-buttons", "labels", "layout", "help-tags", "check-boxes", "box-select",
-                             "icon-buttons", "small-buttons", "scroll-bars"}) {
+                             "icon-buttons", "small-buttons", "scroll-bars", "scroll-pane", "grid"}) {
         for (char const *theme : {"light", "dark"}) {
             std::string const start = std::string("pictures/") + page + '-' + theme;
             EXPECT_TRUE(Holds(result.output, start + "-1x.png\n"));
@@ -92,7 +92,8 @@ TEST_F(GalleryProgram, EndsWithOneForAnUnknownPage) {
     EXPECT_EQ(result.status, 1);
     EXPECT_EQ(result.errors,
               "gallery: there is no page \"lay\"; there are push-buttons, labels, layout, help-tags, "
-              "check-boxes, box-select, icon-buttons, small-buttons, scroll-bars\n");
+              "check-boxes, box-select, icon-buttons, small-buttons, scroll-bars, "
+              "scroll-pane, grid\n");
 }
 
 TEST_F(GalleryProgram, EndsWithOneWhereThereAreNoPages) {

@@ -6,12 +6,16 @@
 #include "tools/gallery/ChoiceButtonPane.h"
 #include "tools/gallery/HoldButtonPane.h"
 #include "tools/gallery/StepperPane.h"
+#include "tools/gallery/TrackListPane.h"
+#include "tools/gallery/WellPane.h"
 
 namespace {
 
 short const kBadgeFamily = 2004;
 short const kRestBadge = 0, kPressedBadge = 1, kDisabledBadge = 2;
 short const kBadgeSide = 9; // pixels
+
+long long const kMostRows = 1000;
 
 // At the upper right corner of the pane, which is a little wider than its icon.
 void DrawBadge(glogRec *, Rect box, bool enabled, bool pressed, GIconPane *) {
@@ -67,6 +71,23 @@ void GalleryItems::Add() {
                                .Flag("Mode"))
                      .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
                          return HoldButtonPane::NewHoldButtonPane(glog, sheet);
+                     }));
+    registry.Add(ItemType("TrackList")
+                     .Keys(KeyList()
+                               .Rect("BoundsRect")
+                               .Required()
+                               .Integer("Num", 0, kMostRows)
+                               .Integer("TextID")
+                               .Required()
+                               .Integer("CmdID")
+                               .Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return TrackListPane::NewTrackListPane(glog, sheet);
+                     }));
+    registry.Add(ItemType("Well")
+                     .Keys(KeyList().Rect("BoundsRect").Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return WellPane::NewWellPane(glog, sheet);
                      }));
     registry.Add(BadgeButtonType());
 }

@@ -10,6 +10,8 @@ namespace GalleryItems {
 // Backdrop    a picture behind other items (BackdropPane.h)
 // Stepper     steps a number up and down (StepperPane.h)
 // HoldButton  counts while it is held down (HoldButtonPane.h)
+// TrackList   rows of live panes in a scrolled grid (TrackListPane.h)
+// Well        the ground and the frame of what scrolls (WellPane.h)
 // BadgeButton an icon button, with all keys of one, that draws a badge over its upper right corner
 void Add();
 

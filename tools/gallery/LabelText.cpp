@@ -3,7 +3,11 @@
 #include "text/LabelPane.h"
 
 void LabelText::Show(glogRec *glog, int labelID, UString const &text) {
-    if (LabelPane *label = dynamic_cast<LabelPane *>(GetGlogItem(glog, static_cast<short>(labelID))))
+    Show(GetGlogItem(glog, static_cast<short>(labelID)), text);
+}
+
+void LabelText::Show(GlogPane *pane, UString const &text) {
+    if (LabelPane *label = dynamic_cast<LabelPane *>(pane))
         label->SetTextWithInval(text);
 }
 

@@ -2,12 +2,15 @@
 #pragma once
 #include "host/UString.h"
 
+class GlogPane;
 struct glogRec;
 
 namespace LabelText {
 
 // The label with that number of the glog shows the text; without effect when there is no such label.
 void Show(glogRec *, int labelID, UString const &);
+// The same for a pane that is a label; any other, and null, has no effect.
+void Show(GlogPane *, UString const &);
 UString OfNumber(int); // in digits
 
 } // namespace LabelText

@@ -1,7 +1,9 @@
 #include "tools/gallery/PageFiles.h"
 #include <algorithm>
+#include <cstdlib>
 #include <filesystem>
 #include <stdexcept>
+#include <utility>
 
 namespace {
 
@@ -14,6 +16,12 @@ fs::path OwnDirectory() {
     std::error_code failed;
     fs::path const program = fs::read_symlink(kOwnProgram, failed);
     return program.parent_path().parent_path() / kPlaceInPrefix;
+}
+
+// "10-grid" comes after "9-scroll-pane".
+bool ComesBefore(fs::path const &a, fs::path const &b) {
+    auto const number = [](fs::path const &page) { return std::atoi(page.stem().c_str()); };
+    return std::make_pair(number(a), a) < std::make_pair(number(b), b);
 }
 
 std::string NameOf(fs::path const &page) {
@@ -35,7 +43,7 @@ PageFiles::PageFiles(std::string const &given) {
     }
     if (failed || found.empty())
         throw std::runtime_error(directory.string() + ": there are no pages of a gallery here");
-    std::sort(found.begin(), found.end());
+    std::sort(found.begin(), found.end(), ComesBefore);
     for (fs::path const &page : found)
         pages.push_back({NameOf(page), page.string()});
 }

@@ -1,0 +1,59 @@
+// The gallery's list of tracks: a thousand rows of live panes in a grid that scrolls along and across, and a
+// column of their numbers that follows it.
+//
+// A click chooses a row, buttons of the same page change the list, and the wheel scrolls it. The bars have
+// the item numbers 998, along, and 999, across; the check box in a row has 1000 and the track's.
+#pragma once
+#include "frame/ButtonGroupPaneListener.h"
+#include "frame/GlogButtonPaneListener.h"
+#include "host/CompoundPane.h"
+#include <vector>
+
+class GlogStyleSheet;
+class TrackRowPane;
+
+class TrackListPane : public CompoundPane, public GlogButtonPaneListener, public ButtonGroupPaneListener {
+public:
+    // Makes a list and attaches it to the glog, which owns it from then on; null when memory or glog is
+    // wanting. The keys are "BoundsRect"; "Num", how many rows there are at first; "TextID", the number of
+    // the label that tells which row is chosen; and "CmdID", the number of the first of the buttons, in the
+    // order of Command, and of a check box behind them that makes the view keep to the last bars. Of several
+    // panes of a number the nearest counts.
+    static TrackListPane *NewTrackListPane(glogRec *, GlogStyleSheet *);
+
+    enum Command { kAdd, kDelete, kMoveUp, kMoveDown, kReveal, kMoreBars, kFewerBars, kStickToEnd };
+
+    // Overridden operations of panes and listeners.
+    void GlogItemInit() override;
+    void GlogButtonPressed(GlogButtonPane *) override;
+    void ButtonValueChanged(ButtonGroupPane *, short index, bool value) override;
+
+protected:
+    void DrawBackgroundGuts(OSRgn *updateRegion) override;
+
+private:
+    class Table;
+    class Rows;
+    class Numbers;
+
+    explicit TrackListPane(GlogStyleSheet *);
+    bool AddParts(Rect const &box);
+    bool AddRow(short index);
+    void Carry(Command);
+    void AddAfterChosen();
+    void DeleteChosen();
+    void MoveChosen(int by);
+    void Reveal();
+    void AddBars(int more);
+    void Choose(TrackRowPane *);
+    short ChosenIndex() const;
+    void TellChosen();
+
+    int labelID;
+    int firstButton;
+    int bars;
+    int lastNumber = 0;             // of the tracks that were ever added
+    Rows *rows = nullptr;           // subpanes of a table, as the numbers are
+    Numbers *numbers = nullptr;     // as many as there are rows
+    TrackRowPane *chosen = nullptr; // null: none
+};
