@@ -80,6 +80,12 @@ TEST_F(GalleryProgram, TurnsPagesAndChangesThemeAndScale) {
     EXPECT_NE(light, dark);
 }
 
+TEST_F(GalleryProgram, BecomesLargerByItsCorner) {
+    directory.Write("script", "press 890 650\nmove 990 680\nrelease\nwait 1\nsnapshot a.png\n");
+    EXPECT_EQ(Run("--scale 1 --script script").status, 0);
+    EXPECT_EQ(Width("a.png"), 896 + 100);
+}
+
 TEST_F(GalleryProgram, BeginsWithThePageThatIsAskedFor) {
     directory.Write("script", "dump a.json\n");
     EXPECT_EQ(Run("--page layout --script script").status, 0);
