@@ -29,6 +29,12 @@ bool InputQueue::Pop(InputEvent &event) {
     return true;
 }
 
+bool InputQueue::HasRelease(PlatformWindow const *window) const {
+    return std::any_of(events.begin(), events.end(), [window](InputEvent const &event) {
+        return event.kind == InputEvent::kMouseUp && event.window == window;
+    });
+}
+
 InputEvent *InputQueue::Last() { return events.empty() ? nullptr : &events.back(); }
 
 static bool IsRelease(InputEvent::Kind kind) {

@@ -14,6 +14,8 @@ public:
     // False when there is none.
     bool Pop(InputEvent &);
     bool Empty() const { return events.empty(); }
+    // Whether a release of a mouse button waits, for the window.
+    bool HasRelease(PlatformWindow const *) const;
     // The event pushed last, while it waits; null otherwise.
     InputEvent *Last();
     // Removes the events of the window, which is about to be destroyed. Releases of keys and buttons stay,

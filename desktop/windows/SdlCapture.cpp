@@ -65,14 +65,17 @@ void SdlCapture::Hold(bool withoutButton) {
     SDL_SetHintWithPriority(SDL_HINT_MOUSE_AUTO_CAPTURE, "0", SDL_HINT_OVERRIDE);
     SDL_SetHintWithPriority(SDL_HINT_MOUSE_AUTO_CAPTURE, "1", SDL_HINT_OVERRIDE);
     if (withoutButton)
-        SDL_CaptureMouse(SDL_TRUE);
+        OutlastButtons();
 }
+
+void SdlCapture::OutlastButtons() { SDL_CaptureMouse(SDL_TRUE); }
 
 void SdlCapture::Forget(SdlWindow const *window) {
     ignoring.erase(window->Raw());
     eventMasks.erase(window->Raw());
 }
 
+// SDL asks the server nothing when it does not have the capture.
 void SdlCapture::End() {
     SDL_CaptureMouse(SDL_FALSE);
     for (SDL_Window *window : ignoring)

@@ -19,6 +19,8 @@ public:
     // Takes the capture, or takes it anew. `withoutButton`: also when no button is held. SDL refuses while no
     // window is active.
     void Hold(bool withoutButton);
+    // The capture that is held for a button stays when the button is released.
+    static void OutlastButtons();
     void End();
     void Forget(SdlWindow const *); // about to be destroyed
 

@@ -100,7 +100,8 @@ void SdlPointer::Press(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent
     pressWindow = target;
     bool first = held == 0;
     held |= Bit(button);
-    if (first)
+    // Of a quick click SDL has taken the release together with the press: nothing is left to be captured.
+    if (first && SDL_GetMouseState(nullptr, nullptr) != 0)
         HoldCapture();
     clicks = CountClicks(target, press.clicks);
     event.button = button;
@@ -171,13 +172,21 @@ void SdlPointer::Capture(InputEvent event, SdlWindow *window) {
         return;
     capture = window;
     if (window != nullptr) {
-        HoldCapture();
+        CaptureFor(window);
         return;
     }
     if (held != 0)
         return;
     EndCapture();
     LeaveIfOutside(event);
+}
+
+// Taking the capture anew costs the server half a dozen questions, at every press.
+void SdlPointer::CaptureFor(SdlWindow *window) {
+    if (held != 0)
+        sdlCapture.OutlastButtons();
+    else if (!queue.HasRelease(window)) // of a quick click, after which the capture ends
+        HoldCapture();
 }
 
 void SdlPointer::Forget(SdlWindow const *window) {

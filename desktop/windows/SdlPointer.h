@@ -45,6 +45,7 @@ private:
     int CountClicks(SdlWindow *, int sdlClicks);
     bool IsWhereLastClicked(SdlWindow *) const;
     void ReleaseButton(InputEvent, int button);
+    void CaptureFor(SdlWindow *);
     void HoldCapture();
     void EndCapture();
 

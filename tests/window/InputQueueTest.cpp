@@ -109,3 +109,15 @@ TEST(InputQueue, TheLastEventIsThereUntilItIsTaken) {
     TakeAll(queue);
     EXPECT_EQ(queue.Last(), nullptr);
 }
+
+TEST(InputQueue, AReleaseOfTheMouseWaitsForItsWindowAlone) {
+    InputQueue queue;
+    queue.Push(Event(InputEvent::kMouseDown, 1));
+    queue.Push(Event(InputEvent::kKeyUp, 1));
+    EXPECT_FALSE(queue.HasRelease(Window(1)));
+    queue.Push(Event(InputEvent::kMouseUp, 1));
+    EXPECT_TRUE(queue.HasRelease(Window(1)));
+    EXPECT_FALSE(queue.HasRelease(Window(2)));
+    TakeAll(queue);
+    EXPECT_FALSE(queue.HasRelease(Window(1)));
+}
