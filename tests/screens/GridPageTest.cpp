@@ -1,6 +1,7 @@
 // What scrolling the gallery's thousand rows draws.
 #include "desktop/SimulatedDesktop.h"
 #include "host/glogRec.h"
+#include "scrolling/ScrollBarPane.h"
 #include "tests/screens/GalleryPages.h"
 #include "tools/gallery/Gallery.h"
 #include <algorithm>
@@ -31,6 +32,9 @@ protected:
         desktop.Play("wait 1\n");
         desktop.TakeDrawing();
     }
+
+    // Of the rows.
+    ScrollBarPane &Bar() const { return dynamic_cast<ScrollBarPane &>(*GetGlogItem(gallery.Window(), 998)); }
 
     // The drawing calls that the steps lead to.
     Lines DrawingOf(std::string const &steps) {
@@ -64,7 +68,7 @@ protected:
 };
 
 TEST_F(GridPage, AStepDownDrawsOnlyTheRowThatComesIntoView) {
-    EXPECT_EQ(TextsIn(DrawingOf("wheel 500 300 0 -1\n")), (Lines{"16", "Percussion 16", "10 clips"}));
+    EXPECT_EQ(TextsIn(DrawingOf("wheel 500 300 0 -1\n")), (Lines{"18", "Guitar 18"}));
 }
 
 TEST_F(GridPage, AStepDownMovesTheNumbersAndTheRowsAlike) {
@@ -89,9 +93,9 @@ TEST_F(GridPage, AJumpDrawsEachRowInViewOnce) {
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "50"), 0);
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "51"), 1);
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Drums 57"), 1);
-    EXPECT_EQ(std::count(texts.begin(), texts.end(), "66"), 1);
-    EXPECT_EQ(std::count(texts.begin(), texts.end(), "67"), 0);
-    EXPECT_EQ(texts.size(), 3 * 16u);
+    EXPECT_EQ(std::count(texts.begin(), texts.end(), "68"), 1);
+    EXPECT_EQ(std::count(texts.begin(), texts.end(), "69"), 0);
+    EXPECT_EQ(std::count(texts.begin(), texts.end(), "Guitar 67"), 1);
 }
 
 TEST_F(GridPage, AClickOnARowDrawsItAndTheOneThatWasChosenBefore) {
@@ -100,6 +104,21 @@ TEST_F(GridPage, AClickOnARowDrawsItAndTheOneThatWasChosenBefore) {
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 9"), 1);
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 9, row 9 of 1000"), 1);
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 2"), 0);
+}
+
+TEST_F(GridPage, AWindowThatGrowsShowsMoreRows) {
+    int const before = Bar().GetRange();
+    desktop.Play("press 890 650\nmove 890 746\nrelease\nwait 1\n");
+    EXPECT_EQ(Bar().GetRange(), before - 96);
+    EXPECT_EQ(Bar().GetPosition(), 0);
+}
+
+TEST_F(GridPage, AWindowThatGrowsAtTheEndStaysThere) {
+    desktop.Play("press 848 150\nmove 848 640\nrelease\nwait 1\n");
+    int const before = Bar().GetPosition();
+    desktop.Play("press 890 650\nmove 890 746\nrelease\nwait 1\n");
+    EXPECT_EQ(Bar().GetPosition(), before - 96);
+    EXPECT_EQ(Bar().GetPosition(), Bar().GetRange());
 }
 
 } // namespace

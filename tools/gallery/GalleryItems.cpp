@@ -88,6 +88,7 @@ void GalleryItems::Add() {
                      .Keys(KeyList().Rect("BoundsRect").Required())
                      .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
                          return WellPane::NewWellPane(glog, sheet);
-                     }));
+                     })
+                     .HoldsItems());
     registry.Add(BadgeButtonType());
 }

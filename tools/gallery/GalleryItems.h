@@ -11,7 +11,7 @@ namespace GalleryItems {
 // Stepper     steps a number up and down (StepperPane.h)
 // HoldButton  counts while it is held down (HoldButtonPane.h)
 // TrackList   rows of live panes in a scrolled grid (TrackListPane.h)
-// Well        the ground and the frame of what scrolls (WellPane.h)
+// Well        the frame round a view and its two scroll bars (WellPane.h)
 // BadgeButton an icon button, with all keys of one, that draws a badge over its upper right corner
 void Add();
 

@@ -65,12 +65,10 @@ private:
 
 void Place(GlogPane &pane, Rect box) { pane.SetBox(&box); }
 
-ScrollBarPane *NewBar(glogRec *owner, short id, short flags, Rect const &box) {
+ScrollBarPane *NewBar(glogRec *owner, short id, short flags) {
     ScrollBarPane *const bar = new (std::nothrow) ScrollBarPane(owner, flags, 0, 0);
-    if (bar) {
+    if (bar)
         bar->SetID(id);
-        Place(*bar, box);
-    }
     return bar;
 }
 
@@ -129,10 +127,10 @@ TrackListPane *TrackListPane::NewTrackListPane(glogRec *owner, GlogStyleSheet *s
     std::unique_ptr<TrackListPane> list(new (std::nothrow) TrackListPane(sheet));
     if (!list || !list->CompoundPaneInit(owner, 0))
         return nullptr;
+    if (!list->AddParts())
+        return nullptr;
     Rect box = OptionalRect(sheet->GetItemRes(), "BoundsRect");
     list->SetBox(&box);
-    if (!list->AddParts(box))
-        return nullptr;
     int const wanted = sheet->GetSInt32ItemValue(ResourceKey("Num"));
     for (int i = 0; i < wanted; ++i)
         list->AddRow(static_cast<short>(i));
@@ -149,30 +147,44 @@ TrackListPane::TrackListPane(GlogStyleSheet *sheet)
     SetNoErase(1);
 }
 
-// The bars' frames lie on the frame of the list.
-bool TrackListPane::AddParts(Rect const &box) {
-    short const width = static_cast<short>(box.right - box.left - 1);
-    short const height = static_cast<short>(box.bottom - box.top - 1);
-    short const right = static_cast<short>(width - kBarThickness);
-    short const bottom = static_cast<short>(height - kBarThickness);
-    Table *const table = new (std::nothrow) Table(GetGlog());
-    ScrollBarPane *const along =
-        NewBar(GetGlog(), kAlongBar, 0, {-1, right, static_cast<short>(bottom + 1), width});
-    ScrollBarPane *const across = NewBar(GetGlog(), kAcrossBar, ScrollBarPane::kHorizontalBar,
-                                         {bottom, -1, height, static_cast<short>(right + 1)});
+bool TrackListPane::AddParts() {
+    table = new (std::nothrow) Table(GetGlog());
+    along = NewBar(GetGlog(), kAlongBar, 0);
+    across = NewBar(GetGlog(), kAcrossBar, ScrollBarPane::kHorizontalBar);
     numbers = new (std::nothrow) Numbers(GetGlog());
     if (!table || !along || !across || !numbers)
         return false;
     rows = new (std::nothrow) Rows(GetGlog(), along, across, numbers);
     if (!rows)
         return false;
-    Place(*table, {1, 1, static_cast<short>(height + 1), static_cast<short>(width + 1)});
-    Place(*numbers, {0, 0, bottom, kNumbersWidth});
-    Place(*rows, {0, kNumbersWidth, bottom, right});
     for (GlogPane *part : std::initializer_list<GlogPane *>{numbers, rows, along, across})
         table->Add(part, -1);
     Add(table, -1);
     return true;
+}
+
+void TrackListPane::SetBox(Rect *box) {
+    CompoundPane::SetBox(box);
+    if (rows)
+        ArrangeParts(*box);
+}
+
+// The bars' frames lie on the frame of the list.
+void TrackListPane::ArrangeParts(Rect const &box) {
+    short const width = static_cast<short>(box.right - box.left - 1);
+    short const height = static_cast<short>(box.bottom - box.top - 1);
+    short const right = static_cast<short>(width - kBarThickness);
+    short const bottom = static_cast<short>(height - kBarThickness);
+    Place(*table, {1, 1, static_cast<short>(height + 1), static_cast<short>(width + 1)});
+    Place(*along, {-1, right, static_cast<short>(bottom + 1), width});
+    Place(*across, {bottom, -1, height, static_cast<short>(right + 1)});
+    Place(*numbers, {0, 0, bottom, kNumbersWidth});
+    Place(*rows, {0, kNumbersWidth, bottom, right});
+    // A larger view may reach beyond the end. Nothing may be drawn here, where the layout is being settled.
+    rows->SetScrollOffset(std::min(rows->GetScrollOffset(), rows->GetMaxScroll()));
+    numbers->SetScrollOffset(rows->GetScrollOffset());
+    rows->SetLateralScrollOffset(std::min(rows->GetLateralScrollOffset(), rows->GetMaxLateralScroll()));
+    rows->UpdateScrollInfo();
 }
 
 // False when there is no room for another row.

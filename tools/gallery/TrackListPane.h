@@ -10,6 +10,7 @@
 #include <vector>
 
 class GlogStyleSheet;
+class ScrollBarPane;
 class TrackRowPane;
 
 class TrackListPane : public CompoundPane, public GlogButtonPaneListener, public ButtonGroupPaneListener {
@@ -23,7 +24,8 @@ public:
 
     enum Command { kAdd, kDelete, kMoveUp, kMoveDown, kReveal, kMoreBars, kFewerBars, kStickToEnd };
 
-    // Overridden operations of panes and listeners.
+    // Overridden operations of panes and listeners. The view follows the box.
+    void SetBox(Rect *) override;
     void GlogItemInit() override;
     void GlogButtonPressed(GlogButtonPane *) override;
     void ButtonValueChanged(ButtonGroupPane *, short index, bool value) override;
@@ -37,7 +39,8 @@ private:
     class Numbers;
 
     explicit TrackListPane(GlogStyleSheet *);
-    bool AddParts(Rect const &box);
+    bool AddParts();
+    void ArrangeParts(Rect const &box);
     bool AddRow(short index);
     void Carry(Command);
     void AddAfterChosen();
@@ -52,8 +55,10 @@ private:
     int labelID;
     int firstButton;
     int bars;
-    int lastNumber = 0;             // of the tracks that were ever added
-    Rows *rows = nullptr;           // subpanes of a table, as the numbers are
-    Numbers *numbers = nullptr;     // as many as there are rows
+    int lastNumber = 0;     // of the tracks that were ever added
+    Table *table = nullptr; // subpane, which holds the four below
+    ScrollBarPane *along = nullptr, *across = nullptr;
+    Numbers *numbers = nullptr; // as many as there are rows
+    Rows *rows = nullptr;
     TrackRowPane *chosen = nullptr; // null: none
 };

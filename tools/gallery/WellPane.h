@@ -1,22 +1,29 @@
-// The ground and the frame of what scrolls. It takes no clicks.
+// The ground and the frame of what scrolls, and a view with its two bars in it.
+//
+// The items in it are the view, the bar below it and the bar beside it, in this order; they follow the well's
+// size.
 #pragma once
-#include "host/GlogPane.h"
+#include "host/CompoundPane.h"
 
 class GlogStyleSheet;
 
-class WellPane : public GlogPane {
+class WellPane : public CompoundPane {
 public:
-    // Makes a pane and attaches it to the glog, which owns it from then on; null when memory or glog is
-    // wanting. From "BoundsRect".
+    // Makes an empty well and attaches it to the glog, which owns it from then on; null when memory or glog
+    // is wanting. From "BoundsRect".
     static WellPane *NewWellPane(glogRec *, GlogStyleSheet *);
 
     // For panes that are a well themselves. Changes the port's colours.
     static void DrawWell(Rect const &);
 
+    // Overridden operations of panes.
+    void GlogItemInit() override;
+    void SetBox(Rect *) override;
+
 protected:
-    void DrawGuts(OSRgn *updateRegion) override;
-    int HandleClick(EventRecordAdapter *) override { return 0; }
+    void DrawBackgroundGuts(OSRgn *updateRegion) override;
 
 private:
-    WellPane() {}
+    WellPane();
+    void ArrangeItems();
 };
