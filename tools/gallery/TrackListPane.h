@@ -18,8 +18,8 @@ public:
     // Makes a list and attaches it to the glog, which owns it from then on; null when memory or glog is
     // wanting. The keys are "BoundsRect"; "Num", how many rows there are at first; "TextID", the number of
     // the label that tells which row is chosen; and "CmdID", the number of the first of the buttons, in the
-    // order of Command, and of a check box behind them that makes the view keep to the last bars. Of several
-    // panes of a number the nearest counts.
+    // order of Command, and of a check box behind them that makes the view keep to the last bars. They lie
+    // in the same container as the list, at any depth; a list in no container has none of them.
     static TrackListPane *NewTrackListPane(glogRec *, GlogStyleSheet *);
 
     enum Command { kAdd, kDelete, kMoveUp, kMoveDown, kReveal, kMoreBars, kFewerBars, kStickToEnd };
