@@ -7,7 +7,6 @@
 #include "frame/ButtonGroupPaneListener.h"
 #include "frame/GlogButtonPaneListener.h"
 #include "host/CompoundPane.h"
-#include <vector>
 
 class GlogStyleSheet;
 class ScrollBarPane;
