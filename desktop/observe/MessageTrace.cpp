@@ -40,5 +40,9 @@ std::string MessageTrace::ClassName(GlogPane &pane) {
     char *name = abi::__cxa_demangle(typeid(pane).name(), nullptr, nullptr, &status);
     std::string result = status == 0 ? name : typeid(pane).name();
     std::free(name);
+    // Where a class was written down says nothing to who reads the trace.
+    static std::string const kUnnamed = "(anonymous namespace)::";
+    for (std::size_t at = result.find(kUnnamed); at != std::string::npos; at = result.find(kUnnamed))
+        result.erase(at, kUnnamed.size());
     return result;
 }

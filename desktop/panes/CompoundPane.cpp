@@ -296,6 +296,7 @@ void CompoundPane::DrawGuts(OSRgn *region) {
         return;
     }
     OSRgn content(*region);
+    Region::IntersectRect(content, GetDrawRectangle()); // nothing beyond it is seen
     Region::Translate(content, shift.h, shift.v);
     compoundRep->ForEachOf(*this, compoundRep->Within(Region::Bounds(content)),
                            [&](GlogPane &pane) { PaneAccess::Draw(pane, &content); });

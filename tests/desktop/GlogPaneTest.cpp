@@ -1,3 +1,4 @@
+#include "desktop/observe/MessageTrace.h"
 #include "desktop/panes/Glog.h"
 #include "host/Coordinate.h"
 #include "tests/PaneTest.h"
@@ -294,6 +295,16 @@ TEST_F(GlogPaneTest, TheDefaultsOfTheRestRefuse) {
     EXPECT_EQ(pane.CastToConsoleControlSet(), nullptr);
     EXPECT_EQ(pane.CastToControlItem(), nullptr);
     EXPECT_FALSE(pane.Print(nullptr));
+}
+
+class PaneOfThisFile : public ProbePane {
+public:
+    using ProbePane::ProbePane;
+};
+
+TEST_F(GlogPaneTest, ATraceNamesClassesWithoutTheirUnnamedNamespace) {
+    PaneOfThisFile *const here = new PaneOfThisFile(glog, {0, 0, 5, 5}, calls);
+    EXPECT_EQ(MessageTrace::ClassName(*here), "PaneOfThisFile");
 }
 
 } // namespace
