@@ -28,6 +28,9 @@ LayoutKey const kLayoutKeys[] = {
     {"MinHeight", GlogLayoutItem::kMinHeight},
 };
 
+// Parts beyond it share its number.
+int const kLastIndex = (1 << 26) - 1;
+
 UString Key(char const *ascii) { return UString(ascii, UString::ByteEncoding(1)); }
 
 // From the top left of the outer rectangle to its coordinates.
@@ -36,7 +39,7 @@ Rect MovedTo(Rect const &inner, Rect const &outer) {
             static_cast<short>(outer.top + inner.bottom), static_cast<short>(outer.left + inner.right)};
 }
 
-Rect SettledPlace(GlogLayoutItem::Rep const &item) { return item.hasPlace ? item.place : item.made; }
+Rect SettledPlace(GlogLayoutItem::Rep const &item) { return item.hasPlace ? item.Rest().place : item.made; }
 
 // A pane with thousands of parts asks all of them when it looks for the one that was clicked. So whatever is
 // known here is read without a call.
@@ -66,17 +69,17 @@ short *FieldOf(GlogLayoutItem::Attribute attribute, GlogLayoutItem::Rep &rep) {
     case GlogLayoutItem::kHeight:
         return &rep.height;
     case GlogLayoutItem::kGrowWidth:
-        return &rep.growWidth;
+        return &rep.OwnRest().growWidth;
     case GlogLayoutItem::kGrowHeight:
-        return &rep.growHeight;
+        return &rep.OwnRest().growHeight;
     case GlogLayoutItem::kAlignment:
-        return &rep.alignment;
+        return &rep.OwnRest().alignment;
     case GlogLayoutItem::kMinWidth:
-        return &rep.minWidth;
+        return &rep.OwnRest().minWidth;
     case GlogLayoutItem::kMinHeight:
-        return &rep.minHeight;
+        return &rep.OwnRest().minHeight;
     case GlogLayoutItem::kSpacing:
-        return &rep.spacing;
+        return &rep.OwnRest().spacing;
     case GlogLayoutItem::kDirection:
         break; // a word, see SetAttributeFromString
     }
@@ -85,11 +88,16 @@ short *FieldOf(GlogLayoutItem::Attribute attribute, GlogLayoutItem::Rep &rep) {
 
 } // namespace
 
+GlogLayoutItem::Rep::Further const &GlogLayoutItem::Rep::Unsaid() {
+    static Further const unsaid;
+    return unsaid;
+}
+
 GlogLayoutItem::GlogLayoutItem()
     : rep(new Rep) {}
 
 GlogLayoutItem::~GlogLayoutItem() {
-    for (RCPtr<GlogLayoutItem> const &child : rep->children)
+    for (RCPtr<GlogLayoutItem> const &child : rep->Rest().children)
         child->rep->parent = nullptr;
     delete rep;
 }
@@ -122,7 +130,7 @@ Rect GlogLayoutItem::GetBorderRect() {
     return SettledPlace(*rep);
 }
 
-char const *GlogLayoutItem::GetName() const { return rep->name.c_str(); }
+char const *GlogLayoutItem::GetName() const { return rep->Rest().name.c_str(); }
 
 Rect GlogLayoutRectItem::GetItemRect() {
     Rect border = GetBorderRect();
@@ -161,7 +169,7 @@ void GlogLayoutGroup::ReplaceItem(RCPtr<GlogLayoutItem> const &old, RCPtr<GlogLa
         return;
     if (added.get())
         LayoutEngine::TakeOut(*added);
-    auto const &children = LayoutEngine::Rep(*this).children;
+    auto const &children = LayoutEngine::Rep(*this).Rest().children;
     std::size_t index = 0;
     while (children[index].get() != replaced.get())
         ++index;
@@ -171,9 +179,9 @@ void GlogLayoutGroup::ReplaceItem(RCPtr<GlogLayoutItem> const &old, RCPtr<GlogLa
 }
 
 RCPtr<GlogLayoutItem> GlogLayoutGroup::FindItemByID(int id) {
-    for (RCPtr<GlogLayoutItem> const &child : LayoutEngine::Rep(*this).children) {
+    for (RCPtr<GlogLayoutItem> const &child : LayoutEngine::Rep(*this).Rest().children) {
         GlogLayoutItem::Rep const &rep = LayoutEngine::Rep(*child);
-        if (rep.id == id || (rep.pane && !rep.isPart && rep.pane->GetID() == id))
+        if (rep.Rest().id == id || (rep.pane && !rep.isPart && rep.pane->GetID() == id))
             return child;
         if (GlogLayoutGroup *group = dynamic_cast<GlogLayoutGroup *>(child.get())) {
             RCPtr<GlogLayoutItem> found = group->FindItemByID(id);
@@ -185,8 +193,8 @@ RCPtr<GlogLayoutItem> GlogLayoutGroup::FindItemByID(int id) {
 }
 
 RCPtr<GlogLayoutItem> GlogLayoutGroup::FindItemByName(char const *name) {
-    for (RCPtr<GlogLayoutItem> const &child : LayoutEngine::Rep(*this).children) {
-        if (LayoutEngine::Rep(*child).name == name)
+    for (RCPtr<GlogLayoutItem> const &child : LayoutEngine::Rep(*this).Rest().children) {
+        if (LayoutEngine::Rep(*child).Rest().name == name)
             return child;
         if (GlogLayoutGroup *group = dynamic_cast<GlogLayoutGroup *>(child.get())) {
             RCPtr<GlogLayoutItem> found = group->FindItemByName(name);
@@ -198,18 +206,22 @@ RCPtr<GlogLayoutItem> GlogLayoutGroup::FindItemByName(char const *name) {
 }
 
 GlogStyleSheet *GlogLayoutGroup::GetStyleSheet() const {
-    return LayoutEngine::Rep(const_cast<GlogLayoutGroup &>(*this)).styleSheet;
+    return LayoutEngine::Rep(const_cast<GlogLayoutGroup &>(*this)).Rest().styleSheet;
 }
 
-void GlogLayoutGroup::SetStyleSheet(GlogStyleSheet *sheet) { LayoutEngine::Rep(*this).styleSheet = sheet; }
+void GlogLayoutGroup::SetStyleSheet(GlogStyleSheet *sheet) {
+    LayoutEngine::Rep(*this).OwnRest().styleSheet = sheet;
+}
 
 RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect place, int id, int index, char const *name) {
     RCPtr<GlogLayoutRectItem> item(new GlogLayoutRectItem);
     GlogLayoutItem::Rep &rep = LayoutEngine::Rep(*item);
     rep.made = place;
-    rep.id = id;
-    rep.index = index;
-    rep.name = name ? name : "";
+    rep.index = std::clamp(index, 0, kLastIndex);
+    if (id != rep.Rest().id)
+        rep.OwnRest().id = id;
+    if (name && *name)
+        rep.OwnRest().name = name;
     return item;
 }
 

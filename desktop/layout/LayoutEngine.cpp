@@ -25,8 +25,12 @@ struct Along {
     int Natural(LayoutEngine::Extent e) const { return vertical ? e.height : e.width; }
     int Before(GlogLayoutItem::Rep const &r) const { return vertical ? r.insetTop : r.insetLeft; }
     int After(GlogLayoutItem::Rep const &r) const { return vertical ? r.insetBottom : r.insetRight; }
-    int Grow(GlogLayoutItem::Rep const &r) const { return vertical ? r.growHeight : r.growWidth; }
-    int Minimum(GlogLayoutItem::Rep const &r) const { return vertical ? r.minHeight : r.minWidth; }
+    int Grow(GlogLayoutItem::Rep const &r) const {
+        return vertical ? r.Rest().growHeight : r.Rest().growWidth;
+    }
+    int Minimum(GlogLayoutItem::Rep const &r) const {
+        return vertical ? r.Rest().minHeight : r.Rest().minWidth;
+    }
     int Room(Rect const &r) const { return vertical ? Height(r) : Width(r); }
 };
 
@@ -40,7 +44,7 @@ RCPtr<GlogLayoutRectItem> LayoutEngine::MakeForPane(GlogPane *pane) {
 
 RCPtr<GlogLayoutGroup> LayoutEngine::MakeForContainer(CompoundPane *owner) {
     RCPtr<GlogLayoutGroup> group(new GlogLayoutGroup(true));
-    Rep(*group).owner = owner;
+    Rep(*group).OwnRest().owner = owner;
     return group;
 }
 
@@ -49,7 +53,7 @@ void LayoutEngine::Append(GlogLayoutGroup &group, RCPtr<GlogLayoutItem> const &i
         if (outer == item.get())
             return; // a group cannot lie in itself
     TakeOut(*item);
-    auto &children = Rep(group).children;
+    auto &children = Rep(group).OwnRest().children;
     auto position =
         index < 0 || index > static_cast<int>(children.size()) ? children.end() : children.begin() + index;
     children.insert(position, item);
@@ -61,7 +65,7 @@ void LayoutEngine::TakeOut(GlogLayoutItem &item) {
     GlogLayoutItem *parent = Rep(item).parent;
     if (!parent)
         return;
-    auto &children = Rep(*parent).children;
+    auto &children = Rep(*parent).OwnRest().children;
     auto found = std::find_if(children.begin(), children.end(),
                               [&](RCPtr<GlogLayoutItem> const &child) { return child.get() == &item; });
     RCPtr<GlogLayoutItem> keep(&item);
@@ -75,14 +79,15 @@ void LayoutEngine::TakeOut(GlogLayoutItem &item) {
 void LayoutEngine::PaneGone(GlogLayoutItem &item) {
     TakeOut(item);
     Rep(item).pane = nullptr;
-    Rep(item).owner = nullptr;
+    if (Rep(item).Rest().owner)
+        Rep(item).OwnRest().owner = nullptr;
 }
 
 void LayoutEngine::Invalidate(GlogLayoutItem &item) {
     GlogLayoutItem *outermost = &item;
     while (Rep(*outermost).parent)
         outermost = Rep(*outermost).parent;
-    if (CompoundPane *owner = Rep(*outermost).owner)
+    if (CompoundPane *owner = Rep(*outermost).Rest().owner)
         PaneAccess::InvalidateLayout(*owner);
     else if (GlogPane *pane = Rep(*outermost).pane)
         PaneAccess::InvalidateLayout(*pane);
@@ -94,7 +99,7 @@ void LayoutEngine::SettleFor(GlogLayoutItem &item) {
         outermost = Rep(*outermost).parent;
     GlogPane *pane = Rep(*outermost).pane;
     if (!pane)
-        pane = Rep(*outermost).owner;
+        pane = Rep(*outermost).Rest().owner;
     if (pane && pane->GetGlog())
         Settle(pane->GetGlog());
 }
@@ -103,12 +108,13 @@ LayoutEngine::Extent LayoutEngine::MeasureGroup(GlogLayoutItem::Rep &group) {
     Along along{group.vertical}, across{!group.vertical};
     int length = 0, breadth = 0;
     bool first = true;
-    for (RCPtr<GlogLayoutItem> const &child : group.children) {
+    for (RCPtr<GlogLayoutItem> const &child : group.Rest().children) {
         GlogLayoutItem::Rep &rep = Rep(*child);
         if (rep.pane && !PaneAccess::OwnVisibility(*rep.pane))
             continue;
         Extent natural = Measure(*child);
-        length += along.Before(rep) + along.Natural(natural) + along.After(rep) + (first ? 0 : group.spacing);
+        length += along.Before(rep) + along.Natural(natural) + along.After(rep) +
+                  (first ? 0 : group.Rest().spacing);
         breadth = std::max(breadth, across.Before(rep) + across.Natural(natural) + across.After(rep));
         first = false;
     }
@@ -150,12 +156,13 @@ LayoutEngine::Extent LayoutEngine::Measure(GlogLayoutItem &item) {
         natural.width = rep.width <= 0 ? inside.width : rep.width;
         natural.height = rep.height <= 0 ? inside.height : rep.height;
     }
-    return {std::max<int>(natural.width, rep.minWidth), std::max<int>(natural.height, rep.minHeight)};
+    return {std::max<int>(natural.width, rep.Rest().minWidth),
+            std::max<int>(natural.height, rep.Rest().minHeight)};
 }
 
 void LayoutEngine::Place(GlogLayoutItem &item, Rect const &place) {
     GlogLayoutItem::Rep &rep = Rep(item);
-    rep.place = place;
+    rep.OwnRest().place = place;
     rep.hasPlace = true;
     if (rep.isGroup)
         PlaceGroup(rep);
@@ -165,7 +172,7 @@ void LayoutEngine::Place(GlogLayoutItem &item, Rect const &place) {
 
 void LayoutEngine::PlaceGroup(GlogLayoutItem::Rep &group) {
     Along along{group.vertical}, across{!group.vertical};
-    Rect inside = group.place;
+    Rect inside = group.Rest().place;
     if (!group.parent)
         inside = {Pixels(inside.top + group.insetTop), Pixels(inside.left + group.insetLeft),
                   Pixels(inside.bottom - group.insetBottom), Pixels(inside.right - group.insetRight)};
@@ -174,7 +181,7 @@ void LayoutEngine::PlaceGroup(GlogLayoutItem::Rep &group) {
     std::vector<RCPtr<GlogLayoutItem>> shown;
     int shares = 0;
     Extent natural = MeasureGroup(group);
-    for (RCPtr<GlogLayoutItem> const &child : group.children) {
+    for (RCPtr<GlogLayoutItem> const &child : group.Rest().children) {
         GlogLayoutItem::Rep &rep = Rep(*child);
         if (rep.pane && !PaneAccess::OwnVisibility(*rep.pane))
             continue;
@@ -200,17 +207,17 @@ void LayoutEngine::PlaceGroup(GlogLayoutItem::Rep &group) {
         }
         int room = breadth - across.Before(rep) - across.After(rep);
         int width = across.Natural(extent);
-        if (across.Grow(rep) || rep.alignment == 3)
+        if (across.Grow(rep) || rep.Rest().alignment == 3)
             width = std::max({room, across.Minimum(rep), 0});
         int side = start + across.Before(rep);
-        if (rep.alignment == 1)
+        if (rep.Rest().alignment == 1)
             side += (room - width) / 2;
-        else if (rep.alignment == 2)
+        else if (rep.Rest().alignment == 2)
             side += room - width;
         position += along.Before(rep);
         Place(*child, group.vertical ? MakeRect(side, position, width, length)
                                      : MakeRect(position, side, length, width));
-        position += length + along.After(rep) + group.spacing;
+        position += length + along.After(rep) + group.Rest().spacing;
     }
 }
 

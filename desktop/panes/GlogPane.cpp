@@ -179,7 +179,7 @@ void GlogPane::PanePositionChanged() {}
 void GlogPane::Resize(Point delta) {
     if (IsInLayout() || !rep->layoutItem.get())
         return;
-    GlogLayoutItem::Rep const &item = LayoutEngine::Rep(*rep->layoutItem);
+    GlogLayoutItem::Rep::Further const &item = LayoutEngine::Rep(*rep->layoutItem).Rest();
     if (!item.growWidth && !item.growHeight)
         return;
     Rect box = rep->box;
@@ -199,7 +199,7 @@ bool GlogPane::IsInLayout() const { return container && container->UsesLayout();
 RCPtr<GlogLayoutRectItem> GlogPane::GetLayoutRect() { return rep->layoutItem; }
 
 void GlogPane::UpdateLayoutRect() {
-    Rect place = LayoutEngine::Rep(*rep->layoutItem).place;
+    Rect place = LayoutEngine::Rep(*rep->layoutItem).Rest().place;
     SetBox(&place);
 }
 

@@ -62,7 +62,7 @@ void PaneAccess::MoveTo(GlogPane &pane, Rect const &box) {
 }
 
 void PaneAccess::PlacedByLayout(GlogPane &pane) {
-    Rect const place = LayoutEngine::Rep(*pane.rep->layoutItem).place;
+    Rect const place = LayoutEngine::Rep(*pane.rep->layoutItem).Rest().place;
     Rect const &old = pane.rep->box;
     if (old.top == place.top && old.left == place.left && old.bottom == place.bottom &&
         old.right == place.right)

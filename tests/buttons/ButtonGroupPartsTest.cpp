@@ -34,16 +34,16 @@ protected:
 TEST_F(GroupParts, AButtonMadeInCodeHasAnItemWithItsIconInTheMiddleOfTheLine) {
     UseSpacing(18);
     CheckBoxPane *const group = NewBoxes();
-    LayoutEngine::Rep(*group->GetLayoutRect()).name = "group";
+    LayoutEngine::Rep(*group->GetLayoutRect()).OwnRest().name = "group";
     group->AddSpecialButton(30, 40, 5);
     group->AddSpecialButton(30, 60, 5);
     GlogLayoutItem::Rep const &item = ItemOf(*group, 1);
     EXPECT_EQ(item.made, (Rect{60, 30, 78, 45}));
     EXPECT_EQ(item.inner, (Rect{3, 0, 16, 12}));
     EXPECT_EQ(item.insetTop, 2);
-    EXPECT_EQ(item.id, -1);
+    EXPECT_EQ(item.Rest().id, -1);
     EXPECT_EQ(item.index, 1);
-    EXPECT_EQ(item.name, "group");
+    EXPECT_EQ(item.Rest().name, "group");
 }
 
 TEST_F(GroupParts, HalfALineIsRoundedTowardsZero) {
@@ -70,7 +70,7 @@ TEST_F(GroupParts, ALabelMadeInCodeHasAnItemAsHighAsTheLine) {
               (Rect{top, 45, static_cast<short>(top + 40), static_cast<short>(45 + WidthOf("Label"))}));
     EXPECT_FALSE(item.hasInner);
     EXPECT_EQ(item.insetTop, 0);
-    EXPECT_EQ(item.id, -1);
+    EXPECT_EQ(item.Rest().id, -1);
     EXPECT_EQ(item.index, 1);
 }
 
