@@ -40,12 +40,22 @@ static unsigned char const kSendEventRequest = 25; // its number in the X protoc
 // SDL wakes its own wait by sending an event to a window, over a second connection to the server. When that
 // window is closed at the same moment, the server refuses the event, and Xlib's own handler would end the
 // program.
-static XErrorHandler theFormerHandler = nullptr;
+//
+// SDL has a handler too, which leaves full screens at any error and hands it on to the one that it found.
+// When it closes its connections it has put that one back already. So there is one of ours on either side of
+// it.
+static XErrorHandler theHandlerBeforeSdl = nullptr, theHandlerOfSdl = nullptr;
 
-static int IgnoreLateWakeUps(Display *display, XErrorEvent *error) {
-    if (error->error_code == BadWindow && error->request_code == kSendEventRequest)
-        return 0;
-    return theFormerHandler(display, error);
+static bool IsLateWakeUp(XErrorEvent const *error) {
+    return error->error_code == BadWindow && error->request_code == kSendEventRequest;
+}
+
+static int HandleBehindSdl(Display *display, XErrorEvent *error) {
+    return IsLateWakeUp(error) ? 0 : theHandlerBeforeSdl(display, error);
+}
+
+static int HandleBeforeSdl(Display *display, XErrorEvent *error) {
+    return IsLateWakeUp(error) ? 0 : theHandlerOfSdl(display, error);
 }
 
 static std::runtime_error NoDisplay(std::string const &reason) {
@@ -55,20 +65,24 @@ static std::runtime_error NoDisplay(std::string const &reason) {
 SdlSession::SdlSession() {
     for (Hint const &hint : kHints)
         SDL_SetHintWithPriority(hint.name, hint.value, SDL_HINT_OVERRIDE);
-    if (SDL_InitSubSystem(SDL_INIT_VIDEO) != 0)
+    theHandlerBeforeSdl = XSetErrorHandler(HandleBehindSdl);
+    if (SDL_InitSubSystem(SDL_INIT_VIDEO) != 0) {
+        XSetErrorHandler(theHandlerBeforeSdl);
         throw NoDisplay(SDL_GetError());
+    }
     // Without a display SDL may settle for a driver that shows nothing and polls for its events.
     char const *driver = SDL_GetCurrentVideoDriver();
     if (driver == nullptr || std::strcmp(driver, kVideoDriver) != 0) {
         SDL_QuitSubSystem(SDL_INIT_VIDEO);
+        XSetErrorHandler(theHandlerBeforeSdl);
         throw NoDisplay("the X server cannot be reached");
     }
-    theFormerHandler = XSetErrorHandler(IgnoreLateWakeUps);
+    theHandlerOfSdl = XSetErrorHandler(HandleBeforeSdl);
     // Text input is on at first, and an input method would take the keys of shortcuts.
     SDL_StopTextInput();
 }
 
 SdlSession::~SdlSession() {
     SDL_QuitSubSystem(SDL_INIT_VIDEO);
-    XSetErrorHandler(theFormerHandler);
+    XSetErrorHandler(theHandlerBeforeSdl);
 }
