@@ -259,15 +259,15 @@ TEST_F(Picture, TheWindowsOwnSurfaceIsShownWhereItIsPresented) {
 }
 
 TEST_F(Picture, TheWindowsOwnSurfaceIsRefusedAfterAResize) {
-    if (Screen().ColourBits() < 8)
-        GTEST_SKIP() << "where the screen has few colours a window has no surface of its own";
     Window window = Open(At(200, 150, 100, 80));
     std::unique_ptr<Surface> surface = window->NewSurface(100, 80);
     DeviceRect all = {0, 0, 120, 90};
     EXPECT_TRUE(window->Present(*surface, &all, 1));
     window->SetContentSize(120, 90);
     Await(InputEvent::kResized);
-    EXPECT_FALSE(window->Present(*surface, &all, 1));
+    // On a screen of few colours the surface is no window's, and copied to whatever size there is.
+    bool const isWindowsOwn = Screen().ColourBits() == 8;
+    EXPECT_EQ(window->Present(*surface, &all, 1), !isWindowsOwn);
     std::fill(surface->Pixels(), surface->Row(80), 0xFF00A000U); // what draws on it still may
     surface.reset();
     surface = window->NewSurface(120, 90);
