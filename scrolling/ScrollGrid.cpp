@@ -6,6 +6,7 @@
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
 #include "scrolling/Truncation.h"
+#include "scrolling/WheelAxis.h"
 #include <algorithm>
 #include <cstdlib>
 #include <limits>
@@ -16,7 +17,6 @@ namespace {
 int const kStepsPerView = 16; // an arrow makes one of them, a page all but one
 int const kFastest = 4;       // the greatest multiplier
 double const kStepsPerWheelUnit = 2.0;
-enum WheelAxis { kWheelHorizontal = 0, kWheelVertical = 1 };
 
 int Clamped(int position, int greatest) { return std::max(std::min(position, greatest), 0); }
 

@@ -3,6 +3,7 @@
 #include "host/UIEvent.h"
 #include "host/glogRec.h"
 #include "scrolling/Truncation.h"
+#include "scrolling/WheelAxis.h"
 #include <algorithm>
 #include <limits>
 #include <new>
@@ -10,7 +11,6 @@
 namespace {
 
 double const kStepsPerWheelUnit = 2.0;
-enum WheelAxis { kWheelHorizontal = 0, kWheelVertical = 1 };
 
 } // namespace
 

@@ -2,6 +2,7 @@
 #include "host/CustomEventHandler.h"
 #include "host/UIEvent.h"
 #include "scrolling/Truncation.h"
+#include "scrolling/WheelAxis.h"
 #include <algorithm>
 #include <cmath>
 #include <new>
@@ -11,7 +12,6 @@ namespace {
 int const kArrowStep = 10;     // pixels
 double const kPageShare = 0.9; // of the box
 int const kPixelsPerWheelUnit = 5;
-enum WheelAxis { kWheelHorizontal = 0, kWheelVertical = 1 };
 
 int Clamped(int position, int greatest) { return position < 0 ? 0 : std::min(greatest, position); }
 

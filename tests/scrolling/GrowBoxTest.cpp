@@ -116,8 +116,7 @@ TEST_F(GrowBoxTest, SetIconChoosesAnyIcon) {
     EXPECT_EQ(IconOf(box), 22);
 }
 
-TEST_F(GrowBoxTest, FollowsTheCornerAndDrawsBothPlaces) {
-    New(0, 0, 0);
+TEST_F(GrowBoxTest, FollowsTheCornerOfAWindowThatGrows) {
     GrowBox *const box = New(0, 0, 0);
     Show();
     desktop.Play("resize 400 300");
