@@ -8,7 +8,9 @@ class GlogPane;
 class DragRegionUpdater {
 public:
     virtual ~DragRegionUpdater() {}
-    // Called in each pass of the drag, also while the mouse rests. The outline is off the screen meanwhile.
+    // Called in each pass of the drag, also, every MouseTask::DefaultAutoScrollTime, while the mouse rests.
+    // What it draws comes up under the outline. It may delete the pane or close its window, which ends the
+    // drag.
     virtual void UpdateDragRegion() = 0;
 };
 
@@ -26,9 +28,11 @@ struct Result {
 
 } // namespace DragRegionTypes
 
-// Drags the rectangle's outline with the mouse, from the start point, until the button is released.
-// Everything is in the pane's coordinates. The outline stays within the limit; released outside of the slop,
-// it counts as not moved. The updater may be null and stays the caller's.
+// Drags the rectangle's outline with the mouse, from the start point, until the button is released; the pane
+// is prepared then. Everything is in the pane's coordinates. The limit holds the point by which the outline
+// was taken, and cuts what shows of the outline. With the mouse outside of the slop the outline is back at
+// its place; released there, it counts as not moved. The updater may be null and stays the caller's.
+// Fractions of pixels are rounded.
 DragRegionTypes::Result DragRect(GlogPane *, OS::RectBase<OS::RectTag> const &rect, OS::Point const &start,
                                  OS::RectBase<OS::RectTag> const &limit,
                                  OS::RectBase<OS::RectTag> const &slop, DragRegionTypes::Constraint,

@@ -109,10 +109,8 @@ void Desktop::WatchDrawing(LineSink sink) { DrawingTrace::SetSink(std::move(sink
 std::string Desktop::DumpTree(glogRec *glog) const { return TreeDump::Json(Glog::From(glog)); }
 
 void Desktop::Snapshot(glogRec *record, std::string const &pngPath) {
-    Glog &glog = Glog::From(record);
-    glog.Update();
-    std::string error = "its window has not been shown";
-    if (!glog.Pixels() || !glog.Pixels()->WritePng(pngPath, error))
+    std::string error;
+    if (!Glog::From(record).WritePng(pngPath, error))
         throw std::runtime_error("cannot write the picture " + pngPath + ": " + error);
 }
 

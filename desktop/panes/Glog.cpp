@@ -291,6 +291,8 @@ void Glog::Update() {
     HostCall const call;
     LayoutEngine::Settle(this);
     std::vector<DeviceRect> shownBoxes = port.TakeTouched();
+    for (DeviceRect const &bar : outline.TakeChanged(scale))
+        shownBoxes.push_back(bar);
     OSRgn region = port.TakeDamage();
     Region::IntersectRect(region, port.Extent());
     if (!Region::IsEmpty(region)) {
@@ -332,7 +334,11 @@ void Glog::DrawDamage(OSRgn const &region) {
 }
 
 void Glog::Present(std::vector<DeviceRect> const &rects) {
-    if (window->Present(*surface, rects.data(), rects.size()))
+    auto const present = [&] {
+        WithOutline const outlined(*surface, scale, outline);
+        return window->Present(*surface, rects.data(), rects.size());
+    };
+    if (present())
         return;
     MakeSurface();
     Update();
@@ -341,6 +347,16 @@ void Glog::Present(std::vector<DeviceRect> const &rects) {
 void Glog::PresentAll() {
     if (shown && surface)
         Present({{0, 0, surface->Width(), surface->Height()}});
+}
+
+bool Glog::WritePng(std::string const &path, std::string &error) {
+    if (!surface) {
+        error = "its window has not been shown";
+        return false;
+    }
+    Update();
+    WithOutline const outlined(*surface, scale, outline);
+    return surface->WritePng(path, error);
 }
 
 // Events

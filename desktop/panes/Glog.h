@@ -2,6 +2,7 @@
 #pragma once
 #include "desktop/Desktop.h"
 #include "desktop/drawing/DrawingPort.h"
+#include "desktop/drawing/Outline.h"
 #include "desktop/drawing/Surface.h"
 #include "desktop/windows/InputEvent.h"
 #include "desktop/windows/PlatformWindow.h"
@@ -70,6 +71,10 @@ public:
         return updateRegion;
     } // in window coordinates; null outside an update
     void PresentAll();
+    // What lies over everything else; a change shows at the next update.
+    OutlineLayer &OutlineShown() { return outline; }
+    // Writes what the window shows; false, with the reason in `error`, when that is impossible.
+    bool WritePng(std::string const &path, std::string &error);
     void SetScale(DeviceScale);
 
     // Events; positions in window coordinates
@@ -120,6 +125,7 @@ private:
     std::unique_ptr<Surface> surface;
     DeviceScale scale;
     DrawingPort port;
+    OutlineLayer outline;
     OSRgn const *updateRegion = nullptr;
     bool started = false;
     bool shown = false;
