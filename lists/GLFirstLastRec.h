@@ -1,0 +1,6 @@
+// What LSTGetFirstAndLast answers.
+#pragma once
+
+struct GLFirstLastRec {
+    int first, last; // rows that show at least in part
+};
