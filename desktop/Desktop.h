@@ -47,6 +47,22 @@ public:
     std::shared_ptr<GlogStyleSheet> styleSheet;
 };
 
+// How a window is printed.
+class PrintOptions {
+public:
+    // "A4" (default) or "Letter".
+    PrintOptions &Paper(std::string const &name) { return paper = name, *this; }
+    // Texts for the top of every page, in UTF-8: the first line, what stands right of it, the second line.
+    // Default: the window's title and nothing else.
+    PrintOptions &Header(std::string const &first, std::string const &beside, std::string const &second) {
+        return header = {first, beside, second}, *this;
+    }
+
+    // What was set.
+    std::string paper = "A4";
+    std::vector<std::string> header;
+};
+
 // Opens the window system and the resources; closes all glogs and both when it goes. One at a time: a second
 // one throws std::logic_error. The constructor throws std::runtime_error with the reason when there is no
 // display or no artwork.
@@ -90,6 +106,12 @@ public:
     // Writes what the glog's window shows, in device pixels; throws std::runtime_error when the file cannot
     // be written.
     void Snapshot(glogRec *, std::string const &pngPath);
+
+    // Prints all that the glog's visible panes have to print into one PDF file; the number of pages. 0: there
+    // was nothing, and no file was made. Throws std::invalid_argument for a paper that it does not know,
+    // std::logic_error while something is being printed, and std::runtime_error when the file cannot be
+    // written; an older file of that name is untouched then.
+    int Print(glogRec *, std::string const &pdfPath, PrintOptions const & = PrintOptions());
 
     // What shows the windows and supplies events and time.
     WindowSystem &Windows();

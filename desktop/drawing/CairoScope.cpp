@@ -6,7 +6,7 @@
 CairoScope::CairoScope(DrawingPort &port_, Rect const &bounds)
     : port(port_)
     , context(nullptr) {
-    if (!port.surface || !port.Visible(bounds))
+    if (!port.HasTarget() || !port.Visible(bounds))
         return;
     port.device->UpdateClip(port);
     Rect window = port.LocalToWindow(bounds);
@@ -17,7 +17,8 @@ CairoScope::CairoScope(DrawingPort &port_, Rect const &bounds)
     port.touched.Add(box);
 
     context = port.device->UpdateContext(port);
-    cairo_surface_mark_dirty(port.surface->CairoSurface()); // integer drawing may have changed the pixels
+    if (port.surface)
+        cairo_surface_mark_dirty(port.surface->CairoSurface()); // integer drawing may have changed the pixels
     cairo_save(context);
     cairo_scale(context, port.scale.Factor(), port.scale.Factor());
     cairo_translate(context, port.originH, port.originV);
@@ -31,7 +32,8 @@ CairoScope::~CairoScope() {
     if (!context)
         return;
     cairo_restore(context);
-    cairo_surface_flush(port.surface->CairoSurface());
+    if (port.surface)
+        cairo_surface_flush(port.surface->CairoSurface());
     if (cairo_status(context) != CAIRO_STATUS_SUCCESS)
         port.device->ForgetSurface(); // a context that has failed once would draw nothing ever after
 }

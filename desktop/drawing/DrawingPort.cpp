@@ -76,6 +76,7 @@ DrawingPort *DrawingPort::current = nullptr;
 
 DrawingPort::DrawingPort()
     : surface(nullptr)
+    , page(nullptr)
     , extent{0, 0, 0, 0}
     , originH(0)
     , originV(0)
@@ -97,8 +98,18 @@ DrawingPort *DrawingPort::Alive(OSPort *port) {
     return found == ports.end() ? nullptr : *found;
 }
 
+void DrawingPort::SetPage(cairo_surface_t *newPage, DeviceScale newScale) {
+    SetSurface(nullptr, newScale);
+    page = newPage;
+}
+
+int DrawingPort::DeviceWidth() const { return surface ? surface->Width() : scale.Edge(extent.right); }
+
+int DrawingPort::DeviceHeight() const { return surface ? surface->Height() : scale.Edge(extent.bottom); }
+
 void DrawingPort::SetSurface(Surface *newSurface, DeviceScale newScale) {
     surface = newSurface;
+    page = nullptr;
     scale = newScale;
     clipPath.reset(); // is bound to the old device pixels
     touched.Take();
@@ -202,9 +213,10 @@ void DrawingPort::FrameRect(OS::RectBase<OS::RectTag> const &r) {
     pixels.FillFrame(outer, Inside(outer, state.lineWidth, scale), state.fore);
 }
 
-// Under a path as clip the edges of both have to be smooth, which only Cairo can do.
+// Under a path as clip the edges of both have to be smooth, which only Cairo can do. On a page shapes stay
+// shapes.
 void DrawingPort::DrawSmooth(Rect const &bounds, std::function<void(cairo_t *)> const &draw) {
-    if (clipPath) {
+    if (clipPath || page) {
         CairoScope const scope(*this, bounds);
         if (scope.Context())
             draw(scope.Context());
@@ -213,7 +225,7 @@ void DrawingPort::DrawSmooth(Rect const &bounds, std::function<void(cairo_t *)> 
     PixelScope pixels(*this);
     if (!pixels.CanDraw())
         return;
-    DeviceRect const box = pixels.ToDevice(bounds).Intersected({0, 0, surface->Width(), surface->Height()});
+    DeviceRect const box = pixels.ToDevice(bounds).Intersected({0, 0, DeviceWidth(), DeviceHeight()});
     if (box.Empty() || !pixels.Meets(box))
         return;
     ShapeMask const mask(box, [&](cairo_t *context) {
@@ -231,7 +243,7 @@ void DrawingPort::DrawRoundRect(Rect const &bounds, OS::Size const &corner, int 
     double const radiusH = Radius(corner.width, scale), radiusV = Radius(corner.height, scale);
     Rect const window = LocalToWindow(bounds);
     DeviceRect const outer = scale.ToDevice(window.left, window.top, window.right, window.bottom);
-    if (!clipPath) {
+    if (!clipPath && !page) {
         PixelScope pixels(*this);
         if (pixels.CanDraw())
             RoundCorners{radiusH, radiusV, line}.Draw(pixels, outer, state.fore);
@@ -300,10 +312,10 @@ void DrawingPort::NarrowClip(OS::RectBase<OS::RectTag> const &r) {
 void DrawingPort::NarrowClipPath(OSPath const &path) {
     if (DrawingTrace::On())
         DrawingTrace::Write(PathDrawing::Described("NarrowClipPath", path));
-    if (!surface)
+    if (!HasTarget())
         return;
-    clipPath = std::make_shared<ClipPath const>(path, originH, originV, scale, surface->Width(),
-                                                surface->Height(), clipPath);
+    clipPath = std::make_shared<ClipPath const>(path, originH, originV, scale, DeviceWidth(), DeviceHeight(),
+                                                clipPath);
     ClipChanged();
 }
 

@@ -15,7 +15,8 @@
 
 class ClipPath;
 class Surface;
-typedef struct _cairo cairo_t; // NOLINT(bugprone-reserved-identifier): Cairo's own name
+typedef struct _cairo cairo_t;                 // NOLINT(bugprone-reserved-identifier): Cairo's own names
+typedef struct _cairo_surface cairo_surface_t; // NOLINT(bugprone-reserved-identifier)
 
 // What drawing depends on beside the pixels; the savers keep copies of parts of it.
 struct GraphicsState {
@@ -54,6 +55,9 @@ public:
     // called, if need be with null, before the surface dies.
     void SetSurface(Surface *, DeviceScale);
     Surface *GetSurface() const { return surface; }
+    // A page of paper instead of pixels: everything becomes shapes, text and images on it. What the surface
+    // takes for a pixel must be one of the scale. Not owned; null, like another surface, ends it.
+    void SetPage(cairo_surface_t *, DeviceScale);
     DeviceScale Scale() const { return scale; }
     // The window's content in logical pixels, from (0, 0); cuts every clip and all damage. Boundary and clip
     // become all of it.
@@ -132,6 +136,10 @@ private:
     friend class PortRef;
     struct Device; // clip in device pixels and the Cairo context, both made when first needed
 
+    bool HasTarget() const { return surface || page; }
+    // The size of what is drawn on, in device pixels.
+    int DeviceWidth() const;
+    int DeviceHeight() const;
     void ClipChanged();
     void CutClip(OSRgn const &);
     // Draws a smooth shape that lies in the local rectangle; user space is local logical coordinates.
@@ -142,6 +150,7 @@ private:
     static DrawingPort *current;
 
     Surface *surface;
+    cairo_surface_t *page;
     DeviceScale scale;
     Rect extent;
     int originH, originV;

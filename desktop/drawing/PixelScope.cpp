@@ -1,4 +1,5 @@
 #include "desktop/drawing/PixelScope.h"
+#include "desktop/drawing/PageDrawing.h"
 #include "desktop/drawing/Surface.h"
 #include <algorithm>
 #include <cmath>
@@ -10,6 +11,7 @@ constexpr std::uint32_t kFullAlpha = 0xFF;
 constexpr double kLargest8 = 255.0, kLargest16 = 65535.0;
 // What is left of an icon that is drawn as disabled.
 constexpr std::uint16_t kFadedAlpha = 0x6666;
+constexpr double kOpaque = 1.0;
 
 double Unit(double value) { return value > 0.0 ? std::min(value, 1.0) : 0.0; } // what is not a number gives 0
 
@@ -104,6 +106,10 @@ void PixelScope::FillPixels(DeviceRect const &r, std::uint32_t pixel) {
 }
 
 void PixelScope::FillBox(DeviceRect const &r, OS::RGBAColor const &color) {
+    if (port.page) {
+        PageDrawing::Fill(device->UpdateContext(port), r, color);
+        return;
+    }
     if (!device->IsColor(color)) {
         double alpha = Unit(color.a);
         device->color = color;
@@ -138,6 +144,16 @@ void PixelScope::FillFrame(DeviceRect const &outer, DeviceRect const &inner, OS:
 void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRect const &box, bool fades) {
     if (image.empty)
         return;
+    bool const faded = fades && port.state.fadedIcons;
+    if (port.page) {
+        cairo_t *const context = device->UpdateContext(port);
+        if (port.state.darken != 0)
+            PageDrawing::FillThrough(context, image.pixels, left, top, box, port.Ink());
+        else
+            PageDrawing::DrawImage(context, image.pixels, left, top, box,
+                                   faded ? kFadedAlpha / kLargest16 : kOpaque);
+        return;
+    }
     bool const repeats =
         left > box.left || top > box.top || left + image.width < box.right || top + image.height < box.bottom;
     WithRepeat repeating(image.pixels, repeats);
@@ -151,7 +167,7 @@ void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRec
     };
     if (port.state.darken != 0)
         compose(PIXMAN_OP_OVER, SolidImage(PremultipliedColor(port.Ink())).Get(), image.pixels);
-    else if (fades && port.state.fadedIcons)
+    else if (faded)
         compose(PIXMAN_OP_OVER, image.pixels, FadingMask());
     else
         compose(image.opaque ? PIXMAN_OP_SRC : PIXMAN_OP_OVER, image.pixels, nullptr);
@@ -161,7 +177,13 @@ void PixelScope::FillThrough(pixman_image_t *mask, int fromH, int fromV, DeviceR
                              OS::RGBAColor const &color) {
     if (!mask || !Meets(box))
         return;
-    SolidImage const solid(PremultipliedColor(port.state.darken != 0 ? port.Ink() : color));
+    OS::RGBAColor const ink = port.state.darken != 0 ? port.Ink() : color;
+    if (port.page) {
+        PageDrawing::FillThrough(device->UpdateContext(port), mask, box.left - fromH, box.top - fromV, box,
+                                 ink);
+        return;
+    }
+    SolidImage const solid(PremultipliedColor(ink));
     ForEachVisible(box, [&](DeviceRect const &part) {
         pixman_image_composite32(PIXMAN_OP_OVER, solid.Get(), mask, port.surface->PixmanImage(), 0, 0,
                                  part.left - box.left + fromH, part.top - box.top + fromV, part.left,

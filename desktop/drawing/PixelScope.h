@@ -21,7 +21,7 @@ public:
     explicit PixelScope(DrawingPort &port_)
         : port(port_)
         , device(nullptr) {
-        if (!port.surface)
+        if (!port.HasTarget())
             return;
         port.device->UpdateClip(port);
         if (!port.device->clipBounds.Empty())

@@ -45,19 +45,19 @@ void DrawingPort::Device::FindClip(DrawingPort const &port) {
         pixman_region32_fini(&clip);
         pixman_region32_init_rects(&clip, boxes.data(), static_cast<int>(boxes.size()));
     }
-    pixman_region32_intersect_rect(&clip, &clip, 0, 0, static_cast<unsigned>(port.surface->Width()),
-                                   static_cast<unsigned>(port.surface->Height()));
+    pixman_region32_intersect_rect(&clip, &clip, 0, 0, static_cast<unsigned>(port.DeviceWidth()),
+                                   static_cast<unsigned>(port.DeviceHeight()));
     if (port.clipPath)
         pixman_region32_intersect(&clip, &clip, const_cast<pixman_region32_t *>(port.clipPath->Pixels()));
     pixman_box32_t const *extents = pixman_region32_extents(&clip);
     clipBounds = {extents->x1, extents->y1, extents->x2, extents->y2};
-    clipIsBox = pixman_region32_n_rects(&clip) <= 1;
+    clipIsBox = !port.page && pixman_region32_n_rects(&clip) <= 1;
     clipKnown = true;
 }
 
 cairo_t *DrawingPort::Device::UpdateContext(DrawingPort &port) {
     if (!context) {
-        context = cairo_create(port.surface->CairoSurface());
+        context = cairo_create(port.page ? port.page : port.surface->CairoSurface());
         contextClipKnown = false;
     }
     if (contextClipKnown)

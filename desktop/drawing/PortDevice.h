@@ -26,7 +26,7 @@ struct DrawingPort::Device {
     bool clipKnown = false;
     DeviceRect clipBounds{0, 0, 0, 0};
     pixman_region32_t clip;
-    bool clipIsBox = false;
+    bool clipIsBox = false; // of pixels: they can be written without looking for their part of the clip
 
     cairo_t *context = nullptr;
     bool contextClipKnown = false;

@@ -5,6 +5,7 @@
 #include "desktop/panes/ApplicationHooks.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
+#include "desktop/printing/PrintJob.h"
 #include "desktop/resources/Resources.h"
 #include "desktop/windows/SdlWindowSystem.h"
 #include "host/TarnImage.h"
@@ -112,6 +113,15 @@ void Desktop::Snapshot(glogRec *record, std::string const &pngPath) {
     std::string error;
     if (!Glog::From(record).WritePng(pngPath, error))
         throw std::runtime_error("cannot write the picture " + pngPath + ": " + error);
+}
+
+int Desktop::Print(glogRec *record, std::string const &pdfPath, PrintOptions const &options) {
+    Glog &glog = Glog::From(record);
+    std::vector<std::string> const title = {glog.Options().title};
+    PrintJob job(pdfPath, Paper::Named(options.paper), options.header.empty() ? title : options.header);
+    glog.Print(job);
+    job.Finish();
+    return job.Pages();
 }
 
 WindowSystem &Desktop::Windows() { return *rep->windows; }

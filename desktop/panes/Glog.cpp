@@ -359,6 +359,14 @@ bool Glog::WritePng(std::string const &path, std::string &error) {
     return surface->WritePng(path, error);
 }
 
+void Glog::Print(PrintJob &job) {
+    HostCall const call;
+    if (!started || hasNewPanes)
+        StartPanes();
+    LayoutEngine::Settle(this);
+    ForEachItem([&](GlogPane &pane) { PaneAccess::Print(pane, job); });
+}
+
 // Events
 
 GlogPane *Glog::TopmostAt(Point p) const {

@@ -14,6 +14,7 @@
 #include <vector>
 
 class EventRecordAdapter;
+class PrintJob;
 class UIEvent;
 
 // The host's glogRec: owns its panes, its pixels and its window. Made by Desktop::NewGlog.
@@ -76,6 +77,8 @@ public:
     // Writes what the window shows; false, with the reason in `error`, when that is impossible.
     bool WritePng(std::string const &path, std::string &error);
     void SetScale(DeviceScale);
+
+    void Print(PrintJob &); // all panes that print
 
     // Events; positions in window coordinates
     void Click(InputEvent const &);

@@ -4,6 +4,7 @@
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/PaneAccess.h"
 #include "desktop/panes/PaneEvents.h"
+#include "desktop/printing/PrintJob.h"
 #include "desktop/resources/DefaultHelpTagHelper.h"
 #include "desktop/windows/EventLoop.h"
 #include "desktop/windows/HelpTagWindow.h"
@@ -283,7 +284,7 @@ void GlogPane::Inval() {
 }
 
 void GlogPane::Prepare() {
-    if (!glog)
+    if (!glog || (PrintJob::Running() && PrintJob::Running()->PrepareFor(*this)))
         return;
     Glog &host = Glog::From(glog);
     DrawingPort &port = host.Port();

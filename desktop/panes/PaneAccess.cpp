@@ -3,6 +3,7 @@
 #include "desktop/layout/LayoutEngine.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/PortKeeper.h"
+#include "desktop/printing/PrintJob.h"
 #include <algorithm>
 
 namespace {
@@ -112,6 +113,16 @@ void PaneAccess::JoinLayout(GlogPane &pane) {
         return;
     if (!LayoutEngine::Rep(*pane.rep->layoutItem).parent)
         LayoutEngine::Append(*pane.container->compoundRep->layout, pane.rep->layoutItem, -1);
+}
+
+void PaneAccess::Print(GlogPane &pane, PrintJob &job) {
+    if (!pane.rep->visible)
+        return;
+    PaneWatch const watch(&pane);
+    job.Print(pane);
+    CompoundPane *const container = watch.PaneExists() ? AsContainer(pane) : nullptr;
+    if (container)
+        container->compoundRep->ForEach(*container, [&](GlogPane &inside) { Print(inside, job); });
 }
 
 void PaneAccess::Idle(GlogPane &pane) {

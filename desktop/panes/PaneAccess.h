@@ -5,6 +5,7 @@
 #include "host/Geometry.h"
 #include "host/OSRgn.h"
 
+class PrintJob;
 class UIEvent;
 
 // Calls the protected operations of panes and reads the host's own fields. For the desktop only.
@@ -57,6 +58,8 @@ public:
     static void TakeOut(GlogPane &);
     // Marks the pane and all its subpanes as belonging to the glog, or to none.
     static void Adopt(GlogPane &, glogRec *);
+    // Prints what the pane has to print, and then its subpanes, as far as they are visible.
+    static void Print(GlogPane &, PrintJob &);
     static void Idle(GlogPane &);  // visible panes, subpanes too
     static void Start(GlogPane &); // PanePositionChanged and GlogItemInit, once, subpanes too
 };

@@ -20,17 +20,22 @@ void WriteDump(Desktop &desktop, glogRec *glog, ScriptStep const &step) {
         throw ScriptError(step.source + ": cannot write " + step.text);
 }
 
+// Does what the step says; what goes wrong is the script's error.
+template <class Action> void Reported(ScriptStep const &step, Action action) {
+    try {
+        action();
+    } catch (std::exception const &error) {
+        throw ScriptError(step.source + ": " + error.what());
+    }
+}
+
 void CarryOut(Desktop &desktop, ScriptStep const &step, PlatformWindow *window) {
     glogRec *const glog = DesktopRep::Of(desktop).GlogOf(window);
     if (!glog)
         throw ScriptError(step.source + ": there is no window");
     switch (step.kind) {
     case ScriptStep::kSnapshot:
-        try {
-            desktop.Snapshot(glog, step.text);
-        } catch (std::runtime_error const &error) {
-            throw ScriptError(step.source + ": " + error.what());
-        }
+        Reported(step, [&] { desktop.Snapshot(glog, step.text); });
         break;
     case ScriptStep::kDump:
         WriteDump(desktop, glog, step);
@@ -38,7 +43,11 @@ void CarryOut(Desktop &desktop, ScriptStep const &step, PlatformWindow *window) 
     case ScriptStep::kMenu:
         throw ScriptError(step.source + ": no menu is open that could be answered");
     case ScriptStep::kPrint:
-        throw ScriptError(step.source + ": nothing in the window prints");
+        Reported(step, [&] {
+            if (desktop.Print(glog, step.text) == 0)
+                throw std::runtime_error("nothing in the window prints");
+        });
+        break;
     default:
         break;
     }
