@@ -222,6 +222,8 @@ void Glog::Show() {
     shown = true;
     rep.CameToFront(this);
     Update();
+    if (EventLoop *loop = EventLoop::Open())
+        loop->WindowShown(window.get());
     window->Show();
 }
 

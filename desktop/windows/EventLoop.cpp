@@ -13,6 +13,8 @@ EventLoop *theLoop = nullptr;
 
 // An activation so soon before a press came from that press.
 double const kActivatingPressWindow = 0.25;
+// And one so soon after a window was shown came from that.
+double const kActivatingShowWindow = 1.0;
 
 bool IsRelease(InputEvent const &event) { return event.kind == InputEvent::kMouseUp && event.button == 1; }
 
@@ -159,8 +161,7 @@ bool EventLoop::HandleWindowEvent(InputEvent const &event) {
             helpTags->Exposed(event.window);
         return true;
     case InputEvent::kActivated:
-        activatedAt = event.time;
-        activatedWindow = event.window;
+        NoteActivation(event);
         if (glog)
             glog->Activation(true);
         return true;
@@ -189,10 +190,23 @@ bool EventLoop::HandleWindowEvent(InputEvent const &event) {
     }
 }
 
+void EventLoop::NoteActivation(InputEvent const &event) {
+    bool const byShowing = event.window == shownWindow && event.time - shownAt < kActivatingShowWindow;
+    shownWindow = nullptr;
+    activatedWindow = byShowing ? nullptr : event.window;
+    activatedAt = event.time;
+}
+
+void EventLoop::WindowShown(PlatformWindow *window) {
+    shownWindow = window;
+    shownAt = windows.Now();
+}
+
 void EventLoop::HandlePress(Glog &glog, InputEvent const &event) {
     helpTags->Hide();
-    glog.SetActivatedByMouseDown(event.window == activatedWindow &&
-                                 event.time - activatedAt < kActivatingPressWindow);
+    // A window manager may give the activation before the press or after it.
+    glog.SetActivatedByMouseDown(!glog.IsActive() || (event.window == activatedWindow &&
+                                                      event.time - activatedAt < kActivatingPressWindow));
     activatedAt = -1000;
     lastPressClicks = event.clicks;
     if (event.button == 1) {
@@ -240,6 +254,8 @@ void EventLoop::WindowGone(PlatformWindow *window) {
     deferred.erase(std::remove_if(deferred.begin(), deferred.end(), isGone), deferred.end());
     if (activatedWindow == window)
         activatedWindow = nullptr;
+    if (shownWindow == window)
+        shownWindow = nullptr;
 }
 
 PlatformWindow *EventLoop::WindowOf(DrawingPort &port) const {

@@ -45,6 +45,7 @@ public:
 
     double LastEventTime() const;
     bool LastPressWasDouble() const { return lastPressClicks == 2; }
+    void WindowShown(PlatformWindow *); // is about to be, which will activate it
     void WindowHidden(PlatformWindow *);
     void WindowGone(PlatformWindow *);
 
@@ -62,6 +63,7 @@ private:
     void Sort(InputEvent const &);
     bool HandleWindowEvent(InputEvent const &);
     void Handle(InputEvent const &);
+    void NoteActivation(InputEvent const &);
     void HandlePress(Glog &, InputEvent const &);
     void TakeDeferredDrag();
     void ReleasePointer();
@@ -75,7 +77,9 @@ private:
     PlatformWindow *heldWindow = nullptr;
     Point lastPoint{0, 0};
     double activatedAt = -1000;
-    PlatformWindow *activatedWindow = nullptr;
+    PlatformWindow *activatedWindow = nullptr; // at that time; null when it was shown then
+    PlatformWindow *shownWindow = nullptr;     // and has not been activated since
+    double shownAt = 0;
     int lastPressClicks = 0;
     bool quitting = false;
     int status = 0;

@@ -8,10 +8,11 @@ double const kSecondsPerTick = 1.0 / 60.0; // an interval counts ticks
 }
 
 void IdleChores::Assign(CIdleChore *chore, double now) {
-    Cancel(chore);
+    if (Find(chore))
+        return;
     double const interval = chore->interval > 0 ? static_cast<double>(chore->interval) * kSecondsPerTick : 0;
     bool const waits = chore->useInitialDelay == CIdleChore::kInitialDelay;
-    entries.push_back({chore, interval, waits ? now + interval : now, false});
+    entries.push_back({chore, interval, waits ? now + interval : now, round, false, false});
 }
 
 void IdleChores::Cancel(CIdleChore *chore) {
@@ -21,16 +22,12 @@ void IdleChores::Cancel(CIdleChore *chore) {
 }
 
 void IdleChores::Run(double now) {
-    std::vector<CIdleChore *> due;
-    for (Entry &entry : entries) {
-        if (entry.running || entry.due > now)
-            continue;
-        due.push_back(entry.chore);
-        entry.due = now + entry.interval;
-    }
-    for (CIdleChore *chore : due) {
-        if (!Find(chore))
-            continue;
+    // A chore may wait, and so have chores run meanwhile: those are not due any more.
+    unsigned long const thisRound = ++round;
+    while (Entry *const entry = NextDue(now, thisRound)) {
+        entry->round = round;
+        entry->due = now + entry->interval;
+        entry->hasRun = true;
         // A chore that waits in its DoIdle is not run again meanwhile; it may also go, or be assigned anew.
         struct Running {
             Running(IdleChores &chores_, CIdleChore *chore_)
@@ -40,14 +37,22 @@ void IdleChores::Run(double now) {
             }
             ~Running() { Set(false); }
             void Set(bool on) {
-                if (Entry *entry = chores.Find(chore))
-                    entry->running = on;
+                if (Entry *running = chores.Find(chore))
+                    running->running = on;
             }
             IdleChores &chores;
             CIdleChore *chore;
-        } const running(*this, chore);
-        chore->DoIdle();
+        } const running(*this, entry->chore);
+        entry->chore->DoIdle();
     }
+}
+
+// Those that were assigned or have run since the round began have to wait for the next.
+IdleChores::Entry *IdleChores::NextDue(double now, unsigned long thisRound) {
+    for (Entry &entry : entries)
+        if (!entry.running && entry.due <= now && entry.round < thisRound)
+            return &entry;
+    return nullptr;
 }
 
 IdleChores::Entry *IdleChores::Find(CIdleChore *chore) {
@@ -60,7 +65,8 @@ IdleChores::Entry *IdleChores::Find(CIdleChore *chore) {
 double IdleChores::UntilNext(double now) const {
     double next = -1;
     for (Entry const &entry : entries) {
-        if (entry.interval <= 0 || entry.running)
+        // What has no interval wakes nobody, but does not wait for its first turn either.
+        if (entry.running || (entry.interval <= 0 && entry.hasRun))
             continue;
         double const wait = std::max(0.0, entry.due - now);
         next = next < 0 ? wait : std::min(next, wait);

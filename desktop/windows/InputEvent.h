@@ -33,7 +33,7 @@ struct InputEvent {
     double time = 0; // seconds on the window system's clock
     int h = 0, v = 0;
     int button = 0;                // 1 primary, 2 secondary, 3 middle
-    int clicks = 0;                // 1 single, 2 double
+    int clicks = 0;                // as ClickCounter counts: 1 single, 2 double
     unsigned short modifiers = 0;  // as in EventRecordAdapter
     double wheelH = 0, wheelV = 0; // notches; positive toward the left and the top
     int key = KeyCodes::kNone;

@@ -2,3 +2,5 @@
 
 bool PlatformConventions::scrollArrowsTogetherAtEnd = false;
 bool PlatformConventions::showsGrowBoxes = true;
+double PlatformConventions::doubleClickSeconds = 0.5;
+int PlatformConventions::doubleClickDistance = 4;

@@ -1,10 +1,7 @@
 #include "desktop/windows/SdlPointer.h"
 #include "desktop/windows/SdlWindow.h"
 #include <SDL.h>
-#include <cstdlib>
 
-// Two quick clicks on small controls side by side are not a double-click on the second.
-static int const kClickRadius = 4; // logical pixels
 static int const kNoButton = 0, kFirstButton = 1, kLastButton = 3;
 
 static int ButtonOf(int sdlButton) {
@@ -42,11 +39,15 @@ void SdlPointer::SetScreenPlace(SdlWindow *window, int x, int y) {
     screenY = window->ScreenY() + y;
 }
 
-void SdlPointer::Send(InputEvent &event, InputEvent::Kind kind, SdlWindow *window) {
-    event.kind = kind;
+void SdlPointer::Place(InputEvent &event, SdlWindow *window) const {
     event.window = window;
     event.h = window->ContentH(screenX);
     event.v = window->ContentV(screenY);
+}
+
+void SdlPointer::Send(InputEvent &event, InputEvent::Kind kind, SdlWindow *window) {
+    event.kind = kind;
+    Place(event, window);
     queue.Push(event);
 }
 
@@ -72,24 +73,6 @@ void SdlPointer::Move(InputEvent event, SdlWindow *window, SDL_MouseMotionEvent 
     Send(event, InputEvent::kMouseMove, target);
 }
 
-bool SdlPointer::IsWhereLastClicked(SdlWindow *window) const {
-    return window == clickWindow && std::abs(window->ContentH(screenX) - clickH) <= kClickRadius &&
-           std::abs(window->ContentV(screenY) - clickV) <= kClickRadius;
-}
-
-// SDL counts the clicks that follow each other quickly, far apart and in any window. Those elsewhere do not
-// count.
-int SdlPointer::CountClicks(SdlWindow *window, int sdlClicks) {
-    if (sdlClicks <= clickBase)
-        clickBase = 0;
-    if (!IsWhereLastClicked(window))
-        clickBase = sdlClicks - 1;
-    clickWindow = window;
-    clickH = window->ContentH(screenX);
-    clickV = window->ContentV(screenY);
-    return sdlClicks - clickBase;
-}
-
 void SdlPointer::Press(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent const &press) {
     int button = ButtonOf(press.button);
     SdlWindow *target = Target(window);
@@ -103,9 +86,9 @@ void SdlPointer::Press(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent
     // Of a quick click SDL has taken the release together with the press: nothing is left to be captured.
     if (first && SDL_GetMouseState(nullptr, nullptr) != 0)
         HoldCapture();
-    clicks = CountClicks(target, press.clicks);
     event.button = button;
-    event.clicks = clicks;
+    Place(event, target);
+    event.clicks = clicks = clickCounter.Count(event);
     Send(event, InputEvent::kMouseDown, target);
 }
 
@@ -192,8 +175,7 @@ void SdlPointer::CaptureFor(SdlWindow *window) {
 void SdlPointer::Forget(SdlWindow const *window) {
     if (hover == window)
         hover = nullptr;
-    if (clickWindow == window)
-        clickWindow = nullptr;
+    clickCounter.Forget(window);
     if (pressWindow == window) {
         pressWindow = nullptr;
         held = 0;

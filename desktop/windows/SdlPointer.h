@@ -1,5 +1,6 @@
 // The mouse of an X server.
 #pragma once
+#include "desktop/windows/ClickCounter.h"
 #include "desktop/windows/InputQueue.h"
 #include "desktop/windows/SdlCapture.h"
 #include <vector>
@@ -39,11 +40,10 @@ public:
 private:
     SdlWindow *Target(SdlWindow *) const;
     void SetScreenPlace(SdlWindow *, int x, int y);
+    void Place(InputEvent &, SdlWindow *) const;
     void Send(InputEvent &, InputEvent::Kind, SdlWindow *);
     void Enter(InputEvent, SdlWindow *);
     void LeaveIfOutside(InputEvent);
-    int CountClicks(SdlWindow *, int sdlClicks);
-    bool IsWhereLastClicked(SdlWindow *) const;
     void ReleaseButton(InputEvent, int button);
     void CaptureFor(SdlWindow *);
     void HoldCapture();
@@ -56,7 +56,6 @@ private:
     SdlWindow *hover = nullptr;       // has been told of the pointer and not that it left
     unsigned int held = 0;            // bit n: button n
     int screenX = 0, screenY = 0;     // device pixels
-    SdlWindow *clickWindow = nullptr; // of the last press
-    int clickH = 0, clickV = 0;       // where that was, in its logical pixels
-    int clickBase = 0, clicks = 0;    // SDL's count before the first click there, and our count
+    ClickCounter clickCounter;
+    int clicks = 0; // of the last press
 };

@@ -6,6 +6,7 @@
 namespace {
 Rect const kScreen{0, 0, 1200, 1920};
 Point const kFirstPlace{80, 100}; // of windows that name no place
+int const kAsCounted = 0;
 } // namespace
 
 SimulatedWindowSystem::SimulatedWindowSystem(double scale_)
@@ -50,6 +51,7 @@ void SimulatedWindowSystem::WindowHidden(SimulatedWindow *window) {
 
 void SimulatedWindowSystem::WindowGone(SimulatedWindow *window) {
     all.erase(std::remove(all.begin(), all.end(), window), all.end());
+    clickCounter.Forget(window);
     if (std::find(windows.begin(), windows.end(), window) != windows.end())
         WindowHidden(window);
 }
@@ -148,6 +150,16 @@ void SimulatedWindowSystem::PushButton(InputEvent::Kind kind, int button, int cl
     Push(event, step);
 }
 
+// Presses count as a user's would. A click is what the script calls it, however quickly it follows another.
+void SimulatedWindowSystem::PushPress(int button, int clicks, ScriptStep const &step) {
+    PushButton(InputEvent::kMouseDown, button, clicks, step);
+    InputEvent &press = queue.back();
+    if (clicks == kAsCounted)
+        press.clicks = clickCounter.Count(press);
+    else
+        clickCounter.Take(press, clicks);
+}
+
 void SimulatedWindowSystem::PushKey(int key, std::string const &text, ScriptStep const &step) {
     InputEvent event;
     event.kind = InputEvent::kKeyDown;
@@ -190,7 +202,7 @@ void SimulatedWindowSystem::Perform(ScriptStep const &step) {
     }
     switch (step.kind) {
     case ScriptStep::kPress:
-        PushButton(InputEvent::kMouseDown, 1, 1, step);
+        PushPress(1, kAsCounted, step);
         break;
     case ScriptStep::kMove:
         PushButton(InputEvent::kMouseMove, 0, 0, step);
@@ -199,17 +211,17 @@ void SimulatedWindowSystem::Perform(ScriptStep const &step) {
         PushButton(InputEvent::kMouseUp, 1, 1, step);
         break;
     case ScriptStep::kDoubleClick:
-        PushButton(InputEvent::kMouseDown, 1, 1, step);
+        PushPress(1, 1, step);
         PushButton(InputEvent::kMouseUp, 1, 1, step);
-        PushButton(InputEvent::kMouseDown, 1, 2, step);
+        PushPress(1, 2, step);
         PushButton(InputEvent::kMouseUp, 1, 2, step);
         break;
     case ScriptStep::kClick:
-        PushButton(InputEvent::kMouseDown, 1, 1, step);
+        PushPress(1, 1, step);
         PushButton(InputEvent::kMouseUp, 1, 1, step);
         break;
     case ScriptStep::kRightClick:
-        PushButton(InputEvent::kMouseDown, 2, 1, step);
+        PushPress(2, 1, step);
         PushButton(InputEvent::kMouseUp, 2, 1, step);
         break;
     case ScriptStep::kWheel: {

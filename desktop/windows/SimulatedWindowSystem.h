@@ -1,5 +1,6 @@
 // Windows without a display, time without a clock.
 #pragma once
+#include "desktop/windows/ClickCounter.h"
 #include "desktop/windows/EventScript.h"
 #include "desktop/windows/InputState.h"
 #include "desktop/windows/SimulatedWindow.h"
@@ -52,6 +53,7 @@ private:
     void Perform(ScriptStep const &);
     void Push(InputEvent, ScriptStep const &);
     void PushButton(InputEvent::Kind, int button, int clicks, ScriptStep const &);
+    void PushPress(int button, int clicks, ScriptStep const &);
     void PushKey(int key, std::string const &text, ScriptStep const &);
     void Type(ScriptStep const &);
     void Activate(SimulatedWindow *, bool on);
@@ -63,6 +65,7 @@ private:
     bool stepTimed = false;
     std::deque<InputEvent> queue;
     InputState state;
+    ClickCounter clickCounter;
     std::vector<SimulatedWindow *> all;     // hidden ones too
     std::vector<SimulatedWindow *> windows; // the shown ones
     SimulatedWindow *active = nullptr;
