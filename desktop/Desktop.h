@@ -103,8 +103,8 @@ public:
     void WatchDrawing(LineSink);
     std::string DumpTree(glogRec *) const; // JSON: every pane with class, id, box and state
 
-    // Writes what the glog's window shows, in device pixels; throws std::runtime_error when the file cannot
-    // be written.
+    // Writes what the glog's window shows, with a menu that is open over it, in device pixels; throws
+    // std::runtime_error when the file cannot be written.
     void Snapshot(glogRec *, std::string const &pngPath);
 
     // Prints all that the glog's visible panes have to print into one PDF file; the number of pages. 0: there

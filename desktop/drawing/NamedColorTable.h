@@ -6,5 +6,5 @@ struct NamedColorEntry {
     char const *name;
     RGBColor *color;
 };
-constexpr int kNamedColorCount = 22;
+constexpr int kNamedColorCount = 36;
 extern NamedColorEntry const kNamedColorTable[kNamedColorCount];

@@ -38,6 +38,20 @@ RGBColor kTooltipBackgroundColor = Rgb(0x2B2E34);
 RGBColor kTooltipTextColor = Rgb(0xF5F6F8);
 RGBColor kTooltipBorderColor = Rgb(0x17191C);
 RGBColor kFocusRingColor = Rgb(0x4D8EF0);
+RGBColor kMenuBackgroundColor = Rgb(0xFBFCFD);
+RGBColor kMenuBorderColor = Rgb(0xA9B0BB);
+RGBColor kMenuTextColor = Rgb(0x1D1F23);
+RGBColor kMenuInactiveTextColor = Rgb(0x757B86);
+RGBColor kMenuHiliteColor = Rgb(0x2A6BDB);
+RGBColor kMenuHiliteTextColor = Rgb(0xFFFFFF);
+RGBColor kMenuSeparatorColor = Rgb(0xDDE1E6);
+RGBColor kPopupFaceTopColor = Rgb(0xFFFFFF);
+RGBColor kPopupFaceBottomColor = Rgb(0xF1F3F5);
+RGBColor kPopupBorderTopColor = Rgb(0xC2C8D0);
+RGBColor kPopupBorderBottomColor = Rgb(0xA4ACB8);
+RGBColor kPopupInactiveFaceColor = Rgb(0xEEF0F2);
+RGBColor kPopupInactiveBorderColor = Rgb(0xC9CED5);
+RGBColor kPopupLightColor = Rgb(0xFFFFFF);
 } // namespace ThemeColors
 
 NamedColorEntry const kNamedColorTable[kNamedColorCount] = {
@@ -63,4 +77,18 @@ NamedColorEntry const kNamedColorTable[kNamedColorCount] = {
     {"kTooltipTextColor", &ThemeColors::kTooltipTextColor},
     {"kTooltipBorderColor", &ThemeColors::kTooltipBorderColor},
     {"kFocusRingColor", &ThemeColors::kFocusRingColor},
+    {"kMenuBackgroundColor", &ThemeColors::kMenuBackgroundColor},
+    {"kMenuBorderColor", &ThemeColors::kMenuBorderColor},
+    {"kMenuTextColor", &ThemeColors::kMenuTextColor},
+    {"kMenuInactiveTextColor", &ThemeColors::kMenuInactiveTextColor},
+    {"kMenuHiliteColor", &ThemeColors::kMenuHiliteColor},
+    {"kMenuHiliteTextColor", &ThemeColors::kMenuHiliteTextColor},
+    {"kMenuSeparatorColor", &ThemeColors::kMenuSeparatorColor},
+    {"kPopupFaceTopColor", &ThemeColors::kPopupFaceTopColor},
+    {"kPopupFaceBottomColor", &ThemeColors::kPopupFaceBottomColor},
+    {"kPopupBorderTopColor", &ThemeColors::kPopupBorderTopColor},
+    {"kPopupBorderBottomColor", &ThemeColors::kPopupBorderBottomColor},
+    {"kPopupInactiveFaceColor", &ThemeColors::kPopupInactiveFaceColor},
+    {"kPopupInactiveBorderColor", &ThemeColors::kPopupInactiveBorderColor},
+    {"kPopupLightColor", &ThemeColors::kPopupLightColor},
 };

@@ -13,7 +13,21 @@ extern RGBColor kSystemHiliteColor; // what is selected in a text or list
 extern RGBColor kTooltipBackgroundColor;
 extern RGBColor kTooltipTextColor;
 extern RGBColor kTooltipBorderColor;
-extern RGBColor kFocusRingColor; // round the pane that has the keyboard
+extern RGBColor kFocusRingColor;           // round the pane that has the keyboard
+extern RGBColor kMenuBackgroundColor;      // the ground of an open menu
+extern RGBColor kMenuBorderColor;          // its edge
+extern RGBColor kMenuTextColor;            // its items
+extern RGBColor kMenuInactiveTextColor;    // those that cannot be chosen
+extern RGBColor kMenuHiliteColor;          // behind the item under the mouse
+extern RGBColor kMenuHiliteTextColor;      // that item
+extern RGBColor kMenuSeparatorColor;       // between groups of items
+extern RGBColor kPopupFaceTopColor;        // the face of a closed pop-up, from its top
+extern RGBColor kPopupFaceBottomColor;     // to its bottom
+extern RGBColor kPopupBorderTopColor;      // its edge, from the top
+extern RGBColor kPopupBorderBottomColor;   // to the bottom
+extern RGBColor kPopupInactiveFaceColor;   // the face of a disabled one
+extern RGBColor kPopupInactiveBorderColor; // its edge
+extern RGBColor kPopupLightColor;          // the light along the upper edge of the face
 
 // Whether the theme is a dark one: its kWindowBackgroundColor is darker than a middle gray.
 bool IsDark();

@@ -1,7 +1,9 @@
 #include "desktop/panes/Glog.h"
+#include "desktop/drawing/PixelOverlay.h"
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/ThemeColors.h"
 #include "desktop/layout/LayoutEngine.h"
+#include "desktop/menus/MenuTracker.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/HostCall.h"
 #include "desktop/panes/PaneAccess.h"
@@ -338,6 +340,7 @@ void Glog::DrawDamage(OSRgn const &region) {
 void Glog::Present(std::vector<DeviceRect> const &rects) {
     auto const present = [&] {
         WithOutline const outlined(*surface, scale, outline);
+        WithOverlays const menus(*surface, MenuTracker::DrawnOver(*this));
         return window->Present(*surface, rects.data(), rects.size());
     };
     if (present())
@@ -351,6 +354,11 @@ void Glog::PresentAll() {
         Present({{0, 0, surface->Width(), surface->Height()}});
 }
 
+void Glog::PresentPart(Rect const &part) {
+    if (shown && surface)
+        Present({scale.ToDevice(part.left, part.top, part.right, part.bottom)});
+}
+
 bool Glog::WritePng(std::string const &path, std::string &error) {
     if (!surface) {
         error = "its window has not been shown";
@@ -358,6 +366,7 @@ bool Glog::WritePng(std::string const &path, std::string &error) {
     }
     Update();
     WithOutline const outlined(*surface, scale, outline);
+    WithOverlays const menus(*surface, MenuTracker::OpenOver(*this));
     return surface->WritePng(path, error);
 }
 

@@ -72,6 +72,7 @@ public:
         return updateRegion;
     } // in window coordinates; null outside an update
     void PresentAll();
+    void PresentPart(Rect const &); // window coordinates
     // What lies over everything else; a change shows at the next update.
     OutlineLayer &OutlineShown() { return outline; }
     // Writes what the window shows; false, with the reason in `error`, when that is impossible.

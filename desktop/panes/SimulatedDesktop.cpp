@@ -1,4 +1,5 @@
 #include "desktop/SimulatedDesktop.h"
+#include "desktop/menus/MenuTracker.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/windows/SimulatedWindowSystem.h"
@@ -29,6 +30,15 @@ template <class Action> void Reported(ScriptStep const &step, Action action) {
     }
 }
 
+void AnswerMenu(ScriptStep const &step) {
+    MenuTracker *const menu = MenuTracker::Open();
+    if (!menu)
+        throw ScriptError(step.source + ": no menu is open that could be answered");
+    std::string reason;
+    if (!menu->Answer(step.path, reason))
+        throw ScriptError(step.source + ": " + reason);
+}
+
 void CarryOut(Desktop &desktop, ScriptStep const &step, PlatformWindow *window) {
     glogRec *const glog = DesktopRep::Of(desktop).GlogOf(window);
     if (!glog)
@@ -41,7 +51,8 @@ void CarryOut(Desktop &desktop, ScriptStep const &step, PlatformWindow *window) 
         WriteDump(desktop, glog, step);
         break;
     case ScriptStep::kMenu:
-        throw ScriptError(step.source + ": no menu is open that could be answered");
+        AnswerMenu(step);
+        break;
     case ScriptStep::kPrint:
         Reported(step, [&] {
             if (desktop.Print(glog, step.text) == 0)

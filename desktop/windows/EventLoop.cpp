@@ -58,15 +58,21 @@ bool EventLoop::MainLoopIsOver(double deadline) const {
     return quitting || !DesktopRep::Of(desktop).AnyVisible() || (deadline < 0 && windows.AtEnd());
 }
 
-bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter waiter, char const *what) {
+bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter waiter, char const *what,
+                     PlatformWindow *const *needed) {
     for (;;) {
         RunIdleWork();
+        if (needed && !*needed)
+            return false;
         if (waiter == WindowSystem::Waiter::kMainLoop && MainLoopIsOver(deadline))
             return false;
         double const now = windows.Now();
         double limit = deadline < 0 ? -1 : std::max(0.0, deadline - now);
+        // Where nobody is left who could answer, chores that come again and again must not keep a dialog or
+        // menu waiting for ever.
+        bool const nobodyAnswers = waiter == WindowSystem::Waiter::kModal && deadline < 0 && windows.AtEnd();
         for (double next : {chores.UntilNext(now), helpTags->UntilNext(now)})
-            if (next >= 0 && (limit < 0 || next < limit))
+            if (next >= 0 && (limit < 0 || next < limit) && !nobodyAnswers)
                 limit = next;
         if (windows.WaitEvent(event, limit, waiter, what))
             return true;
@@ -241,6 +247,8 @@ void EventLoop::WindowHidden(PlatformWindow *window) {
         return;
     auto isHidden = [=](InputEvent const &event) { return event.window == window; };
     pointer.erase(std::remove_if(pointer.begin(), pointer.end(), isHidden), pointer.end());
+    if (menuWindow == window)
+        menuWindow = nullptr;
     if (heldWindow == window)
         ReleasePointer(); // which ends the drag
     helpTags->OwnerGone(window);
@@ -343,6 +351,38 @@ bool EventLoop::ButtonStillDown() {
            Take(event, windows.Now(), WindowSystem::Waiter::kTracking, "the state of the mouse button"))
         Sort(event);
     return heldWindow && !released();
+}
+
+void EventLoop::BeginMenu(PlatformWindow *window) {
+    menuWindow = window;
+    helpTags->Hide();
+    windows.CaptureMouse(window);
+}
+
+// The release that is still to come is the window's whose press it ends.
+void EventLoop::EndMenu() {
+    menuWindow = nullptr;
+    if (!heldWindow)
+        windows.CaptureMouse(nullptr);
+}
+
+bool EventLoop::NextMenuEvent(double deadline, InputEvent &event) {
+    if (MenuIsOver())
+        return false;
+    if (!pointer.empty()) {
+        event = pointer.front();
+        pointer.pop_front();
+    } else if (!Take(event, deadline, WindowSystem::Waiter::kModal, "an open menu", &menuWindow)) {
+        return false;
+    } else {
+        PortKeeper const keeper;
+        HandleWindowEvent(event);
+    }
+    if (event.kind == InputEvent::kCloseRequested || event.kind == InputEvent::kQuit)
+        deferred.push_back(event);
+    if (IsRelease(event))
+        heldWindow = nullptr; // the capture stays the menu's
+    return true;
 }
 
 void EventLoop::Pause(double seconds) {

@@ -40,6 +40,16 @@ public:
     bool ButtonStillDown();
     PlatformWindow *WindowOf(DrawingPort &) const; // null for a port without window
 
+    // An open menu takes all input, of every window, until EndMenu. The mouse is captured for the window that
+    // it belongs to.
+    void BeginMenu(PlatformWindow *);
+    // The next event of mouse, keyboard or windows; what it means to the window itself has been done. False
+    // when the deadline has passed (negative: none), or the menu is over.
+    bool NextMenuEvent(double deadline, InputEvent &);
+    // Its window has gone, or the loop was told to quit.
+    bool MenuIsOver() const { return quitting || !menuWindow; }
+    void EndMenu();
+
     void Pause(double seconds);
     void PauseUntilKeyUp(int key);
 
@@ -56,8 +66,10 @@ public:
 private:
     void RunIdleWork();
     bool MainLoopIsOver(double deadline) const;
-    // Takes one event, or none when the time is over. Draws what is damaged before it blocks.
-    bool Take(InputEvent &, double deadline, WindowSystem::Waiter, char const *what);
+    // Takes one event, or none when the time is over, or `needed` has become null. Draws what is damaged
+    // before it blocks.
+    bool Take(InputEvent &, double deadline, WindowSystem::Waiter, char const *what,
+              PlatformWindow *const *needed = nullptr);
     // In a nested loop: window events are handled, pointer events go to `pointer`, everything else waits for
     // the main loop.
     void Sort(InputEvent const &);
@@ -75,6 +87,7 @@ private:
     std::deque<InputEvent> deferred; // for the main loop
     std::deque<InputEvent> pointer;  // for tracking
     PlatformWindow *heldWindow = nullptr;
+    PlatformWindow *menuWindow = nullptr; // that the open menu belongs to
     Point lastPoint{0, 0};
     double activatedAt = -1000;
     PlatformWindow *activatedWindow = nullptr; // at that time; null when it was shown then

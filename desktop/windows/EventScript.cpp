@@ -9,6 +9,8 @@ namespace {
 int const kFarthest = 32000; // pixels
 double const kMostNotches = 1000;
 double const kLongestWait = 86400; // a day
+long const kLastMenuItem = 32767;
+std::size_t const kDeepestMenu = 64; // menus within each other
 
 struct NamedKey {
     char const *name;
@@ -108,17 +110,22 @@ public:
 
     void MenuItem(ScriptStep &step) {
         std::string const word = Word("an item number");
-        char *end = nullptr;
-        long const first = std::strtol(word.c_str(), &end, 10);
-        long second = 0;
-        bool const sub = *end == '/';
-        if (sub)
-            second = std::strtol(end + 1, &end, 10);
-        bool const empty = end == word.c_str() || (sub && word.back() == '/');
-        if (empty || *end != '\0' || first < 0 || first > 32767 || second < 0 || second > 32767)
-            Fail("expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"" + word + "\"");
-        step.menu = sub ? static_cast<int>(first) : 0;
-        step.item = static_cast<int>(sub ? second : first);
+        char const *at = word.c_str();
+        for (;;) {
+            char *end = nullptr;
+            long const number = *at >= '0' && *at <= '9' ? std::strtol(at, &end, 10) : -1;
+            bool const dismisses = number == 0 && step.path.empty() && *end == '\0';
+            if (!dismisses && (number < 1 || number > kLastMenuItem))
+                break;
+            step.path.push_back(static_cast<int>(number));
+            if (*end == '\0')
+                return;
+            if (*end != '/' || step.path.size() == kDeepestMenu)
+                break;
+            at = end + 1;
+        }
+        Fail("expected an item number such as 3, or 4/2 for item 2 of the submenu of item 4, found \"" +
+             word + "\"");
     }
 
 private:

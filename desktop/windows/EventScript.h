@@ -31,9 +31,9 @@ struct ScriptStep {
     int key = 0;
     double seconds = 0;
     bool on = true;
-    int menu = 0, item = 0; // `item` 0: dismissed; `menu` 0: the menu itself
-    std::string text;       // typed, or a file's path
-    std::string source;     // "name:line" for messages
+    std::vector<int> path; // of kMenu: item numbers, each but the last of a submenu; a single 0 dismisses
+    std::string text;      // typed, or a file's path
+    std::string source;    // "name:line" for messages
 };
 
 namespace EventScript {

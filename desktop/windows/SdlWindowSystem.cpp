@@ -4,6 +4,7 @@
 #include <SDL.h>
 #include <algorithm>
 #include <cmath>
+#include <cstring>
 
 static double const kMillisecondsPerSecond = 1000.0;
 static double const kLongestBlock = 3600.0;     // seconds; SDL counts milliseconds in 32 bits
@@ -46,6 +47,11 @@ std::unique_ptr<PlatformWindow> SdlWindowSystem::CreateWindow(WindowSpec const &
     SdlWindow *neighbour = spec.owner != nullptr ? static_cast<SdlWindow *>(spec.owner) : MainWindow();
     double scale = ScaleOf(neighbour != nullptr ? neighbour->Display() : 0);
     return std::make_unique<SdlWindow>(*this, spec, DeviceScale(scale));
+}
+
+bool SdlWindowSystem::PlacesPopups() const {
+    char const *const driver = SDL_GetCurrentVideoDriver();
+    return driver != nullptr && std::strcmp(driver, "x11") == 0;
 }
 
 void SdlWindowSystem::Add(SdlWindow *window) { windows.push_back(window); }

@@ -30,6 +30,8 @@ public:
     // WindowSystem
     char const *Name() const override { return "SDL"; }
     std::unique_ptr<PlatformWindow> CreateWindow(WindowSpec const &) override;
+    // Only X servers let a program say where its windows come.
+    bool PlacesPopups() const override;
     bool WaitEvent(InputEvent &, double timeout, Waiter, char const *what) override;
     double Now() const override;
     bool IsMouseDown() const override { return state.IsMouseDown(); }

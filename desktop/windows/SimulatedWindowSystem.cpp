@@ -262,6 +262,10 @@ void SimulatedWindowSystem::Perform(ScriptStep const &step) {
         Activate(Target(), step.on);
         break;
     case ScriptStep::kMenu:
+        if (commandHandler)
+            commandHandler(step, Target());
+        Push(InputEvent(), step); // the open menu looks up
+        break;
     case ScriptStep::kPrint:
     case ScriptStep::kSnapshot:
     case ScriptStep::kDump:

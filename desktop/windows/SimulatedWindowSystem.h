@@ -25,6 +25,8 @@ public:
 
     char const *Name() const override { return "simulated"; }
     std::unique_ptr<PlatformWindow> CreateWindow(WindowSpec const &) override;
+    bool PlacesPopups() const override { return placesPopups; }
+    void SetPlacesPopups(bool on) { placesPopups = on; } // at first it does
     bool WaitEvent(InputEvent &, double timeout, Waiter, char const *what) override;
     bool AtEnd() const override { return steps.empty() && queue.empty(); }
     double Now() const override { return now; }
@@ -63,6 +65,7 @@ private:
     std::deque<ScriptStep> steps;
     double nextStepAt = 0; // when the step at the front is due
     bool stepTimed = false;
+    bool placesPopups = true;
     std::deque<InputEvent> queue;
     InputState state;
     ClickCounter clickCounter;

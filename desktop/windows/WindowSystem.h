@@ -14,6 +14,8 @@ public:
 
     virtual std::unique_ptr<PlatformWindow>
     CreateWindow(WindowSpec const &) = 0; // throws std::runtime_error with the reason
+    // Whether pop-up windows come where they are asked for; without, menus are drawn over their windows.
+    virtual bool PlacesPopups() const { return true; }
 
     // Who waits, for the message of a wait that nothing can end, and what may end it.
     enum class Waiter {

@@ -54,11 +54,17 @@ TEST(EventScript, TextsMayHoldSpacesEscapesAndAnyCharacter) {
     EXPECT_EQ(One("type \"héllo # w\\\"x\\\\\"").text, "héllo # w\"x\\");
 }
 
-TEST(EventScript, MenusNameAnItemOrAnItemOfASubmenu) {
-    EXPECT_EQ(One("menu 0").item, 0);
-    ScriptStep const sub = One("menu 4/2");
-    EXPECT_EQ(sub.menu, 4);
-    EXPECT_EQ(sub.item, 2);
+TEST(EventScript, MenusNameAnItemOrTheWayToAnItemOfASubmenu) {
+    EXPECT_EQ(One("menu 0").path, std::vector<int>{0});
+    EXPECT_EQ(One("menu 3").path, std::vector<int>{3});
+    EXPECT_EQ(One("menu 4/2").path, (std::vector<int>{4, 2}));
+    EXPECT_EQ(One("menu 4/2/32767").path, (std::vector<int>{4, 2, 32767}));
+}
+
+TEST(EventScript, MenusNameNoItemZeroOfASubmenuAndNoneBeyondThoseThatThereCanBe) {
+    for (char const *step : {"menu 4/0", "menu 0/4", "menu 4/", "menu /4", "menu -1", "menu 32768", "menu x",
+                             "menu 1x", "menu 4//2", "menu +3", "menu"})
+        EXPECT_THROW(One(step), ScriptError) << step;
 }
 
 TEST(EventScript, KeysHaveNamesOrAreTheCharacterThatTheyType) {
@@ -89,10 +95,10 @@ TEST(EventScript, ErrorsNameTheLineAndWhatWasExpected) {
     EXPECT_EQ(ErrorOf("wait 1 2"), "demo:1: there is more on the line than \"wait\" takes");
     EXPECT_EQ(ErrorOf("resize 0 10"), "demo:1: expected a width of 1 to 16000, found \"0\"");
     EXPECT_EQ(ErrorOf("activate maybe"), "demo:1: expected on or off, found \"maybe\"");
-    EXPECT_EQ(ErrorOf("menu 4/"),
-              "demo:1: expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"4/\"");
-    EXPECT_EQ(ErrorOf("menu -1"),
-              "demo:1: expected an item number such as 3, or 4/2 for item 2 of submenu 4, found \"-1\"");
+    EXPECT_EQ(ErrorOf("menu 4/"), "demo:1: expected an item number such as 3, or 4/2 for item 2 of the "
+                                  "submenu of item 4, found \"4/\"");
+    EXPECT_EQ(ErrorOf("menu -1"), "demo:1: expected an item number such as 3, or 4/2 for item 2 of the "
+                                  "submenu of item 4, found \"-1\"");
 }
 
 TEST(EventScript, AWrongScriptAppendsNoneOfItsSteps) {
