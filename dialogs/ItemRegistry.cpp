@@ -12,6 +12,7 @@ ItemRegistry::ItemRegistry() {
     AddGroupItems(*this);
     AddScrollItems(*this);
     AddScrolledItems(*this);
+    AddMenuItems(*this);
 }
 
 ItemRegistry &ItemRegistry::Instance() {

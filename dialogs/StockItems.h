@@ -12,3 +12,4 @@ void AddLabelItems(ItemRegistry &);    // Label
 void AddGroupItems(ItemRegistry &);    // Group, Spacer
 void AddScrollItems(ItemRegistry &);   // ScrollBar, GrowBox
 void AddScrolledItems(ItemRegistry &); // ScrollPane, Grid, ScrollGrid
+void AddMenuItems(ItemRegistry &);     // PopUpMenu, ScrollBarPopUpMenu, DurationNote
