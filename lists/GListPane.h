@@ -34,8 +34,8 @@ class GListPane : public Provider<GListPane_SelectionListener>,
                   public ScrollBarClient,
                   public CIdleChore {
 public:
-    static int const kAnyColumn = 1000; // for SetSelColumn
-    static int const kWholeRow = 20000; // for DrawListLine
+    static constexpr int kAnyColumn = 1000; // for SetSelColumn
+    static constexpr int kWholeRow = 20000; // for DrawListLine
 
     // Make a list without rows and columns under the number 0 and attach it to the glog, which owns it from
     // then on; null when memory or glog is wanting. The record is copied. Keys are those of glistResRec; what
@@ -281,40 +281,57 @@ protected:
 
 private:
     class DragUpdater;
-    struct SelectionDrag;
-    friend struct GListMouseWheelHandler;
+    class SelectionDrag;
 
-    // Creation
+    enum { kAbove = -1, kBelow = -2 }; // what CheckHit writes for no row
+
+    // The bar of the record.
     ScrollBarPane *NamedScrollBar() const;
+    void FollowEdges();
 
     // Places
     bool IsDialogStyle() const { return res.style == glistResRec::kDialogStyle; }
     short Inset() const { return IsDialogStyle() ? 1 : 0; }
     int FreeHeight() const;
     int MaxTop();
+    int RowAt(int v, Rect const &box) const;
     bool HasRow(int line) const { return line >= 0 && line < numItems; }
     bool HasColumn(int column) const;
+    bool IsMapped(int physical) const;
+    bool Shows(int line) const;
     Rect InnerBox();
+    Rect CellIn(Rect const &rowBox, int column) const;
     void InvalBox(Rect const &);
+    void InvalLine(int line);
 
     // Drawing
-    bool ShowsAsSelected(int line);
-    bool IsMarked(int line) const;
-    Rect CellIn(Rect const &rowBox, int column) const;
+    bool LooksSelected(int line);
+    bool NarrowToColumn(int column, Rect &clip) const;
     void DrawGround(int firstFree);
     void DrawInnerShadow();
 
     // Selection
     bool HasFlags() const;
     bool MakeFlags(int count);
+    bool MakeFlag(int row);
+    bool ClearFlags();
+    void Unmark(int line);
     void TellSelected(int line, bool selected, bool tracking);
     void TellDone();
 
     // Mouse
     int ClickOutside(EventRecordAdapter const &, int line);
-    bool IsSecondClick(int line, int column);
     bool Selects(EventRecordAdapter *, int line, int column, bool isDouble) const;
     int SelectByClick(EventRecordAdapter const &, int line, int column);
+    bool ClearBefore(unsigned short modifiers);
+    static bool IsSecondClick(int line, int column);
+    bool DragRow(Point, Rect const &row, int &dropV);
+    int PlaceOfDrop(Point);
+    void MovePixels(int from, int to);
+    void InvalShadow();
+
+    // Printing
+    void ForgetSetup();
 
     static int lastClickLine, lastClickColumn; // of the click before this one, in any list
     static bool printing;

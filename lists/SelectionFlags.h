@@ -8,7 +8,7 @@
 // of some thousand rows, by which rows without a flag are passed over.
 class SelectionFlags {
 public:
-    static int const kNone = -1; // no such row
+    static constexpr int kNone = -1; // no such row
 
     int Count() const { return static_cast<int>(flags.size()); } // of rows
     bool Has(int row) const { return row >= 0 && row < Count(); }

@@ -7,6 +7,7 @@
 #include "host/UIEvent.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
+#include "scrolling/CurrentTick.h"
 #include "scrolling/ScrollBarClient.h"
 #include "scrolling/ScrollBarParts.h"
 #include "scrolling/Truncation.h"
@@ -19,11 +20,6 @@ namespace {
 
 short const kBreadthAtGlogEdge = 16; // pixels, whatever GetScrollBarWidth says
 int const kAtEnd = -1;
-double const kTicksPerSecond = 60.0;
-
-long long CurrentTick() {
-    return static_cast<long long>(TarnSystemTime::GetCurrentEventTime() * kTicksPerSecond + 0.5);
-}
 
 void SetAttribute(GlogLayoutItem &item, GlogLayoutItem::Attribute attribute, int value) {
     item.SetAttribute(attribute, value, GlogLayoutItem::kPixels, UString());
