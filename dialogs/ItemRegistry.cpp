@@ -13,6 +13,7 @@ ItemRegistry::ItemRegistry() {
     AddScrollItems(*this);
     AddScrolledItems(*this);
     AddMenuItems(*this);
+    AddSelectItems(*this);
 }
 
 ItemRegistry &ItemRegistry::Instance() {

@@ -13,3 +13,4 @@ void AddGroupItems(ItemRegistry &);    // Group, Spacer
 void AddScrollItems(ItemRegistry &);   // ScrollBar, GrowBox
 void AddScrolledItems(ItemRegistry &); // ScrollPane, Grid, ScrollGrid
 void AddMenuItems(ItemRegistry &);     // PopUpMenu, ScrollBarPopUpMenu, DurationNote
+void AddSelectItems(ItemRegistry &);   // Select, SelectString

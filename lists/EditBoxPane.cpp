@@ -1,0 +1,3 @@
+#include "lists/EditBoxPane.h"
+
+EditBoxPane::EditBoxPane() {}
