@@ -1,9 +1,13 @@
 #include "tools/gallery/GalleryItems.h"
 #include "buttons/GIconButton.h"
 #include "dialogs/ItemRegistry.h"
+#include "frame/ResourceReading.h"
+#include "host/GlogStyleSheet.h"
 #include "host/Icons.h"
+#include "menus/PopMPane.h"
 #include "tools/gallery/BackdropPane.h"
 #include "tools/gallery/ChoiceButtonPane.h"
+#include "tools/gallery/ColorMenuPane.h"
 #include "tools/gallery/HoldButtonPane.h"
 #include "tools/gallery/StepperPane.h"
 #include "tools/gallery/TrackListPane.h"
@@ -16,6 +20,7 @@ short const kRestBadge = 0, kPressedBadge = 1, kDisabledBadge = 2;
 short const kBadgeSide = 9; // pixels
 
 long long const kMostRows = 1000;
+long long const kMostMenuItems = 10000;
 
 // At the upper right corner of the pane, which is a little wider than its icon.
 void DrawBadge(glogRec *, Rect box, bool enabled, bool pressed, GIconPane *) {
@@ -32,6 +37,21 @@ ItemType BadgeButtonType() {
             icon->SetDecalProc(DrawBadge);
         return pane;
     });
+}
+
+// A pop-up menu of as many bars as the key "Num" says.
+GlogPane *MakeBarMenu(glogRec *glog, GlogStyleSheet *sheet) {
+    short const kEmptyMenu = 137;
+    Rect bounds = OptionalRect(sheet->GetItemRes(), "BoundsRect");
+    PopMPane *const pane = PopMPane::NewPopMPane(glog, 0, 0, &bounds, kEmptyMenu);
+    int const count = sheet->GetSInt32ItemValue(ResourceKey("Num"));
+    for (int bar = 1; pane && bar <= count; ++bar) {
+        UString name = ResourceKey("Bar "), number;
+        tarn::NumToUString(bar, tarn::kPlainNumber, number);
+        name += number;
+        pane->AddItem(name, PopUpMenu::kDashIsText);
+    }
+    return pane;
 }
 
 } // namespace
@@ -91,4 +111,13 @@ void GalleryItems::Add() {
                      })
                      .HoldsItems());
     registry.Add(BadgeButtonType());
+    registry.Add(
+        ItemType("BarMenu")
+            .Keys(KeyList().Rect("BoundsRect").Required().Integer("Num", 1, kMostMenuItems).Required())
+            .MadeBy(MakeBarMenu));
+    registry.Add(ItemType("ColorMenu")
+                     .Keys(KeyList().Rect("BoundsRect").Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return ColorMenuPane::NewColorMenuPane(glog, sheet);
+                     }));
 }
