@@ -24,7 +24,7 @@ long long const kLargest = KeyList::kLargest;
 long long const kLastPulldown = kPulldownNarrow;
 long long const kLargestFace = 255;
 long long const kLargestFlags = 255;
-int const kDeepest = 4; // menus within each other
+int const kDeepest = 3; // menus within each other
 
 char const kItemsKey[] = "MenuItems";
 char const kItemKey[] = "MenuItem";
