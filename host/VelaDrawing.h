@@ -127,8 +127,8 @@ void SetBackgroundColor(RGBColor const &);
 void SetBackgroundColor(OS::RGBAColor const &);
 
 // Makes the colour a gray: percent of white, 0 black to 100 white; values beyond are cut to these. In a dark
-// theme the scale runs the other way round, so that 0 is what can be read best in every theme. A foreground
-// of 50 or more also fades the icons that are drawn after it, until the next foreground colour.
+// theme the scale runs the other way round, except on printed pages, so that 0 is what can be read best. A
+// foreground of 50 or more also fades the icons that are drawn after it, until the next foreground colour.
 void GrayForeColor(short);
 void GrayBackColor(short);
 

@@ -58,6 +58,7 @@ public:
     // A page of paper instead of pixels: everything becomes shapes, text and images on it. What the surface
     // takes for a pixel must be one of the scale. Not owned; null, like another surface, ends it.
     void SetPage(cairo_surface_t *, DeviceScale);
+    bool IsPage() const { return page != nullptr; }
     DeviceScale Scale() const { return scale; }
     // The window's content in logical pixels, from (0, 0); cuts every clip and all damage. Boundary and clip
     // become all of it.

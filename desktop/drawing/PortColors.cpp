@@ -45,9 +45,11 @@ void SetBack(OS::RGBAColor const &color) {
 }
 
 // Panes choose grays for a light window: 0 for what must be read best, 100 for the paper. On a dark one the
-// scale runs the other way round, so that it stays so.
+// scale runs the other way round, so that it stays so; a page is white in every theme.
 OS::RGBAColor ThemeGray(int percent) {
-    return ToRGBA(GrayOf(ThemeColors::IsDark() ? kWhitePercent - percent : percent));
+    DrawingPort const *const port = DrawingPort::CurrentPort();
+    bool const isDark = ThemeColors::IsDark() && !(port && port->IsPage());
+    return ToRGBA(GrayOf(isDark ? kWhitePercent - percent : percent));
 }
 
 } // namespace
