@@ -1,21 +1,30 @@
 #include "desktop/menus/MenuPlace.h"
 #include <algorithm>
 
+// Of a menu that scrolls.
+static int const kLeastHeight = 12 * MenuRows::kItemHeight;
+
 MenuPlace MenuPlace::Over(ScreenRect const &popup, ScreenRect const &screen, MenuRows const &rows, int width,
                           int indent, int current) {
     bool const exists = current >= 1 && current <= rows.Count();
     int const middle = rows.Count() == 0 ? rows.Height() / 2 : rows.Middle(exists ? current : 1);
-    int const height = std::min(rows.Height(), std::max(screen.Height(), 1));
     int const left = popup.left - indent;
-    int const top = (popup.top + popup.bottom) / 2 - middle; // of the whole menu
+    int const top = (popup.top + popup.bottom) / 2 - middle;
     ScreenRect const whole{left, top, left + width, top + rows.Height()};
     MenuPlace place;
-    if (height == rows.Height()) {
+    if (rows.Height() <= screen.Height()) {
         place.box = whole.Within(screen);
         return place;
     }
-    place.box = ScreenRect{left, screen.top, left + width, screen.top + height}.Within(screen);
-    place.scroll = std::clamp(screen.top - top, 0, rows.Height() - height);
+    // As much of it as the screen has room for; near the screen's edges at least a few items.
+    place.box = {left, std::max(top, screen.top), left + width, std::min(whole.bottom, screen.bottom)};
+    int const least = std::max(std::min(kLeastHeight, screen.Height()), 1);
+    if (place.box.Height() < least) {
+        place.box.top = std::clamp(place.box.top, screen.top, std::max(screen.bottom - least, screen.top));
+        place.box.bottom = place.box.top + least;
+    }
+    place.box = place.box.Within(screen);
+    place.scroll = std::clamp(place.box.top - top, 0, rows.Height() - place.box.Height());
     return place;
 }
 

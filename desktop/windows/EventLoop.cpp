@@ -62,7 +62,7 @@ bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter wa
                      PlatformWindow *const *needed) {
     for (;;) {
         RunIdleWork();
-        if (needed && !*needed)
+        if (needed && (quitting || !*needed))
             return false;
         if (waiter == WindowSystem::Waiter::kMainLoop && MainLoopIsOver(deadline))
             return false;
