@@ -6,6 +6,7 @@
 #include <vector>
 
 class DesktopRep;
+class GlogPane;
 class GlogStyleSheet;
 class WindowSystem;
 struct glogRec;
@@ -112,6 +113,8 @@ public:
     // std::logic_error while something is being printed, and std::runtime_error when the file cannot be
     // written; an older file of that name is untouched then.
     int Print(glogRec *, std::string const &pdfPath, PrintOptions const & = PrintOptions());
+    // The same of one pane and what it contains.
+    int Print(GlogPane *, std::string const &pdfPath, PrintOptions const & = PrintOptions());
 
     // What shows the windows and supplies events and time.
     WindowSystem &Windows();

@@ -5,6 +5,8 @@
 #include "desktop/panes/ApplicationHooks.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
+#include "desktop/panes/HostCall.h"
+#include "desktop/panes/PaneAccess.h"
 #include "desktop/printing/PrintJob.h"
 #include "desktop/resources/Resources.h"
 #include "desktop/windows/SdlWindowSystem.h"
@@ -24,6 +26,15 @@ DesktopOptions const &Checked(DesktopOptions const &options) {
         throw std::invalid_argument("the scale " + std::to_string(options.scale) +
                                     " is not between 0.5 and 4");
     return options;
+}
+
+template <class Print>
+int PrintOf(Glog &glog, std::string const &path, PrintOptions const &options, Print print) {
+    std::vector<std::string> const title = {glog.Options().title};
+    PrintJob job(path, Paper::Named(options.paper), options.header.empty() ? title : options.header);
+    print(job);
+    job.Finish();
+    return job.Pages();
 }
 
 void OpenResources(DesktopOptions const &options) {
@@ -115,13 +126,16 @@ void Desktop::Snapshot(glogRec *record, std::string const &pngPath) {
         throw std::runtime_error("cannot write the picture " + pngPath + ": " + error);
 }
 
-int Desktop::Print(glogRec *record, std::string const &pdfPath, PrintOptions const &options) {
-    Glog &glog = Glog::From(record);
-    std::vector<std::string> const title = {glog.Options().title};
-    PrintJob job(pdfPath, Paper::Named(options.paper), options.header.empty() ? title : options.header);
-    glog.Print(job);
-    job.Finish();
-    return job.Pages();
+int Desktop::Print(glogRec *glog, std::string const &pdfPath, PrintOptions const &options) {
+    return PrintOf(Glog::From(glog), pdfPath, options,
+                   [glog](PrintJob &job) { Glog::From(glog).Print(job); });
+}
+
+int Desktop::Print(GlogPane *pane, std::string const &pdfPath, PrintOptions const &options) {
+    return PrintOf(Glog::From(pane->GetGlog()), pdfPath, options, [pane](PrintJob &job) {
+        HostCall const call;
+        PaneAccess::Print(*pane, job);
+    });
 }
 
 WindowSystem &Desktop::Windows() { return *rep->windows; }

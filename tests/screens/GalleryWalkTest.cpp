@@ -8,6 +8,7 @@
 //     slide ITEM[.PART]             the mouse is pressed there, moved off, and released
 //     hold ITEM[.PART]              the mouse is held there for half a second
 //     drag ITEM[.PART] H V          the mouse is pressed there, moved that far right and down, and released
+//     grab ITEM[.PART] H V H2 V2    the mouse is pressed so far from its top left corner, and dragged so far
 //     wheel ITEM[.PART] H V         the wheel is turned there
 //     label ITEM                    nothing is done; the label's text follows
 //     bar ITEM                      the same with where a scroll bar stands
@@ -61,6 +62,8 @@ std::set<std::string> const kStill = {"GroupPane",
                                       "TrackListPane::Table",
                                       "TrackListPane::Rows",
                                       "TrackListPane::Numbers",
+                                      "TakeListPane::List",
+                                      "ListHeaderPane",
                                       "TrackRowPane"};
 
 // Where a step is taken: "ITEM" or "ITEM.PART".
@@ -194,6 +197,8 @@ protected:
             desktop.Play("click " + spot + (words >> modifier ? ' ' + modifier : "") + "\nwait 1\n");
         else if (gesture == "drag" && words >> right >> down)
             desktop.Play("press " + spot + "\nmove " + Spot(place, right, down) + "\nrelease\nwait 1\n");
+        else if (gesture == "grab" && words >> right >> down)
+            Grab(place, right, down, words);
         else if (gesture == "wheel" && words >> right >> down)
             desktop.Play("wheel " + spot + ' ' + std::to_string(right) + ' ' + std::to_string(down) +
                          "\nwait 1\n");
@@ -203,6 +208,17 @@ protected:
             desktop.Play("press " + spot + "\nwait 0.5\nrelease\nwait 1\n");
         else
             throw std::runtime_error("there is no step \"" + gesture + '"');
+    }
+
+    // So far from the place's top left corner.
+    void Grab(Place const &place, int right, int down, std::istream &words) {
+        Rect const rect = RectOf(place);
+        int const toLeft = (rect.left - rect.right) / 2, toTop = (rect.top - rect.bottom) / 2;
+        int farther = 0, lower = 0;
+        if (!(words >> farther >> lower))
+            throw std::runtime_error("it is not said how far to drag");
+        desktop.Play("press " + Spot(place, toLeft + right, toTop + down) + "\nmove " +
+                     Spot(place, toLeft + right + farther, toTop + down + lower) + "\nrelease\nwait 1\n");
     }
 
     // Takes the step; the record gets what it led to.

@@ -98,6 +98,18 @@ Press const kPresses[] = {
     {"grid", "moved", "click 210 74\nwait 1\nclick 192 218\n"},
     {"grid", "revealed", "click 210 74\nwait 1\nwheel 200 100 0 -500\nwait 1\nclick 244 218\n"},
     {"grid", "stuck-to-end", "wheel 200 100 -1000 0\nclick 206 246\nwait 1\nclick 52 246\n"},
+    {"list", "rest", ""},
+    {"list", "selected", "press 100 61\nmove 100 101\nrelease\nclick 400 61\nclick 400 101 command\n"},
+    {"list", "behind", "press 100 61\nmove 100 101\nrelease\nclick 400 61\nactivate off\n"},
+    {"list", "middle", "wheel 100 100 0 -1000\nwait 1\nclick 100 101\n"},
+    {"list", "row-dragged", "press 30 61\nmove 60 108\n"},
+    {"list", "row-moved", "press 30 61\nmove 60 108\nrelease\n"},
+    {"list", "column-resized", "press 180 22\nmove 140 22\nrelease\n"},
+    {"list", "cell-pressed", "press 576 61\n"},
+    {"list", "one-selected", "click 18 214\nclick 100 61\nclick 100 101\n"},
+    {"select", "rest", ""},
+    {"select", "selected", "click 30 48\nclick 200 30\n"},
+    {"select", "behind", "click 30 48\nclick 200 30\nactivate off\nclick 1 110\n"},
 };
 
 void PrintTo(Press const &press, std::ostream *out) { *out << press.Name(); }

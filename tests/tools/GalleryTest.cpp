@@ -23,8 +23,9 @@ protected:
 TEST_F(GalleryProgram, WritesEveryPageInBothThemesAndTwoScales) {
     ProgramResult const result = Run("--png-dir pictures");
     EXPECT_EQ(result.status, 0) << result.errors;
-    for (char const *page : {"push-buttons", "labels", "layout", "help-tags", "check-boxes", "box-select",
-                             "icon-buttons", "small-buttons", "scroll-bars", "scroll-pane", "grid"}) {
+    for (char const *page :
+         {"push-buttons", "labels", "layout", "help-tags", "check-boxes", "box-select", "icon-buttons",
+          "small-buttons", "scroll-bars", "scroll-pane", "grid", "lists", "select-panes"}) {
         for (char const *theme : {"light", "dark"}) {
             std::string const start = std::string("pictures/") + page + '-' + theme;
             EXPECT_TRUE(Holds(result.output, start + "-1x.png\n"));
@@ -99,7 +100,7 @@ TEST_F(GalleryProgram, EndsWithOneForAnUnknownPage) {
     EXPECT_EQ(result.errors,
               "gallery: there is no page \"lay\"; there are push-buttons, labels, layout, help-tags, "
               "check-boxes, box-select, icon-buttons, small-buttons, scroll-bars, "
-              "scroll-pane, grid\n");
+              "scroll-pane, grid, lists, select-panes\n");
 }
 
 TEST_F(GalleryProgram, EndsWithOneWhereThereAreNoPages) {

@@ -10,6 +10,7 @@
 #include "tools/gallery/ColorMenuPane.h"
 #include "tools/gallery/HoldButtonPane.h"
 #include "tools/gallery/StepperPane.h"
+#include "tools/gallery/TakeListPane.h"
 #include "tools/gallery/TrackListPane.h"
 #include "tools/gallery/WellPane.h"
 
@@ -103,6 +104,20 @@ void GalleryItems::Add() {
                                .Required())
                      .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
                          return TrackListPane::NewTrackListPane(glog, sheet);
+                     }));
+    registry.Add(ItemType("TakeList")
+                     .Keys(KeyList()
+                               .Rect("BoundsRect")
+                               .Required()
+                               .Integer("Num", 0, kMostRows)
+                               .Integer("Step", 1, kMostRows)
+                               .Integer("Style", 0, 1)
+                               .Integer("TextID")
+                               .Required()
+                               .Integer("CmdID")
+                               .Integer("CmdClassID"))
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return TakeListPane::NewTakeListPane(glog, sheet);
                      }));
     registry.Add(ItemType("Well")
                      .Keys(KeyList().Rect("BoundsRect").Required())
