@@ -14,6 +14,7 @@ ItemRegistry::ItemRegistry() {
     AddScrolledItems(*this);
     AddMenuItems(*this);
     AddSelectItems(*this);
+    AddListItems(*this);
 }
 
 ItemRegistry &ItemRegistry::Instance() {

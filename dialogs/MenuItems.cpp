@@ -6,6 +6,7 @@
 #include "dialogs/MessageReporter.h"
 #include "dialogs/RecordBytes.h"
 #include "dialogs/StockItems.h"
+#include "dialogs/TruncateWord.h"
 #include "frame/ResourceReading.h"
 #include "host/GlogStyleSheet.h"
 #include "menus/DurationNotePane.h"
@@ -182,12 +183,6 @@ short MenuOf(Container const &item) {
     return id;
 }
 
-TextSettings::TruncateCode TruncationOf(UString const &word) {
-    if (word == ResourceKey("None"))
-        return TextSettings::kTruncateNone;
-    return word == ResourceKey("End") ? TextSettings::kTruncateEnd : TextSettings::kTruncateMiddle;
-}
-
 // What a dialog says of a pop-up beside what the pane reads itself.
 void SetUp(PopMPane &pane, GlogStyleSheet *sheet) {
     Container const item = sheet->GetItemRes();
@@ -202,7 +197,7 @@ void SetUp(PopMPane &pane, GlogStyleSheet *sheet) {
         pane.EnableMenu(Number(item, "Enabled") != 0);
     if (Has(item, "Pulldown"))
         pane.SetPulldownLocation(PopupMenuPulldown(Number(item, "Pulldown")));
-    pane.SetTruncation(TruncationOf(sheet->GetUStringItemValue(ResourceKey("Truncate"))));
+    pane.SetTruncation(TruncateWord::Of(sheet, TextSettings::kTruncateMiddle));
     pane.SetTextFace(static_cast<short>(Number(item, "Face")));
     pane.DisplayIconOnly(Number(item, "IconOnly") != 0);
     if (Number(item, "FitToItem") != 0)

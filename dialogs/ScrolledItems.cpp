@@ -1,12 +1,10 @@
 // Scrolled panes and grids in dialogs.
 #include "desktop/observe/TreeDump.h"
-#include "desktop/panes/PaneAccess.h"
+#include "dialogs/BarName.h"
 #include "dialogs/ItemRegistry.h"
-#include "dialogs/KeyFault.h"
 #include "dialogs/StockItems.h"
 #include "frame/ResourceReading.h"
 #include "host/GlogStyleSheet.h"
-#include "host/glogRec.h"
 #include "scrolling/ScrollGridPlus.h"
 #include "scrolling/ScrollPane.h"
 #include <algorithm>
@@ -16,43 +14,6 @@
 namespace {
 
 long long const kLargest = std::numeric_limits<short>::max();
-
-// A scroll bar of the same dialog, which may stand behind the pane that names it.
-class BarName {
-public:
-    BarName(GlogStyleSheet *sheet, char const *key_)
-        : key(key_)
-        , number(static_cast<short>(sheet->GetSInt32ItemValue(ResourceKey(key)))) {}
-
-    // Null when the dialog names none. Only once the whole dialog stands.
-    ScrollBarPane *FindFor(GlogPane &scrolled) const {
-        if (number == 0)
-            return nullptr;
-        ScrollBarPane *const bar = dynamic_cast<ScrollBarPane *>(Nearest(scrolled));
-        if (!bar)
-            throw KeyFault(key, "there is no scroll bar of the number " + std::to_string(number));
-        return bar;
-    }
-
-private:
-    // Numbers may occur again in what was loaded into the same window before, such as what is about to be
-    // exchanged for this. So whoever shares the innermost container comes first, and of these the topmost.
-    GlogPane *Nearest(GlogPane &scrolled) const {
-        GlogPane *inner = &scrolled;
-        while (CompoundPane *const around = PaneAccess::Container(*inner)) {
-            for (short i = around->NumSubpanes(); i-- > 0;) {
-                if (GlogPane *const found = around->Get(i)->FindByID(number))
-                    return found;
-            }
-            inner = around;
-        }
-        GlogPane *const found = GetGlogItem(scrolled.GetGlog(), number);
-        return found && found->GetID() == number ? found : nullptr;
-    }
-
-    char const *key;
-    short number;
-};
 
 // Takes its bars, and as much room as its panes need, once the dialog stands.
 class DialogScrollPane : public ScrollPane {

@@ -14,3 +14,4 @@ void AddScrollItems(ItemRegistry &);   // ScrollBar, GrowBox
 void AddScrolledItems(ItemRegistry &); // ScrollPane, Grid, ScrollGrid
 void AddMenuItems(ItemRegistry &);     // PopUpMenu, ScrollBarPopUpMenu, DurationNote
 void AddSelectItems(ItemRegistry &);   // Select, SelectString
+void AddListItems(ItemRegistry &);     // List

@@ -282,6 +282,7 @@ protected:
 private:
     class DragUpdater;
     class SelectionDrag;
+    friend class ListTextDrawer; // asks whether it draws on paper
 
     enum { kAbove = -1, kBelow = -2 }; // what CheckHit writes for no row
 

@@ -3,7 +3,7 @@
 #include "host/Geometry.h"
 
 // How a list's rows are selected. Other numbers select nothing.
-enum GListSelectionMode {
+enum GListSelectionMode : int {
     kListSelectOne = 0,     // one row
     kListSelectNothing = 1, // a record with it makes kListSelectSeveral; SetSelMode takes it as it stands
     kListSelectSeveral = 2, // several, with command and shift

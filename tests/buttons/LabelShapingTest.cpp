@@ -1,20 +1,6 @@
 // How often labels of groups are shaped: by the count of the layouts that Pango is asked for.
+#include "tests/ShapingCount.h"
 #include "tests/buttons/ButtonGroupTest.h"
-#include <dlfcn.h>
-
-namespace {
-
-int theLayouts;
-
-} // namespace
-
-// Stands before Pango's own, which it calls.
-extern "C" void *pango_layout_new(void *context) {
-    typedef void *(*New)(void *);
-    static New const own = reinterpret_cast<New>(dlsym(RTLD_NEXT, "pango_layout_new"));
-    ++theLayouts;
-    return own(context);
-}
 
 namespace {
 
@@ -27,9 +13,9 @@ protected:
     }
     // How many texts the action shapes.
     static int Shaped(std::function<void()> const &action) {
-        int const before = theLayouts;
+        int const before = ShapingCount::layouts;
         action();
-        return theLayouts - before;
+        return ShapingCount::layouts - before;
     }
     // Names that no other test has.
     static UString Name(std::string const &test, int i) {

@@ -40,11 +40,32 @@ void CollectElements(XmlNode const &node, std::set<std::string> &names) {
     }
 }
 
-std::set<std::string> const kStockTypes = {
-    "OvalButton", "StudButton",      "FrameButton", "CheckBox",      "RadioButton", "Icon",
-    "IconButton", "SuccessiveIcons", "TwistDown",   "TrackSelector", "Box",         "BoxSelect",
-    "Label",      "Group",           "Spacer",      "ScrollBar",     "GrowBox",     "ScrollPane",
-    "Grid",       "ScrollGrid",      "Select",      "SelectString"};
+std::set<std::string> const kStockTypes = {"OvalButton",
+                                           "StudButton",
+                                           "FrameButton",
+                                           "CheckBox",
+                                           "RadioButton",
+                                           "Icon",
+                                           "IconButton",
+                                           "SuccessiveIcons",
+                                           "TwistDown",
+                                           "TrackSelector",
+                                           "Box",
+                                           "BoxSelect",
+                                           "Label",
+                                           "Group",
+                                           "Spacer",
+                                           "ScrollBar",
+                                           "GrowBox",
+                                           "ScrollPane",
+                                           "Grid",
+                                           "ScrollGrid",
+                                           "Select",
+                                           "SelectString",
+                                           "List",
+                                           "PopUpMenu",
+                                           "ScrollBarPopUpMenu",
+                                           "DurationNote"};
 
 std::set<std::string> KeysOfStockTypes() {
     std::set<std::string> names = {"Items"};
@@ -61,7 +82,7 @@ TEST(Schema, KnowsTheKeysOfTheStockTypesAndNoOthers) {
     XmlFile const schema = XmlFile::Read(kSchema);
     std::set<std::string> known;
     for (char const *group : {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels",
-                              "Groups", "ScrollBars", "Scrolled", "Selectables"})
+                              "Groups", "ScrollBars", "Scrolled", "Selectables", "Lists", "Menus"})
         CollectElements(*Named(schema.Root(), "xs:group", group), known);
     EXPECT_EQ(known, KeysOfStockTypes());
 }
