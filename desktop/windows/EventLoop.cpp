@@ -380,8 +380,12 @@ bool EventLoop::NextMenuEvent(double deadline, InputEvent &event) {
     }
     if (event.kind == InputEvent::kCloseRequested || event.kind == InputEvent::kQuit)
         deferred.push_back(event);
-    if (IsRelease(event))
-        heldWindow = nullptr; // the capture stays the menu's
+    if (IsRelease(event)) {
+        // The capture was the press's, which may have ended it; now it is the menu's.
+        heldWindow = nullptr;
+        windows.CaptureMouse(nullptr);
+        windows.CaptureMouse(menuWindow);
+    }
     return true;
 }
 
