@@ -1,25 +1,17 @@
 // The list in FLTK 1.3: an Fl_Scroll.
+#include "bench/peers/FltkToolkit.h"
 #include "bench/peers/PeerForm.h"
 #include "bench/peers/PeerList.h"
 #include <FL/Fl.H>
 #include <FL/Fl_Box.H>
 #include <FL/Fl_Scroll.H>
 #include <FL/Fl_Window.H>
-#include <FL/x.H>
-#include <X11/Xlib.h>
 #include <memory>
-#include <string>
 
 namespace {
 
 class FltkList : public PeerList {
 public:
-    // A space before the name stands for the upright face. FLTK keeps the pointer.
-    FltkList()
-        : font(std::string(" ") + PeerForm::kFontFamily) {
-        Fl::set_font(FL_HELVETICA, font.c_str());
-    }
-
     void Show() override {
         window.reset(new Fl_Window(0, 0, kWidth + kBarWidth, kHeight, "List"));
         window->clear_border();
@@ -39,16 +31,12 @@ public:
     }
     void ScrollTo(int position) override {
         scroll->scroll_to(0, position);
-        Fl::flush();
-        XSync(fl_display, False);
+        FltkToolkit::Finish();
     }
-    void Settle() override {
-        Fl::check();
-        XSync(fl_display, False);
-    }
+    void Settle() override { FltkToolkit::Settle(); }
 
 private:
-    std::string font;
+    FltkToolkit toolkit;
     std::unique_ptr<Fl_Window> window;
     Fl_Scroll *scroll = nullptr; // the window's
 };

@@ -1,4 +1,5 @@
 // The form in FLTK 1.3.
+#include "bench/peers/FltkToolkit.h"
 #include "bench/peers/Peer.h"
 #include "bench/peers/PeerForm.h"
 #include <FL/Fl.H>
@@ -10,23 +11,13 @@
 #include <FL/x.H>
 #include <X11/Xlib.h>
 #include <memory>
-#include <string>
 #include <vector>
 
 namespace {
 
-double const kLongestWait = 1; // seconds
-int const kMostWaits = 100;    // it returns for every event
-
 // In a window without a second buffer, which is the faster kind.
 class FltkPeer : public Peer {
 public:
-    // A space before the name stands for the upright face. FLTK keeps the pointer.
-    FltkPeer()
-        : font(std::string(" ") + PeerForm::kFontFamily) {
-        Fl::set_font(FL_HELVETICA, font.c_str());
-    }
-
     void Build(int count, int height) override {
         window.reset(new Fl_Window(0, 0, PeerForm::kWidth, height, PeerForm::kTitle));
         window->clear_border(); // else it leaves room for a frame
@@ -55,12 +46,12 @@ public:
 
     void Repaint() override {
         window->redraw();
-        Finish();
+        FltkToolkit::Finish();
     }
     void Toggle(int box) override {
         Fl_Check_Button *const button = boxes[static_cast<std::size_t>(box)];
         button->value(!button->value());
-        Finish();
+        FltkToolkit::Finish();
     }
     // A picture of the server's: there is no drawing into the program's own memory.
     void RepaintOffscreen() override {
@@ -71,14 +62,10 @@ public:
         Fl_Display_Device::display_device()->set_current();
     }
 
-    void Settle() override {
-        Fl::check();
-        XSync(fl_display, False);
-    }
+    void Settle() override { FltkToolkit::Settle(); }
     void WaitUntilHeard() override {
         heard = false;
-        for (int i = 0; i < kMostWaits && !heard; ++i)
-            Fl::wait(kLongestWait);
+        FltkToolkit::WaitUntil(heard);
     }
 
 private:
@@ -100,12 +87,7 @@ private:
         peer->Heard();
         peer->heard = true;
     }
-    static void Finish() {
-        Fl::flush();
-        XSync(fl_display, False);
-    }
-
-    std::string font;
+    FltkToolkit toolkit;
     std::unique_ptr<Fl_Window> window;
     std::vector<Fl_Check_Button *> boxes; // the window's
     bool heard = false;

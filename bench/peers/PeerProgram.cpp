@@ -3,7 +3,8 @@
 //     peer_NAME window SERVER     in a window of the X server with that process number
 //     peer_NAME offscreen SERVER  in memory
 //     peer_NAME memory BOXES      the resident memory with so many check boxes
-//     peer_NAME list SERVER       steps through a list
+//     peer_NAME list SERVER       steps through a list of labels
+//     peer_NAME table SERVER      shows, scrolls and clicks a list of 1,000,000 rows
 //
 // Times are nanoseconds of the processor, of the program and the server together: so neither what else runs
 // on the machine counts, nor a wait for the next frame or for a press that is shown for a while, and work
@@ -11,6 +12,7 @@
 #include "bench/peers/Peer.h"
 #include "bench/peers/PeerForm.h"
 #include "bench/peers/PeerList.h"
+#include "bench/peers/PeerTable.h"
 #include <X11/Xlib.h>
 #include <X11/extensions/XTest.h>
 #include <cstdio>
@@ -26,8 +28,9 @@ namespace {
 
 int const kBuilds = 5, kRepaints = 15, kToggles = 40, kClicks = 8;
 int const kScrollSteps = 200, kScrollStep = 10; // pixels
-int const kStep = 37;                           // from box to box; has no factor in common with their number
-int const kPressH = 6, kPressV = 11;            // within a check box: on its mark in each of the toolkits
+int const kTableSteps = 200, kTableJumps = 100;
+int const kStep = 37;                // from box to box; has no factor in common with their number
+int const kPressH = 6, kPressV = 11; // within a check box: on its mark in each of the toolkits
 int const kPrimaryButton = 1;
 int const kSettlingMicroseconds = 20000;
 long const kPerSecond = 1000000000;
@@ -59,7 +62,7 @@ template <class Action> void Time(char const *name, Action action) {
     Report(name, Now() - start);
 }
 
-void Settle(Peer &peer) {
+template <class Toolkit> void Settle(Toolkit &peer) {
     for (int i = 0; i < 5; ++i) {
         usleep(kSettlingMicroseconds);
         peer.Settle();
@@ -89,19 +92,23 @@ private:
     Display *display;
 };
 
+template <class Toolkit> void TimeClick(char const *name, Pointer &pointer, Toolkit &peer) {
+    heardAt = 0;
+    long long const start = Now();
+    pointer.Click();
+    peer.WaitUntilHeard();
+    if (heardAt == 0)
+        Fail("a click has not been heard");
+    Report(name, heardAt - start);
+}
+
 void TimeClicks(Peer &peer) {
     Pointer pointer;
     for (int i = 0; i < kClicks; ++i) {
         PeerForm::Place const place = PeerForm::OfBox(i * kStep % PeerForm::kBoxes);
         pointer.MoveTo(place.h + kPressH, place.v + kPressV);
         Settle(peer);
-        heardAt = 0;
-        long long const start = Now();
-        pointer.Click();
-        peer.WaitUntilHeard();
-        if (heardAt == 0)
-            Fail("a click has not been heard");
-        Report("click", heardAt - start);
+        TimeClick("click", pointer, peer);
         Settle(peer);
     }
 }
@@ -160,17 +167,39 @@ void MeasureMemory(Peer &peer, int boxes) {
 // Every step shows rows that have not been seen.
 void MeasureList(PeerList &list) {
     list.Show();
-    for (int i = 0; i < 5; ++i) {
-        usleep(kSettlingMicroseconds);
-        list.Settle();
-    }
+    Settle(list);
     for (int i = 1; i <= kScrollSteps; ++i)
         Time("scroll-step", [&] { list.ScrollTo(i * kScrollStep); });
+}
+
+// Rows far apart, and none twice.
+int RandomRow(int i) { return static_cast<int>(i * 382467LL % (PeerTable::kRows - PeerTable::kHeight)); }
+
+void MeasureTable(PeerTable &table) {
+    Time("table-first-frame", [&] { table.Show(); });
+    Settle(table);
+    for (int i = 0; i < kRepaints; ++i)
+        Time("table-repaint", [&] { table.Repaint(); });
+    for (int i = 1; i <= kTableSteps; ++i)
+        Time("table-step", [&] { table.ScrollTo(i); });
+    for (int i = 1; i <= kTableJumps; ++i)
+        Time("table-jump", [&] { table.ScrollTo(RandomRow(i)); });
+    Pointer pointer;
+    for (int i = 0; i < kClicks; ++i) {
+        // To and fro, so that each selects another row, however high rows are.
+        int const row = i % 2 == 0 ? 2 : PeerTable::kHeight / PeerTable::kRowHeight / 2;
+        pointer.MoveTo(PeerTable::kColumnWidth + kPressH, row * PeerTable::kRowHeight + kPressV);
+        Settle(table);
+        TimeClick("table-click", pointer, table);
+        Settle(table);
+    }
 }
 
 } // namespace
 
 void Peer::Heard() { heardAt = Now(); }
+
+void PeerTable::Heard() { heardAt = Now(); }
 
 int main(int argc, char **argv) {
     if (argc != 3)
@@ -186,6 +215,10 @@ int main(int argc, char **argv) {
     argv[1] = nullptr;
     if (what == "list") {
         MeasureList(*std::unique_ptr<PeerList>(NewPeerList(argc, argv)));
+        return EXIT_SUCCESS;
+    }
+    if (what == "table") {
+        MeasureTable(*std::unique_ptr<PeerTable>(NewPeerTable(argc, argv)));
         return EXIT_SUCCESS;
     }
     std::unique_ptr<Peer> const peer(NewPeer(what == "offscreen", argc, argv));

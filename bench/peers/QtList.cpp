@@ -1,12 +1,9 @@
 // The list in Qt 6 Widgets: a QScrollArea.
-#include "bench/peers/PeerForm.h"
 #include "bench/peers/PeerList.h"
-#include <QApplication>
-#include <QFont>
+#include "bench/peers/QtToolkit.h"
 #include <QLabel>
 #include <QScrollArea>
 #include <QScrollBar>
-#include <QWindow>
 #include <memory>
 
 namespace {
@@ -14,11 +11,7 @@ namespace {
 class QtList : public PeerList {
 public:
     QtList(int &argc, char **argv)
-        : application(argc, argv) {
-        QFont font(PeerForm::kFontFamily);
-        font.setPixelSize(PeerForm::kFontSize);
-        QApplication::setFont(font);
-    }
+        : toolkit("xcb", argc, argv) {}
 
     void Show() override {
         area.reset(new QScrollArea);
@@ -32,24 +25,20 @@ public:
         }
         area->setWidget(content);
         area->show();
-        while (!area->windowHandle() || !area->windowHandle()->isExposed())
-            QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+        QtToolkit::WaitUntilExposed(*area);
         Settle();
     }
     void ScrollTo(int position) override {
         area->verticalScrollBar()->setValue(position);
         Settle(); // which handles the update that this has posted
     }
-    void Settle() override { QGuiApplication::sync(); }
+    void Settle() override { QtToolkit::Settle(); }
 
 private:
-    QApplication application;
+    QtToolkit toolkit;
     std::unique_ptr<QScrollArea> area;
 };
 
 } // namespace
 
-PeerList *NewPeerList(int &argc, char **argv) {
-    qputenv("QT_QPA_PLATFORM", "xcb");
-    return new QtList(argc, argv);
-}
+PeerList *NewPeerList(int &argc, char **argv) { return new QtList(argc, argv); }

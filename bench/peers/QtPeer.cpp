@@ -1,28 +1,19 @@
 // The form in Qt 6 Widgets.
 #include "bench/peers/Peer.h"
 #include "bench/peers/PeerForm.h"
-#include <QApplication>
+#include "bench/peers/QtToolkit.h"
 #include <QCheckBox>
-#include <QFont>
 #include <QRadioButton>
-#include <QTimer>
 #include <QWidget>
-#include <QWindow>
 #include <memory>
 #include <vector>
 
 namespace {
 
-int const kLongestWait = 5000; // milliseconds
-
 class QtPeer : public Peer {
 public:
-    QtPeer(int &argc, char **argv)
-        : application(argc, argv) {
-        QFont font(PeerForm::kFontFamily);
-        font.setPixelSize(PeerForm::kFontSize);
-        QApplication::setFont(font);
-    }
+    QtPeer(bool offscreen, int &argc, char **argv)
+        : toolkit(offscreen ? "offscreen" : "xcb", argc, argv) {}
 
     void Build(int count, int height) override {
         window.reset(new QWidget);
@@ -48,30 +39,25 @@ public:
     }
     void Show() override {
         window->show();
-        while (!window->windowHandle() || !window->windowHandle()->isExposed())
-            QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+        QtToolkit::WaitUntilExposed(*window);
         Repaint();
     }
 
     void Repaint() override {
         window->repaint();
-        QGuiApplication::sync();
+        QtToolkit::Settle();
     }
     void Toggle(int box) override {
         boxes[static_cast<std::size_t>(box)]->toggle();
-        QGuiApplication::sync(); // which handles the update that this has posted
+        QtToolkit::Settle(); // which handles the update that this has posted
     }
     // Off screen the platform has no display, and keeps its windows as images.
     void RepaintOffscreen() override { window->repaint(); }
 
-    void Settle() override { QGuiApplication::sync(); }
+    void Settle() override { QtToolkit::Settle(); }
     void WaitUntilHeard() override {
         heard = false;
-        QTimer limit;
-        limit.setSingleShot(true);
-        limit.start(kLongestWait);
-        while (!heard && limit.isActive())
-            QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+        QtToolkit::WaitUntil(heard);
     }
 
 private:
@@ -87,7 +73,7 @@ private:
         }
     }
 
-    QApplication application;
+    QtToolkit toolkit;
     std::unique_ptr<QWidget> window;
     std::vector<QCheckBox *> boxes; // the window's
     bool heard = false;
@@ -95,7 +81,4 @@ private:
 
 } // namespace
 
-Peer *NewPeer(bool offscreen, int &argc, char **argv) {
-    qputenv("QT_QPA_PLATFORM", offscreen ? "offscreen" : "xcb");
-    return new QtPeer(argc, argv);
-}
+Peer *NewPeer(bool offscreen, int &argc, char **argv) { return new QtPeer(offscreen, argc, argv); }
