@@ -27,6 +27,10 @@ POINTER_TEST = 1.5
 LINEAR = 1.5
 # What is out of sight costs nothing but a look at where it lies.
 OUT_OF_SIGHT = 1.2
+# Rows that do not show cost nothing at all.
+ROWS = 1.15
+# Erasing the rows, clips and frame come to the texts.
+TEXTS_OF_A_LIST = 1.5
 
 RATIOS = (
     Ratio("message to nobody / pointer test", "Broadcast/ours/0", "Broadcast/bare/0", POINTER_TEST),
@@ -54,6 +58,17 @@ RATIOS = (
     Ratio("scroll step among 2,000 members / 100", "Scroll/grid/2000/manual_time", "Scroll/grid/100/manual_time",
           OUT_OF_SIGHT),
     Ratio("scroll step in 30,000 pixels / 600", "Scroll/pane/30000", "Scroll/pane/600", OUT_OF_SIGHT),
+    Ratio("menu of 1,000 items opened / of 20", "Menu/open/1000", "Menu/open/20", OUT_OF_SIGHT),
+    Ratio("whole list / its texts by Pango", "List/repaint/1000000", "List/repaint bare", TEXTS_OF_A_LIST),
+    Ratio("first frame of 1,000,000 rows / 1,000", "List/first frame/1000000/manual_time",
+          "List/first frame/1000/manual_time", ROWS, "real_time"),
+    Ratio("repaint of 1,000,000 rows / 1,000", "List/repaint/1000000", "List/repaint/1000", ROWS),
+    Ratio("scroll step in 1,000,000 rows / 1,000", "List/scroll to and fro/1000000", "List/scroll to and fro/1000", ROWS),
+    Ratio("the same to a row that is new", "List/scroll on/1000000", "List/scroll on/1000", ROWS),
+    Ratio("jump among 1,000,000 rows / 1,000", "List/jump/1000000", "List/jump/1000", ROWS),
+    Ratio("click among 1,000,000 rows / 1,000", "List/click/1000000/manual_time", "List/click/1000/manual_time", ROWS,
+          "real_time"),
+    Ratio("select 1 of 1,000,000 rows / of 1,000", "List/select one/1000000", "List/select one/1000", ROWS),
     Ratio("start to first frame / bare program", "Start/ours", "Start/bare", 1.15, "real_time"),
     Ratio("processor time of it / bare program", "Start/ours", "Start/bare"),
 )
@@ -63,12 +78,19 @@ AMOUNTS = (
     Amount("click on the lowest of 1,000 panes", "Click/panes/1000/manual_time", "us", 1e3),
     Amount("shown beyond 1 of 10,000 buttons", "Toggle/group/10000", "px", 1, 0, "beyond"),
     Amount("shown beyond 1 of 10,000 panes", "Toggle/panes/10000", "px", 1, 0, "beyond"),
+    Amount("repaint of a list of 600 x 400", "List/repaint/1000000", "us", 1e3, None, "cpu_time"),
+    Amount("click to listener of a list", "List/click/1000000/manual_time", "us", 1e3),
+    Amount("set count, a row", "List/set count/manual_time", "ns", 1, 10, "perRow"),
+    Amount("select all, a row", "List/select all/manual_time", "ns", 1, 10, "perRow"),
+    Amount("deselect all, a row", "List/deselect all/manual_time", "ns", 1, 10, "perRow"),
+    Amount("memory of several rows, each", "List/bytes of several/iterations:3", "B", 1, 4, "perRow"),
+    Amount("memory of one row among them, each", "List/bytes of one/iterations:3", "B", 1, 0.01, "perRow"),
     Amount("resident memory", "Idle/resident", "MB", 1024 * 1024, 24),
     Amount("wake-ups of an idle window", "Idle/wake-ups", "", 1, 1),
 )
 
 SIZES = {"ns": 1, "us": 1e3, "ms": 1e6, "s": 1e9, "count": 1, "bytes": 1}
-COUNTERS = ("beyond",)
+COUNTERS = ("beyond", "perRow")
 MARKS = {True: "PASS", False: "over"}
 
 
