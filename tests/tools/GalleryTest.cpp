@@ -100,7 +100,7 @@ TEST_F(GalleryProgram, EndsWithOneForAnUnknownPage) {
     EXPECT_EQ(result.errors,
               "gallery: there is no page \"lay\"; there are push-buttons, labels, layout, help-tags, "
               "check-boxes, box-select, icon-buttons, small-buttons, scroll-bars, "
-              "scroll-pane, grid, lists, select-panes\n");
+              "scroll-pane, grid, lists, select-panes, pop-up-menus, durations\n");
 }
 
 TEST_F(GalleryProgram, EndsWithOneWhereThereAreNoPages) {
