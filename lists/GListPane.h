@@ -316,6 +316,7 @@ private:
     bool MakeFlags(int count);
     bool MakeFlag(int row);
     bool ClearFlags();
+    void SelectByAll(int row);
     void Unmark(int line);
     void TellSelected(int line, bool selected, bool tracking);
     void TellDone();

@@ -89,16 +89,28 @@ void GListPane::DoSelect(int line, int value, bool tracking) {
 void GListPane::SelectAll() {
     SaveColors const colors;
     PaneWatch const self(this);
-    for (int row = selected.Count() - 1; row >= 0; row = std::min(row, selected.Count()) - 1) {
-        if (selected.At(row) != 0)
-            continue;
-        if (Shows(row) && CanDrawSelection())
-            InvertItem(row);
-        DoSelect(row, 1, false);
-        if (!self.PaneExists())
-            return;
+    if (selectionListener) {
+        for (int row = selected.Count() - 1; row >= 0; row = std::min(row, selected.Count()) - 1) {
+            SelectByAll(row);
+            if (!self.PaneExists())
+                return;
+        }
+    } else {
+        int first = 0, last = 0;
+        GetFirstAndLast(&first, &last);
+        for (int row = last; row >= first; --row)
+            SelectByAll(row);
+        selected.SetZerosToOne();
     }
     TellDone();
+}
+
+void GListPane::SelectByAll(int row) {
+    if (!selected.Has(row) || selected.At(row) != 0)
+        return;
+    if (Shows(row) && CanDrawSelection())
+        InvertItem(row);
+    DoSelect(row, 1, false);
 }
 
 void GListPane::DeselectAll() {

@@ -111,6 +111,13 @@ void SelectionFlags::SetAllToZero() {
     oddLast = kNone;
 }
 
+void SelectionFlags::SetZerosToOne() {
+    for (short &flag : flags)
+        flag = flag == 0 ? short(1) : flag;
+    for (std::size_t block = 0; block < nonZero.size(); ++block)
+        nonZero[block] = static_cast<unsigned short>(EndOfBlock(block) - block * kBlock);
+}
+
 void SelectionFlags::Normalise() {
     int const first = oddFirst, last = oddLast;
     oddLast = kNone;

@@ -25,6 +25,7 @@ public:
     // or even.
     void Set(int row, int flag);
     void SetAllToZero();
+    void SetZerosToOne(); // other flags stay
     // Rows from the place on move by one, the new one has 0. A place beyond the ends becomes the end. Throws
     // like SetCount.
     void Insert(int row);

@@ -218,6 +218,22 @@ TEST_F(GListPaneSelectionTest, SelectingAllLeavesOtherFlagsAlone) {
     EXPECT_FALSE(list->CheckSel(1));
 }
 
+TEST_F(GListPaneSelectionTest, WithoutAListenerAllAreSelectedAndDrawnJustTheSame) {
+    GListPane *const list = Filled(100, kListSelectSeveral);
+    list->SelectItem(1);
+    list->SetSelectionListener(nullptr);
+    Show();
+    EXPECT_EQ(RowsDrawnBy([&] { list->SelectAll(); }), (Log{"0*", "2*", "3*", "4*", "5*", "6*"}));
+    EXPECT_EQ(list->NumSelected(), 100);
+    EXPECT_TRUE(list->CheckSel(99));
+    list->SetScrollPosition(50);
+    list->DeselectAll();
+    EXPECT_EQ(list->NumSelected(), 0);
+    list->SetNumItems(0);
+    list->SelectAll();
+    EXPECT_EQ(list->NumSelected(), 0);
+}
+
 TEST_F(GListPaneSelectionTest, InModesWithoutFlagsSelectingAllIsOnlyItsEnd) {
     for (GListSelectionMode mode : {kListSelectOne, kListSelectByCode}) {
         GListPane *const list = Filled(5, mode);

@@ -143,6 +143,21 @@ TEST(SelectionFlagsTest, AllBecomeZero) {
         ASSERT_EQ(flags.At(row), 0) << row;
 }
 
+TEST(SelectionFlagsTest, ZerosBecomeOneAndOthersStay) {
+    SelectionFlags flags = WithRows(kMany);
+    flags.Set(5, -1);
+    flags.Set(9000, 2);
+    flags.SetZerosToOne();
+    EXPECT_EQ(flags.At(5), -1);
+    EXPECT_EQ(flags.At(9000), 2);
+    EXPECT_EQ(flags.At(0), 1);
+    EXPECT_EQ(flags.At(kMany - 1), 1);
+    EXPECT_EQ(flags.NumNonZero(), kMany);
+    flags.Normalise();
+    EXPECT_EQ(flags.NumNonZero(), kMany - 1);
+    EXPECT_EQ(flags.FirstSelectedFrom(5), 6);
+}
+
 TEST(SelectionFlagsTest, TheNearestSelectedRowIsFoundOverManyRows) {
     SelectionFlags flags = WithRows(kMany);
     flags.Set(3, 1);
