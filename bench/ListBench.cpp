@@ -21,6 +21,7 @@ short const kNameWidth = 280, kTimeWidth = 200;                           // of 
 int const kFew = 1000, kMany = 1000000;                                   // rows
 int const kShown = 25;                                                    // of the list
 int const kColumns = 3;
+int const kFirstNumber = 1000000; // of the rows: texts of all lists are of one length
 
 UString Numbered(char const *word, int number) {
     UString text(word, UString::kByteEncoding1), digits;
@@ -31,7 +32,7 @@ UString Numbered(char const *word, int number) {
 
 void FillCell(int line, int column, ListCell &cell) {
     static char const *const kWords[kColumns] = {"Take of the song no. ", "starts at ", "-"};
-    cell.text = Numbered(kWords[column], line);
+    cell.text = Numbered(kWords[column], kFirstNumber + line);
 }
 
 boost::shared_ptr<ColumnList> Columns() {
