@@ -15,7 +15,7 @@ public:
     explicit DurationNotePane(glogRec *);
     ~DurationNotePane() override;
 
-    DurationValue GetDurationValue() const { return duration; }
+    DurationValue GetDurationValue() const { return duration; } // what is shown; at first no duration
     // Stores the duration, tells the listeners, then repaints; nothing for the one that is shown.
     void SetDurationValue(DurationValue const &);
     void SetEnable(bool on) { enabled = on; } // whether clicks count; only stores
