@@ -83,9 +83,9 @@ public:
     // Becomes a copy of the menu, of its own. The submenus made before go; with the flag no item is current.
     // Nobody is told. A menu that was invalid keeps its selection and its submenus.
     void SetMenu(OSMenuHandle const &, bool resetSelection);
-    OSMenuHandle &GetMenuHandle() { return menu; }
-    short GetMenuID() const { return menuID; }
-    short GetFlags() const { return flags; } // of the resource, the low 8 bits
+    OSMenuHandle &GetMenuHandle() { return menu; } // the menu itself: what is done to it tells nobody
+    short GetMenuID() const { return menuID; }     // that was asked for, also where there is no such menu
+    short GetFlags() const { return flags; }       // of the resource, the low 8 bits
     // What the menu answered when it was last open: menu id in the upper 16 bits, item in the lower; 0: it
     // was dismissed; -1: it has not been open, or could not be opened.
     int GetLastPopupResult() const { return lastPopupResult; }
@@ -132,11 +132,11 @@ protected:
     // Whether a menu still exists, for code that calls what may delete it.
     class Watch {
     public:
-        explicit Watch(PopUpMenu &);
+        explicit Watch(PopUpMenu &); // may outlive it
         ~Watch();
         Watch(Watch const &) = delete;
         Watch &operator=(Watch const &) = delete;
-        bool MenuExists() const { return watched != nullptr; }
+        bool MenuExists() const { return watched != nullptr; } // its destructor has not begun
 
     private:
         friend class PopUpMenu;
