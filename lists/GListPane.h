@@ -62,8 +62,9 @@ public:
     // A row comes in before this one, or at the nearest end. Rows of the selection move along; in modes with
     // several the listener hears that the new one is not selected. Memory as above.
     virtual void AddItem(int at);
-    // The row goes. In modes with several the selection moves along; in the others it stays at its number,
-    // but for one that ends beyond the last row or is this row, which is not followed up by AddItem's rule.
+    // The row goes. In modes with several the selection moves along, and nobody is told. In the others it
+    // keeps its numbers, which AddItem would not: only a range that ends behind the last row ends there, and
+    // one that is this row is no more.
     virtual void DelItem(int at);
     int GetNumItems() const { return numItems; }
     // Whether the row is selected.
@@ -316,6 +317,8 @@ private:
     bool MakeFlags(int count);
     bool MakeFlag(int row);
     bool ClearFlags();
+    void SelectAllAndTell(PaneWatch const &);
+    void SelectAllAtOnce();
     void SelectByAll(int row);
     void Unmark(int line);
     void TellSelected(int line, bool selected, bool tracking);

@@ -68,6 +68,7 @@ void GListPane::SelItemPrim(int line, bool select) {
     PaneWatch const self(this);
     if (HasFlags() && HasRow(line) && selected.IsSelected(line) != select) {
         if (CanDrawSelection()) {
+            Prepare();
             SaveColors const colors;
             InvertItem(line);
         } else {
@@ -87,22 +88,33 @@ void GListPane::DoSelect(int line, int value, bool tracking) {
 }
 
 void GListPane::SelectAll() {
-    SaveColors const colors;
     PaneWatch const self(this);
-    if (selectionListener) {
-        for (int row = selected.Count() - 1; row >= 0; row = std::min(row, selected.Count()) - 1) {
-            SelectByAll(row);
-            if (!self.PaneExists())
-                return;
-        }
-    } else {
-        int first = 0, last = 0;
-        GetFirstAndLast(&first, &last);
-        for (int row = last; row >= first; --row)
-            SelectByAll(row);
-        selected.SetZerosToOne();
+    Prepare();
+    {
+        SaveColors const colors;
+        if (selectionListener)
+            SelectAllAndTell(self);
+        else
+            SelectAllAtOnce();
     }
-    TellDone();
+    if (self.PaneExists())
+        TellDone();
+}
+
+void GListPane::SelectAllAndTell(PaneWatch const &self) {
+    for (int row = selected.Count() - 1; row >= 0; row = std::min(row, selected.Count()) - 1) {
+        SelectByAll(row);
+        if (!self.PaneExists())
+            return;
+    }
+}
+
+void GListPane::SelectAllAtOnce() {
+    int first = 0, last = 0;
+    GetFirstAndLast(&first, &last);
+    for (int row = last; row >= first; --row)
+        SelectByAll(row);
+    selected.SetZerosToOne();
 }
 
 void GListPane::SelectByAll(int row) {
@@ -190,8 +202,8 @@ void GListPane::Unmark(int line) {
 
 // Rows that do not show need no look.
 void GListPane::InvertSelection() {
-    SaveColors const colors;
     Prepare();
+    SaveColors const colors;
     if (res.selMode == kListSelectOne) {
         selLast = selFirst;
         InvalLine(selFirst);

@@ -251,10 +251,10 @@ private:
 };
 
 int GListPane::SelectByClick(EventRecordAdapter const &event, int line, int column) {
-    SaveColors const colors;
     SelectionDrag drag(*this, event.where, line, column);
     PaneWatch const self(this);
     {
+        SaveColors const colors;
         // Also when something that is called on the way throws.
         struct Gesture {
             ~Gesture() {
