@@ -34,7 +34,7 @@ glogRec *Load(std::function<glogRec *()> const &load) {
     }
 }
 
-// A click in the middle of what each of the first items shows.
+// A click in the middle of what each of the first items shows. Where that opens a menu, the key closes it.
 std::string ClicksOn(glogRec *glog) {
     std::string script;
     int left = kMostClicks;
@@ -43,7 +43,7 @@ std::string ClicksOn(glogRec *glog) {
         Rect shown;
         if (VelaDrawing::SectRect(&window, &box, &shown) && left-- > 0)
             script += "click " + std::to_string((shown.left + shown.right) / 2) + ' ' +
-                      std::to_string((shown.top + shown.bottom) / 2) + '\n';
+                      std::to_string((shown.top + shown.bottom) / 2) + "\nkey Escape\n";
     }
     return script;
 }
