@@ -7,6 +7,7 @@
 //     click ITEM[.PART] [MODIFIER]  the middle of an item of the page, or of a part or half of it
 //     slide ITEM[.PART]             the mouse is pressed there, moved off, and released
 //     hold ITEM[.PART]              the mouse is held there for half a second
+//     choose ITEM ANSWER            it is clicked, and the menu that opens is answered, as in scripts
 //     drag ITEM[.PART] H V          the mouse is pressed there, moved that far right and down, and released
 //     grab ITEM[.PART] H V H2 V2    the mouse is pressed so far from its top left corner, and dragged so far
 //     wheel ITEM[.PART] H V         the wheel is turned there
@@ -191,10 +192,12 @@ protected:
         unused.erase(MessageTrace::ClassName(Item(place.item)));
         unused.erase(MessageTrace::ClassName(PaneAt(place)));
         std::string const spot = Spot(place);
-        std::string modifier;
+        std::string modifier, answer;
         int right = 0, down = 0;
         if (gesture == "click")
             desktop.Play("click " + spot + (words >> modifier ? ' ' + modifier : "") + "\nwait 1\n");
+        else if (gesture == "choose" && words >> answer)
+            desktop.Play("click " + spot + "\nmenu " + answer + "\nwait 1\n");
         else if (gesture == "drag" && words >> right >> down)
             desktop.Play("press " + spot + "\nmove " + Spot(place, right, down) + "\nrelease\nwait 1\n");
         else if (gesture == "grab" && words >> right >> down)

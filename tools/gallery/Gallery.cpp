@@ -11,6 +11,7 @@
 #include "host/CompoundPane.h"
 #include "host/GlogLayout.h"
 #include "host/glogRec.h"
+#include "menus/PopMPane.h"
 #include "tools/gallery/ChoiceButtonPane.h"
 #include "tools/gallery/GalleryItems.h"
 #include "tools/gallery/LabelText.h"
@@ -60,6 +61,8 @@ char const *KindOf(GlogPane *pane) {
         return "Radio buttons";
     if (dynamic_cast<GIconButton *>(pane) || dynamic_cast<GIconButtonPane *>(pane))
         return "Icon button";
+    if (dynamic_cast<PopMPane *>(pane))
+        return "Pop-up menu";
     return dynamic_cast<GIconPane *>(pane) ? "Icon" : "Button";
 }
 
