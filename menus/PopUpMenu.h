@@ -109,7 +109,8 @@ public:
     void ApplyDecoratorToItem(short item, boost::shared_ptr<MenuItemDecorator> const &);
 
     // Appends an item that opens a new, empty submenu, to the menu or to any other one, and answers the
-    // submenu. Submenus can be found by their ids only while the menu is open.
+    // submenu. Submenus can be found by their ids only while the menu is open. A choice from a submenu
+    // selects, in this menu, the number that its item has in its parent, whichever menu that is.
     OSMenuHandle AppendNewEmptyHierarchicalMenu(UString const &title);
     OSMenuHandle AppendNewEmptyHierarchicalMenu(UString const &title, OSMenuHandle parent);
     // The item in its parent that opens the submenu; false without effect for a submenu not made here.

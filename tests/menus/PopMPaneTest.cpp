@@ -3,6 +3,7 @@
 #include "menus/ScrollBarPopupMenuPane.h"
 #include "tests/VirtualPlace.h"
 #include "tests/menus/MenuTest.h"
+#include <dlfcn.h>
 
 namespace {
 
@@ -460,6 +461,16 @@ TEST_F(PopMPaneTest, ItsProceduresReachTheMenu) {
     PMDeleteAllItems(pane);
     EXPECT_EQ(PMCountMItems(pane), 0);
     EXPECT_EQ(PMGetSelItem(pane), 0);
+}
+
+TEST_F(PopMPaneTest, ItsProceduresAreFoundByTheirNames) {
+    EXPECT_EQ(dlsym(RTLD_DEFAULT, "PMSelectItem"), static_cast<void *>(&PMSelectItem));
+    EXPECT_EQ(dlsym(RTLD_DEFAULT, "PMGetSelItem"), static_cast<void *>(&PMGetSelItem));
+    EXPECT_EQ(dlsym(RTLD_DEFAULT, "PMCountMItems"), static_cast<void *>(&PMCountMItems));
+    EXPECT_EQ(dlsym(RTLD_DEFAULT, "PMItemIsEnabled"), static_cast<void *>(&PMItemIsEnabled));
+    EXPECT_EQ(dlsym(RTLD_DEFAULT, "PMMenuEnable"), static_cast<void *>(&PMMenuEnable));
+    EXPECT_EQ(dlsym(RTLD_DEFAULT, "PMDeleteMenuItem"), static_cast<void *>(&PMDeleteMenuItem));
+    EXPECT_EQ(dlsym(RTLD_DEFAULT, "PMDeleteAllItems"), static_cast<void *>(&PMDeleteAllItems));
 }
 
 TEST_F(PopMPaneTest, ItsProceduresCanBeReplaced) {
