@@ -1,4 +1,5 @@
 #include "desktop/resources/ContainerIndex.h"
+#include "desktop/resources/Utf.h"
 #include <functional>
 
 namespace {
@@ -31,7 +32,7 @@ std::size_t ContainerIndex::Find(std::u16string_view key, ItemKind kind) const {
         return entry ? entry - 1 : kNotFound;
     }
     for (std::size_t i = 0; i < children.size(); ++i) {
-        if (children[i].kind == kind && children[i].key == key)
+        if (children[i].kind == kind && Utf::SameUnits(children[i].key, key))
             return i;
     }
     return kNotFound;
@@ -43,7 +44,7 @@ std::size_t ContainerIndex::FindSlot(std::u16string_view key, ItemKind kind) con
     std::size_t slot = Hash(key, kind) & mask;
     while (std::uint32_t const entry = slots[slot]) {
         ChildKey const &child = children[entry - 1];
-        if (child.kind == kind && child.key == key)
+        if (child.kind == kind && Utf::SameUnits(child.key, key))
             break;
         slot = (slot + 1) & mask;
     }

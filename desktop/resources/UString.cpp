@@ -2,8 +2,11 @@
 #include "desktop/resources/Utf.h"
 #include <algorithm>
 #include <boost/assert.hpp>
+#include <cstdint>
 #include <cstring>
+#include <limits>
 #include <new>
+#include <stdexcept>
 #include <string>
 #include <string_view>
 #include <unicode/uchar.h>
@@ -12,14 +15,15 @@
 // A block of units with their number before them. The empty string has no block, unless it kept one for
 // reuse.
 struct UString::Rep {
-    std::size_t length;
-    std::size_t capacity;
+    std::uint32_t length;
+    std::uint32_t capacity;
     Unit *Units() { return reinterpret_cast<Unit *>(this + 1); }
 
     static Rep *Make(std::size_t capacity) {
+        if (capacity > std::numeric_limits<std::uint32_t>::max())
+            throw std::length_error("a string of more than 4294967295 units");
         void *block = ::operator new(sizeof(Rep) + capacity * sizeof(Unit));
-        Rep *rep = new (block) Rep{0, capacity};
-        return rep;
+        return new (block) Rep{0, static_cast<std::uint32_t>(capacity)};
     }
     static Rep *Copy(std::u16string_view units) {
         if (units.empty())
@@ -35,7 +39,7 @@ struct UString::Rep {
         if (units.empty())
             return; // an empty view may have no units to point at
         std::memcpy(Units() + length, units.data(), units.size() * sizeof(Unit));
-        length += units.size();
+        length += static_cast<std::uint32_t>(units.size());
     }
 };
 
@@ -66,7 +70,7 @@ UString::UString(char const *bytes, ByteEncoding)
     if (!count)
         return;
     rep = Rep::Make(count);
-    rep->length = count;
+    rep->length = static_cast<std::uint32_t>(count);
     std::transform(bytes, bytes + count, rep->Units(),
                    [](char c) { return UnitOfByte(static_cast<unsigned char>(c)); });
 }
@@ -140,7 +144,7 @@ UString &UString::operator=(UString const &other) {
     return *this;
 }
 
-bool operator==(UString const &a, UString const &b) { return Utf::View(a) == Utf::View(b); }
+bool operator==(UString const &a, UString const &b) { return Utf::SameUnits(Utf::View(a), Utf::View(b)); }
 
 bool operator<(UString const &a, UString const &b) { return Utf::View(a) < Utf::View(b); }
 

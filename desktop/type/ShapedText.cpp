@@ -81,10 +81,16 @@ ShapedText::ShapedText(std::u16string_view text, TextShape const &shape) {
     ascent = metrics.ascent;
     lineHeight = metrics.LineHeight();
     MeasureLines();
+    // A line below the text is drawn by Pango.
+    if (!(shape.font.face & FontFace::kUnderline))
+        KeepGlyphs();
     generation = FontLibrary::Instance().Generation();
 }
 
-ShapedText::~ShapedText() { Replace(nullptr); }
+ShapedText::~ShapedText() {
+    DropGlyphs();
+    Replace(nullptr);
+}
 
 bool ShapedText::IsCurrent() const { return generation == FontLibrary::Instance().Generation(); }
 
@@ -111,12 +117,12 @@ void ShapedText::MeasureLines() {
     lines.reserve(static_cast<std::size_t>(count));
     int below = 0; // ink beneath the last line's box
     for (int i = 0; i < count; ++i) {
-        PangoLayoutLine *glyphs = pango_layout_get_line_readonly(layout, i);
+        PangoLayoutLine *const line = pango_layout_get_line_readonly(layout, i);
         PangoRectangle ink, logical;
-        pango_layout_line_get_pixel_extents(glyphs, &ink, &logical);
+        pango_layout_line_get_pixel_extents(line, &ink, &logical);
         int const lineWidth = std::max(ClampWidth(logical.width), 0);
         lines.push_back(
-            {glyphs, lineWidth, pango_layout_line_get_resolved_direction(glyphs) == PANGO_DIRECTION_RTL});
+            {0, lineWidth, pango_layout_line_get_resolved_direction(line) == PANGO_DIRECTION_RTL});
         width = std::max(width, lineWidth);
         if (ink.width <= 0)
             continue;
@@ -130,6 +136,58 @@ void ShapedText::MeasureLines() {
     // Finer pixels may round outward once more.
     overhang = below + 1;
     rightToLeft = !lines.empty() && lines.front().rightToLeft;
+}
+
+// Takes what drawing needs out of the layout, and gives the layout up. Glyphs that no font has are boxes with
+// their number, which Pango draws: then the layout stays.
+void ShapedText::KeepGlyphs() {
+    for (std::size_t i = 0; i < lines.size(); ++i) {
+        std::size_t const before = runs.size();
+        if (!AddRunsOf(*pango_layout_get_line_readonly(layout, static_cast<int>(i)))) {
+            DropGlyphs();
+            return;
+        }
+        lines[i].runs = static_cast<std::uint32_t>(runs.size() - before);
+    }
+    glyphs.shrink_to_fit();
+    Replace(nullptr);
+}
+
+bool ShapedText::AddRunsOf(PangoLayoutLine const &line) {
+    int h = 0;
+    for (GSList const *node = line.runs; node; node = node->next)
+        if (!AddRun(*static_cast<PangoLayoutRun const *>(node->data), h))
+            return false;
+    return true;
+}
+
+bool ShapedText::AddRun(PangoGlyphItem const &run, int &h) {
+    cairo_scaled_font_t *const font =
+        pango_cairo_font_get_scaled_font(reinterpret_cast<PangoCairoFont *>(run.item->analysis.font));
+    if (!font)
+        return false;
+    runs.push_back({cairo_scaled_font_reference(font), 0});
+    h += run.start_x_offset;
+    for (int i = 0; i < run.glyphs->num_glyphs; ++i) {
+        PangoGlyphInfo const &glyph = run.glyphs->glyphs[i];
+        if (glyph.glyph & PANGO_GLYPH_UNKNOWN_FLAG)
+            return false;
+        if (glyph.glyph != PANGO_GLYPH_EMPTY) {
+            glyphs.push_back(
+                {glyph.glyph, h + glyph.geometry.x_offset, glyph.geometry.y_offset - run.y_offset});
+            ++runs.back().glyphs;
+        }
+        h += glyph.geometry.width;
+    }
+    h += run.end_x_offset;
+    return true;
+}
+
+void ShapedText::DropGlyphs() {
+    for (Run const &run : runs)
+        cairo_scaled_font_destroy(run.font);
+    runs.clear();
+    glyphs.clear();
 }
 
 int ShapedText::LineStart(int lineWidth, int boxWidth, TextSettings::Alignment alignment, bool rightToLeft) {
@@ -148,10 +206,34 @@ int ShapedText::LineStart(int lineWidth, int boxWidth, TextSettings::Alignment a
 
 void ShapedText::Draw(cairo_t *context, int h, int baseline, int boxWidth,
                       TextSettings::Alignment alignment) const {
-    for (Line const &line : lines) {
-        cairo_move_to(context, h + LineStart(line.width, boxWidth, alignment, line.rightToLeft), baseline);
-        pango_cairo_show_layout_line(context, line.glyphs);
+    Run const *run = runs.data();
+    Glyph const *glyph = glyphs.data();
+    for (std::size_t i = 0; i < lines.size(); ++i) {
+        Line const &line = lines[i];
+        int const start = h + LineStart(line.width, boxWidth, alignment, line.rightToLeft);
+        if (layout) {
+            cairo_move_to(context, start, baseline);
+            pango_cairo_show_layout_line(context,
+                                         pango_layout_get_line_readonly(layout, static_cast<int>(i)));
+        } else {
+            DrawRuns(context, run, glyph, line, start, baseline);
+        }
         baseline += lineHeight;
     }
     cairo_new_path(context);
+}
+
+// Moves both pointers behind what the line has.
+void ShapedText::DrawRuns(cairo_t *context, Run const *&run, Glyph const *&glyph, Line const &line, int h,
+                          int baseline) const {
+    constexpr std::size_t kMostOfLabel = 64;
+    boost::container::small_vector<cairo_glyph_t, kMostOfLabel> placed;
+    for (Run const *const end = run + line.runs; run != end; ++run) {
+        placed.clear();
+        for (Glyph const *const last = glyph + run->glyphs; glyph != last; ++glyph)
+            placed.push_back({glyph->index, h + static_cast<double>(glyph->h) / PANGO_SCALE,
+                              baseline + static_cast<double>(glyph->v) / PANGO_SCALE});
+        cairo_set_scaled_font(context, run->font);
+        cairo_show_glyphs(context, placed.data(), static_cast<int>(placed.size()));
+    }
 }

@@ -3,11 +3,15 @@
 #include "desktop/type/FontSpec.h"
 #include "host/Geometry.h"
 #include "host/TextSettings.h"
+#include <boost/container/small_vector.hpp>
+#include <cstdint>
 #include <string>
 #include <string_view>
 #include <vector>
 
 typedef struct _cairo cairo_t;
+typedef struct _cairo_scaled_font cairo_scaled_font_t;
+typedef struct _PangoGlyphItem PangoGlyphItem;
 typedef struct _PangoLayout PangoLayout;
 typedef struct _PangoLayoutLine PangoLayoutLine;
 
@@ -62,17 +66,34 @@ public:
     static int LineStart(int lineWidth, int boxWidth, TextSettings::Alignment, bool rightToLeft);
 
 private:
+    // Places are in units of Pango, from the start of the line and its baseline.
+    struct Glyph {
+        std::uint32_t index;
+        int h, v;
+    };
+    struct Run {
+        cairo_scaled_font_t *font; // holds a reference
+        std::uint32_t glyphs;      // how many
+    };
     struct Line {
-        PangoLayoutLine *glyphs; // the layout's
+        std::uint32_t runs; // how many
         int width;
         bool rightToLeft;
     };
     void Shape(std::u16string_view, TextShape const &);
     void Replace(PangoLayout *);
     void MeasureLines();
+    void KeepGlyphs();
+    bool AddRunsOf(PangoLayoutLine const &);
+    bool AddRun(PangoGlyphItem const &, int &h);
+    void DropGlyphs();
+    void DrawRuns(cairo_t *, Run const *&, Glyph const *&, Line const &, int h, int baseline) const;
 
+    // Only of texts that the glyphs alone do not tell: a layout takes several times their memory.
     PangoLayout *layout = nullptr;
-    std::vector<Line> lines;
+    std::vector<Glyph> glyphs;
+    boost::container::small_vector<Run, 1> runs;
+    boost::container::small_vector<Line, 1> lines;
     int width = 0;
     int inkLeft = 0, inkRight = 0; // from the line starts
     int ascent = 0, lineHeight = 0;

@@ -1,7 +1,9 @@
 #include "desktop/type/ShapedTextCache.h"
 #include "desktop/type/FontLibrary.h"
 #include "desktop/type/TextLru.h"
+#include "desktop/type/TextWidths.h"
 #include <memory>
+#include <optional>
 
 namespace {
 
@@ -20,7 +22,7 @@ struct Caches {
     // Shaped for their widths alone. Those that are drawn soon after, as labels are, move to the texts; the
     // thousands that a list measures do not drive those out.
     TextLru<std::unique_ptr<ShapedText>> measured{kMaxMeasured, kMaxMeasuredUnits};
-    TextLru<int> widths{kMaxWidths, kMaxWidthUnits};
+    TextWidths widths{kMaxWidths, kMaxWidthUnits};
     unsigned int generation = 0;
 };
 
@@ -61,15 +63,18 @@ ShapedText const &ShapedTextCache::GetFitted(std::u16string_view text, TextShape
 
 int ShapedTextCache::Width(std::u16string_view text, TextShape const &shape) {
     Caches &caches = CurrentCaches();
-    if (int const *kept = caches.widths.Find(text, shape))
+    if (std::optional<int> const kept = caches.widths.Find(text, shape))
         return *kept;
-    if (std::unique_ptr<ShapedText> const *shown = caches.texts.Find(text, shape))
-        return caches.widths.Add(text, shape, (*shown)->Width());
+    if (std::unique_ptr<ShapedText> const *shown = caches.texts.Find(text, shape)) {
+        caches.widths.Add(text, shape, (*shown)->Width());
+        return (*shown)->Width();
+    }
     auto shaped = std::make_unique<ShapedText>(text, shape);
     int const width = shaped->Width();
     // Asked for again: shaping may have added fonts.
     Caches &present = CurrentCaches();
     present.measured.Take(text, shape); // its width was forgotten before it
     present.measured.Add(text, shape, std::move(shaped));
-    return present.widths.Add(text, shape, width);
+    present.widths.Add(text, shape, width);
+    return width;
 }

@@ -1,5 +1,6 @@
 // Keeps what was worked out for the texts used last.
 #pragma once
+#include "desktop/resources/Utf.h"
 #include "desktop/type/ShapedText.h"
 #include <cstddef>
 #include <functional>
@@ -62,7 +63,7 @@ private:
     struct Key {
         std::u16string_view text;
         TextShape const *shape;
-        bool operator==(Key const &other) const { return text == other.text && *shape == *other.shape; }
+        bool operator==(Key const &other) const { return Utf::SameUnits(text, other.text) && *shape == *other.shape; }
     };
     struct Hash {
         std::size_t operator()(Key const &key) const {
