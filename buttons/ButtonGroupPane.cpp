@@ -18,6 +18,7 @@
 #include "host/glogRec.h"
 #include <algorithm>
 #include <cstddef>
+#include <iterator>
 
 namespace {
 
@@ -415,10 +416,12 @@ template <class Visit> void ButtonGroupPane::VisitRectsFromLast(Visit const &vis
 
 void ButtonGroupPane::GetButtonBounds(short index, Rect *out) {
     *out = RectOf(buttons[static_cast<std::size_t>(index)]);
-    auto const text = std::find_if(texts.rbegin(), texts.rend(),
-                                   [index](ButtonTextRec const &label) { return label.button == index; });
-    if (text != texts.rend())
-        Unite(*out, RectOf(*text));
+    // The last of the button's labels. A label is added for the last button, so that they are in its order.
+    auto const behind =
+        std::upper_bound(texts.begin(), texts.end(), index,
+                         [](short button, ButtonTextRec const &label) { return button < label.button; });
+    if (behind != texts.begin() && std::prev(behind)->button == index)
+        Unite(*out, RectOf(*std::prev(behind)));
 }
 
 OSRgn *ButtonGroupPane::GetRgn() {

@@ -53,7 +53,8 @@ protected:
 
 private:
     friend class LayoutEngine;
-    Rep *rep;
+    // A Rep, whose fields are the desktop's. Within the item, since a pane may have thousands of parts.
+    alignas(void *) unsigned char rep[48];
 };
 
 // The rectangle of a pane or of a part of one.

@@ -40,6 +40,11 @@ public:
         if (p)
             p->AddRef();
     }
+    // Takes the reference over; the other pointer is null afterwards.
+    RCPtr(RCPtr &&o) noexcept
+        : p(o.p) {
+        o.p = 0;
+    }
     // From a pointer to a derived class.
     template <class U>
     RCPtr(RCPtr<U> const &o)
@@ -54,9 +59,12 @@ public:
     // Releases the former object last, so that assigning what only that object holds is safe.
     RCPtr &operator=(RCPtr const &o) {
         RCPtr t(o);
-        T *q = p;
-        p = t.p;
-        t.p = q;
+        Swap(t);
+        return *this;
+    }
+    RCPtr &operator=(RCPtr &&o) noexcept {
+        RCPtr t(static_cast<RCPtr &&>(o));
+        Swap(t);
         return *this;
     }
 
@@ -67,5 +75,11 @@ public:
     T *get() const { return p; }
 
 private:
+    void Swap(RCPtr &o) noexcept {
+        T *const q = p;
+        p = o.p;
+        o.p = q;
+    }
+
     T *p;
 };

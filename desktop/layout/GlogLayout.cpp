@@ -6,6 +6,9 @@
 #include "host/GlogPane.h"
 #include "host/GlogStyleSheet.h"
 #include <algorithm>
+#include <boost/pool/pool.hpp>
+#include <cstddef>
+#include <new>
 
 namespace {
 
@@ -86,6 +89,27 @@ short *FieldOf(GlogLayoutItem::Attribute attribute, GlogLayoutItem::Rep &rep) {
     return nullptr;
 }
 
+// A pane may have thousands of parts, which are made one after the other and lie close together.
+class RectItem final : public GlogLayoutRectItem {
+public:
+    static void *operator new(std::size_t) {
+        if (void *const block = Blocks().malloc())
+            return block;
+        throw std::bad_alloc();
+    }
+    static void operator delete(void *block) { Blocks().free(block); }
+
+private:
+    // At a time; a pool would otherwise make twice as many each time, and touches all of them.
+    static std::size_t const kFirstBlocks = 32, kMostBlocks = 256;
+
+    // Never destroyed: panes of static lifetime go after everything else.
+    static boost::pool<> &Blocks() {
+        static auto *const blocks = new boost::pool<>(sizeof(RectItem), kFirstBlocks, kMostBlocks);
+        return *blocks;
+    }
+};
+
 } // namespace
 
 GlogLayoutItem::Rep::Further const &GlogLayoutItem::Rep::Unsaid() {
@@ -93,17 +117,20 @@ GlogLayoutItem::Rep::Further const &GlogLayoutItem::Rep::Unsaid() {
     return unsaid;
 }
 
-GlogLayoutItem::GlogLayoutItem()
-    : rep(new Rep) {}
+GlogLayoutItem::GlogLayoutItem() {
+    static_assert(sizeof(rep) == sizeof(Rep) && alignof(Rep) <= alignof(void *), "the room is a Rep's");
+    new (rep) Rep;
+}
 
 GlogLayoutItem::~GlogLayoutItem() {
-    for (RCPtr<GlogLayoutItem> const &child : rep->Rest().children)
-        child->rep->parent = nullptr;
-    delete rep;
+    Rep &own = LayoutEngine::Rep(*this);
+    for (RCPtr<GlogLayoutItem> const &child : own.Rest().children)
+        LayoutEngine::Rep(*child).SetParent(nullptr);
+    own.~Rep();
 }
 
 void GlogLayoutItem::SetAttribute(Attribute attribute, int value, CoordinateType, UString const &) {
-    short *field = FieldOf(attribute, *rep);
+    short *field = FieldOf(attribute, LayoutEngine::Rep(*this));
     short bounded = static_cast<short>(std::clamp(value, -32768, 32767));
     if (!field || *field == bounded)
         return;
@@ -117,25 +144,27 @@ void GlogLayoutItem::SetAttributeFromString(Attribute attribute, UString const &
     if (attribute != kDirection)
         return;
     bool vertical = !(word == Key("horiz"));
-    if (vertical == rep->vertical)
+    Rep &own = LayoutEngine::Rep(*this);
+    if (vertical == own.vertical)
         return;
-    rep->vertical = vertical;
+    own.vertical = vertical;
     LayoutEngine::Invalidate(*this);
 }
 
 Rect GlogLayoutItem::GetBorderRect() {
-    if (rep->isPart && rep->pane)
-        return PlaceOfPart(*rep);
+    Rep const &own = LayoutEngine::Rep(*this);
+    if (own.isPart && own.pane)
+        return PlaceOfPart(own);
     LayoutEngine::SettleFor(*this);
-    return SettledPlace(*rep);
+    return SettledPlace(own);
 }
 
-char const *GlogLayoutItem::GetName() const { return rep->Rest().name.c_str(); }
+char const *GlogLayoutItem::GetName() const { return LayoutEngine::Rep(*this).Rest().name.c_str(); }
 
 Rect GlogLayoutRectItem::GetItemRect() {
     Rect border = GetBorderRect();
     GlogLayoutItem::Rep const &own = LayoutEngine::Rep(*this);
-    return own.hasInner ? MovedTo(own.inner, border) : border;
+    return own.hasInner ? MovedTo(own.Inner(), border) : border;
 }
 
 void GlogLayoutRectItem::ReadLayoutProperties(int, GlogStyleSheet *sheet) {
@@ -165,7 +194,7 @@ void GlogLayoutGroup::MoveItem(RCPtr<GlogLayoutItem> const &item, int index) {
 
 void GlogLayoutGroup::ReplaceItem(RCPtr<GlogLayoutItem> const &old, RCPtr<GlogLayoutItem> const &item) {
     RCPtr<GlogLayoutItem> const replaced = old, added = item; // the parameters may be the very entries
-    if (!replaced.get() || LayoutEngine::Rep(*replaced).parent != this || added.get() == replaced.get())
+    if (!replaced.get() || LayoutEngine::Rep(*replaced).Parent() != this || added.get() == replaced.get())
         return;
     if (added.get())
         LayoutEngine::TakeOut(*added);
@@ -205,16 +234,14 @@ RCPtr<GlogLayoutItem> GlogLayoutGroup::FindItemByName(char const *name) {
     return RCPtr<GlogLayoutItem>();
 }
 
-GlogStyleSheet *GlogLayoutGroup::GetStyleSheet() const {
-    return LayoutEngine::Rep(const_cast<GlogLayoutGroup &>(*this)).Rest().styleSheet;
-}
+GlogStyleSheet *GlogLayoutGroup::GetStyleSheet() const { return LayoutEngine::Rep(*this).Rest().styleSheet; }
 
 void GlogLayoutGroup::SetStyleSheet(GlogStyleSheet *sheet) {
     LayoutEngine::Rep(*this).OwnRest().styleSheet = sheet;
 }
 
 RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect place, int id, int index, char const *name) {
-    RCPtr<GlogLayoutRectItem> item(new GlogLayoutRectItem);
+    RCPtr<GlogLayoutRectItem> item(new RectItem);
     GlogLayoutItem::Rep &rep = LayoutEngine::Rep(*item);
     rep.made = place;
     rep.index = std::clamp(index, 0, kLastIndex);
@@ -228,8 +255,7 @@ RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect place, int id, int index
 RCPtr<GlogLayoutRectItem> GlogLayout::MakeRectItem(Rect inner, Rect outer, int id, int index,
                                                    char const *name) {
     RCPtr<GlogLayoutRectItem> item = MakeRectItem(outer, id, index, name);
-    LayoutEngine::Rep(*item).inner = inner;
-    LayoutEngine::Rep(*item).hasInner = true;
+    LayoutEngine::Rep(*item).SetInner(inner);
     return item;
 }
 

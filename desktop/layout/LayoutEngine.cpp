@@ -49,7 +49,7 @@ RCPtr<GlogLayoutGroup> LayoutEngine::MakeForContainer(CompoundPane *owner) {
 }
 
 void LayoutEngine::Append(GlogLayoutGroup &group, RCPtr<GlogLayoutItem> const &item, int index) {
-    for (GlogLayoutItem *outer = &group; outer; outer = Rep(*outer).parent)
+    for (GlogLayoutItem *outer = &group; outer; outer = Rep(*outer).Parent())
         if (outer == item.get())
             return; // a group cannot lie in itself
     TakeOut(*item);
@@ -57,12 +57,12 @@ void LayoutEngine::Append(GlogLayoutGroup &group, RCPtr<GlogLayoutItem> const &i
     auto position =
         index < 0 || index > static_cast<int>(children.size()) ? children.end() : children.begin() + index;
     children.insert(position, item);
-    Rep(*item).parent = &group;
+    Rep(*item).SetParent(&group);
     Invalidate(group);
 }
 
 void LayoutEngine::TakeOut(GlogLayoutItem &item) {
-    GlogLayoutItem *parent = Rep(item).parent;
+    GlogLayoutItem *parent = Rep(item).Parent();
     if (!parent)
         return;
     auto &children = Rep(*parent).OwnRest().children;
@@ -71,7 +71,7 @@ void LayoutEngine::TakeOut(GlogLayoutItem &item) {
     RCPtr<GlogLayoutItem> keep(&item);
     if (found != children.end())
         children.erase(found);
-    Rep(item).parent = nullptr;
+    Rep(item).SetParent(nullptr);
     Rep(item).hasPlace = false;
     Invalidate(*parent);
 }
@@ -85,8 +85,8 @@ void LayoutEngine::PaneGone(GlogLayoutItem &item) {
 
 void LayoutEngine::Invalidate(GlogLayoutItem &item) {
     GlogLayoutItem *outermost = &item;
-    while (Rep(*outermost).parent)
-        outermost = Rep(*outermost).parent;
+    while (Rep(*outermost).Parent())
+        outermost = Rep(*outermost).Parent();
     if (CompoundPane *owner = Rep(*outermost).Rest().owner)
         PaneAccess::InvalidateLayout(*owner);
     else if (GlogPane *pane = Rep(*outermost).pane)
@@ -95,8 +95,8 @@ void LayoutEngine::Invalidate(GlogLayoutItem &item) {
 
 void LayoutEngine::SettleFor(GlogLayoutItem &item) {
     GlogLayoutItem *outermost = &item;
-    while (Rep(*outermost).parent)
-        outermost = Rep(*outermost).parent;
+    while (Rep(*outermost).Parent())
+        outermost = Rep(*outermost).Parent();
     GlogPane *pane = Rep(*outermost).pane;
     if (!pane)
         pane = Rep(*outermost).Rest().owner;
@@ -149,7 +149,7 @@ LayoutEngine::Extent LayoutEngine::Measure(GlogLayoutItem &item) {
     if (rep.width <= 0 || rep.height <= 0) {
         Extent inside = rep.isGroup ? MeasureGroup(rep) : MeasurePane(rep);
         // A container's own group keeps its insets inside, since nothing lies round it.
-        if (rep.isGroup && !rep.parent) {
+        if (rep.isGroup && !rep.Parent()) {
             inside.width += rep.insetLeft + rep.insetRight;
             inside.height += rep.insetTop + rep.insetBottom;
         }
@@ -173,7 +173,7 @@ void LayoutEngine::Place(GlogLayoutItem &item, Rect const &place) {
 void LayoutEngine::PlaceGroup(GlogLayoutItem::Rep &group) {
     Along along{group.vertical}, across{!group.vertical};
     Rect inside = group.Rest().place;
-    if (!group.parent)
+    if (!group.Parent())
         inside = {Pixels(inside.top + group.insetTop), Pixels(inside.left + group.insetLeft),
                   Pixels(inside.bottom - group.insetBottom), Pixels(inside.right - group.insetRight)};
 

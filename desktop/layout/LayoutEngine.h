@@ -2,6 +2,7 @@
 #pragma once
 #include "desktop/layout/LayoutItemRep.h"
 #include "host/Geometry.h"
+#include <new>
 
 class CompoundPane;
 class GlogPane;
@@ -11,7 +12,12 @@ struct glogRec;
 // before the next drawing or the next question for a place.
 class LayoutEngine {
 public:
-    static GlogLayoutItem::Rep &Rep(GlogLayoutItem &item) { return *item.rep; }
+    static GlogLayoutItem::Rep &Rep(GlogLayoutItem &item) {
+        return *std::launder(reinterpret_cast<GlogLayoutItem::Rep *>(item.rep));
+    }
+    static GlogLayoutItem::Rep const &Rep(GlogLayoutItem const &item) {
+        return *std::launder(reinterpret_cast<GlogLayoutItem::Rep const *>(item.rep));
+    }
     static void Settle(glogRec *);
     static void Invalidate(GlogLayoutItem &); // what the item lies in must be settled anew
     static void SettleFor(GlogLayoutItem &);  // before its place is told

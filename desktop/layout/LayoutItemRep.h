@@ -24,22 +24,21 @@ struct GlogLayoutItem::Rep {
         CompoundPane *owner = nullptr;        // of the outermost group of a pane
         GlogStyleSheet *styleSheet = nullptr; // a group's; not owned
         std::vector<RCPtr<GlogLayoutItem>> children;
+        GlogLayoutItem *parent = nullptr; // of an item with an inner rectangle
     };
 
     // Panes with thousands of parts ask all of them where they lie, so that all this fits into one line of
     // the processor's cache.
     GlogPane *pane = nullptr;    // whose rectangle or part this is; null once the pane is gone
     Rect made{0, 0, 0, 0};       // where the item stood when it was made
-    Rect inner{0, 0, 0, 0};      // of two nested rectangles, the inner one, from the top left of the outer
     short width = 0, height = 0; // natural size; 0 or less: not told, the made rectangle counts
     short insetTop = 0, insetLeft = 0, insetBottom = 0, insetRight = 0;
-    bool isPart : 1; // a sub-item of `pane`
-    bool hasInner : 1;
+    bool isPart : 1;   // a sub-item of `pane`
+    bool hasInner : 1; // see Inner
     bool hasPlace : 1; // the further place counts
     bool isGroup : 1;
-    bool vertical : 1;                // a group's direction
-    int index : 27;                   // among the parts of a pane
-    GlogLayoutItem *parent = nullptr; // the group that holds the item
+    bool vertical : 1; // a group's direction
+    int index : 27;    // among the parts of a pane
 
     Rep()
         : isPart(false)
@@ -47,7 +46,18 @@ struct GlogLayoutItem::Rep {
         , hasPlace(false)
         , isGroup(false)
         , vertical(true)
-        , index(0) {}
+        , index(0)
+        , parent(nullptr) {}
+    // The group that holds the item.
+    GlogLayoutItem *Parent() const { return hasInner ? Rest().parent : parent; }
+    void SetParent(GlogLayoutItem *group) { (hasInner ? OwnRest().parent : parent) = group; }
+    // Of two nested rectangles, the inner one, from the top left of the outer. It is set before the item has
+    // a parent.
+    Rect Inner() const { return hasInner ? inner : Rect{0, 0, 0, 0}; }
+    void SetInner(Rect const &r) {
+        hasInner = true;
+        inner = r;
+    }
     // As they are, or what they are when nothing was said.
     Further const &Rest() const { return further ? *further : Unsaid(); }
     // To be changed.
@@ -59,5 +69,10 @@ struct GlogLayoutItem::Rep {
 
 private:
     static Further const &Unsaid();
+
+    union {
+        Rect inner;             // when there is one: a part of a pane, and in no group as a rule
+        GlogLayoutItem *parent; // otherwise
+    };
     std::unique_ptr<Further> further;
 };

@@ -111,7 +111,7 @@ void PaneAccess::EnsureLayoutItems(GlogPane &pane) {
 void PaneAccess::JoinLayout(GlogPane &pane) {
     if (!pane.container || !pane.container->compoundRep->layout.get() || !pane.rep->layoutItem.get())
         return;
-    if (!LayoutEngine::Rep(*pane.rep->layoutItem).parent)
+    if (!LayoutEngine::Rep(*pane.rep->layoutItem).Parent())
         LayoutEngine::Append(*pane.container->compoundRep->layout, pane.rep->layoutItem, -1);
 }
 

@@ -39,7 +39,7 @@ TEST_F(GroupParts, AButtonMadeInCodeHasAnItemWithItsIconInTheMiddleOfTheLine) {
     group->AddSpecialButton(30, 60, 5);
     GlogLayoutItem::Rep const &item = ItemOf(*group, 1);
     EXPECT_EQ(item.made, (Rect{60, 30, 78, 45}));
-    EXPECT_EQ(item.inner, (Rect{3, 0, 16, 12}));
+    EXPECT_EQ(item.Inner(), (Rect{3, 0, 16, 12}));
     EXPECT_EQ(item.insetTop, 2);
     EXPECT_EQ(item.Rest().id, -1);
     EXPECT_EQ(item.index, 1);
@@ -55,7 +55,7 @@ TEST_F(GroupParts, HalfALineIsRoundedTowardsZero) {
         UseSpacing(row.spacing);
         CheckBoxPane *const group = NewBoxes();
         group->AddSpecialButton(0, 0, 0);
-        EXPECT_EQ(ItemOf(*group, 0).inner, (Rect{row.top, 0, static_cast<short>(row.top + 13), 12}))
+        EXPECT_EQ(ItemOf(*group, 0).Inner(), (Rect{row.top, 0, static_cast<short>(row.top + 13), 12}))
             << row.spacing;
     }
 }
@@ -83,7 +83,7 @@ TEST_F(GroupParts, OfAResourceEachButtonsItemPrecedesThoseOfItsLabels) {
     for (std::size_t i = 0; i < 5; ++i)
         EXPECT_EQ(ItemOf(*group, i).index, static_cast<int>(i));
     EXPECT_EQ(ItemOf(*group, 0).made, (Rect{10, 20, 23, 37}));
-    EXPECT_EQ(ItemOf(*group, 0).inner, (Rect{3, 0, 16, 12}));
+    EXPECT_EQ(ItemOf(*group, 0).Inner(), (Rect{3, 0, 16, 12}));
     EXPECT_EQ(ItemOf(*group, 0).insetTop, 2);
     EXPECT_EQ(ItemOf(*group, 3).made, (Rect{60, 20, 73, 32}));
     short const top = static_cast<short>(40 - InfoOf(0).ascent);

@@ -1,6 +1,7 @@
 #include "host/RCPtr.h"
 #include <gtest/gtest.h>
 #include <type_traits>
+#include <utility>
 
 namespace {
 
@@ -30,6 +31,8 @@ protected:
 };
 
 static_assert(!std::is_copy_constructible<Counted>::value, "the count is the object's own");
+static_assert(std::is_nothrow_move_constructible<RCPtr<Counted>>::value,
+              "a growing vector moves its pointers, and touches none of the objects");
 static_assert(std::is_convertible<Counted *, RCPtr<Counted>>::value,
               "a fresh object is handed over as it is");
 static_assert(std::is_convertible<RCPtr<Derived>, RCPtr<Counted>>::value, "");
@@ -87,6 +90,18 @@ TEST_F(RCPtrTest, ReachesTheObject) {
     RCPtr<Counted> const pointer(new Counted(living));
     EXPECT_EQ(&*pointer, pointer.get());
     EXPECT_EQ(pointer->next.get(), nullptr);
+}
+
+TEST_F(RCPtrTest, HandsItsReferenceOver) {
+    RCPtr<Counted> from(new Counted(living));
+    Counted *const object = from.get();
+    RCPtr<Counted> to(std::move(from));
+    EXPECT_EQ(from.get(), nullptr); // NOLINT(bugprone-use-after-move)
+    EXPECT_EQ(to.get(), object);
+    RCPtr<Counted> other(new Counted(living));
+    other = std::move(to);
+    EXPECT_EQ(other.get(), object);
+    EXPECT_EQ(living, 1) << "what it held before is gone";
 }
 
 TEST_F(RCPtrTest, AReferenceTakenByHandCounts) {
