@@ -48,6 +48,7 @@ LIBRARIES = (
     ("the operating system", r"(unistd|fcntl|dlfcn|cxxabi|poll|pthread|execinfo)\.h|(sys|linux)/.*", None,
      ("desktop/", "artwork/", "tools/")),
     ("SDL", r"SDL.*", r"\bSDL_\w+", ("desktop/windows/Sdl",)),
+    ("X", r"X11/.*", None, ("desktop/windows/Sdl", "bench/")),
     ("Cairo", r"(cairo/)?cairo.*\.h", r"\b_?cairo_\w+|\bCAIRO_\w+",
      ("desktop/drawing/", "desktop/type/", "desktop/editing/", "desktop/printing/", "artwork/compiler/")),
     ("pixman", r"(pixman-1/)?pixman.*\.h", r"\bpixman_\w+|\bPIXMAN_\w+",

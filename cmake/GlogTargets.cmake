@@ -22,6 +22,10 @@ function(glog_library name)
   target_compile_definitions(${name} PUBLIC BOOST_ENABLE_ASSERT_HANDLER)
   target_compile_features(${name} PUBLIC cxx_std_17)
   target_link_libraries(${name} PRIVATE $<BUILD_INTERFACE:glog_flags>)
+  # A library calls its own functions straight, not through a table where others could put theirs. What programs may
+  # replace are variables.
+  target_compile_options(${name} PRIVATE -fno-semantic-interposition)
+  target_link_options(${name} PRIVATE -Wl,-Bsymbolic-functions)
 endfunction()
 
 # glog_program(NAME SOURCES...): a program of this tree.

@@ -58,17 +58,13 @@ void SdlCapture::IgnoreEntering() {
         XWindow(windows.front()->Raw()).Synchronize();
 }
 
-void SdlCapture::Hold(bool withoutButton) {
+void SdlCapture::Hold() {
+    holds = true;
     IgnoreEntering();
     SDL_PumpEvents(); // an entering that has come before ends the grab now, not afterwards
     SDL_CaptureMouse(SDL_FALSE);
-    SDL_SetHintWithPriority(SDL_HINT_MOUSE_AUTO_CAPTURE, "0", SDL_HINT_OVERRIDE);
-    SDL_SetHintWithPriority(SDL_HINT_MOUSE_AUTO_CAPTURE, "1", SDL_HINT_OVERRIDE);
-    if (withoutButton)
-        OutlastButtons();
+    SDL_CaptureMouse(SDL_TRUE);
 }
-
-void SdlCapture::OutlastButtons() { SDL_CaptureMouse(SDL_TRUE); }
 
 void SdlCapture::Forget(SdlWindow const *window) {
     ignoring.erase(window->Raw());
@@ -77,6 +73,7 @@ void SdlCapture::Forget(SdlWindow const *window) {
 
 // SDL asks the server nothing when it does not have the capture.
 void SdlCapture::End() {
+    holds = false;
     SDL_CaptureMouse(SDL_FALSE);
     for (SDL_Window *window : ignoring)
         XWindow(window).Select(eventMasks[window]);

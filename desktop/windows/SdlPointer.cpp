@@ -1,4 +1,5 @@
 #include "desktop/windows/SdlPointer.h"
+#include "desktop/windows/SdlScreen.h"
 #include "desktop/windows/SdlWindow.h"
 #include <SDL.h>
 
@@ -29,10 +30,13 @@ SdlWindow *SdlPointer::Target(SdlWindow *window) const {
     return held != 0 ? pressWindow : window;
 }
 
-// SDL tells only of places in its windows; of others the X server is asked.
+// SDL tells only of places in its windows; of others the X server is asked. Without a capture SDL moves
+// places outside to the window's edge: when a drag leaves the window before its press is captured, and when
+// it ends outside.
 void SdlPointer::SetScreenPlace(SdlWindow *window, int x, int y) {
-    if (window == nullptr) {
-        SDL_GetGlobalMouseState(&screenX, &screenY);
+    bool const maybeOutside = held != 0 || hover == nullptr;
+    if (window == nullptr || (maybeOutside && window->IsAtEdge(x, y))) {
+        SdlScreen::GetMousePlace(screenX, screenY);
         return;
     }
     screenX = window->ScreenX() + x;
@@ -57,8 +61,12 @@ void SdlPointer::Enter(InputEvent event, SdlWindow *window) {
     hover = window;
 }
 
+bool SdlPointer::IsOver(SdlWindow const &window) const {
+    return window.Contains(window.ContentH(screenX), window.ContentV(screenY));
+}
+
 void SdlPointer::LeaveIfOutside(InputEvent event) {
-    if (hover == nullptr || hover->Contains(hover->ContentH(screenX), hover->ContentV(screenY)))
+    if (hover == nullptr || IsOver(*hover))
         return;
     Send(event, InputEvent::kMouseLeave, hover);
     hover = nullptr;
@@ -69,6 +77,8 @@ void SdlPointer::Move(InputEvent event, SdlWindow *window, SDL_MouseMotionEvent 
     if (target == nullptr)
         return;
     SetScreenPlace(window, motion.x, motion.y);
+    if (held == 0 && capture == nullptr && !IsOver(*target))
+        return;
     Enter(event, target);
     Send(event, InputEvent::kMouseMove, target);
 }
@@ -84,8 +94,8 @@ void SdlPointer::Press(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent
     bool first = held == 0;
     held |= Bit(button);
     // Of a quick click SDL has taken the release together with the press: nothing is left to be captured.
-    if (first && SDL_GetMouseState(nullptr, nullptr) != 0)
-        HoldCapture();
+    if (first && !HasBeenReleased())
+        sdlCapture.Hold();
     event.button = button;
     Place(event, target);
     event.clicks = clicks = clickCounter.Count(event);
@@ -119,8 +129,6 @@ void SdlPointer::ReleaseAll(InputEvent event) {
     EndCapture();
 }
 
-void SdlPointer::HoldCapture() { sdlCapture.Hold(capture != nullptr); }
-
 void SdlPointer::EndCapture() {
     if (held == 0 && capture == nullptr)
         sdlCapture.End();
@@ -147,7 +155,7 @@ void SdlPointer::Leave(InputEvent event, SdlWindow *window) {
 
 void SdlPointer::Recapture() {
     if (held != 0 || capture != nullptr)
-        HoldCapture();
+        sdlCapture.Hold();
 }
 
 void SdlPointer::Capture(InputEvent event, SdlWindow *window) {
@@ -164,13 +172,17 @@ void SdlPointer::Capture(InputEvent event, SdlWindow *window) {
     LeaveIfOutside(event);
 }
 
-// Taking the capture anew costs the server half a dozen questions, at every press.
+// Taking the capture costs the server half a dozen questions. The press of a quick click wants it only until
+// the release, which has come already.
 void SdlPointer::CaptureFor(SdlWindow *window) {
-    if (held != 0)
-        sdlCapture.OutlastButtons();
-    else if (!queue.HasRelease(window)) // of a quick click, after which the capture ends
-        HoldCapture();
+    bool const isQuickClick =
+        held == 0 ? queue.HasRelease(window) : window == pressWindow && HasBeenReleased();
+    if (!isQuickClick && !sdlCapture.Holds())
+        sdlCapture.Hold();
 }
+
+// All that was pressed, though the event of it may not have been taken yet.
+bool SdlPointer::HasBeenReleased() { return SDL_GetMouseState(nullptr, nullptr) == 0; }
 
 void SdlPointer::Forget(SdlWindow const *window) {
     if (hover == window)

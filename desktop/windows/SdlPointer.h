@@ -43,10 +43,11 @@ private:
     void Place(InputEvent &, SdlWindow *) const;
     void Send(InputEvent &, InputEvent::Kind, SdlWindow *);
     void Enter(InputEvent, SdlWindow *);
+    bool IsOver(SdlWindow const &) const;
     void LeaveIfOutside(InputEvent);
     void ReleaseButton(InputEvent, int button);
     void CaptureFor(SdlWindow *);
-    void HoldCapture();
+    static bool HasBeenReleased();
     void EndCapture();
 
     InputQueue &queue;

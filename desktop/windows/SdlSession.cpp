@@ -1,4 +1,5 @@
 #include "desktop/windows/SdlSession.h"
+#include "desktop/windows/SdlScreen.h"
 #include <SDL.h>
 #include <SDL_syswm.h>
 #include <cstring>
@@ -27,8 +28,9 @@ static Hint const kHints[] = {
     // A click that brings the window to the front works on the control under it too: mixers stand beside
     // other windows.
     {SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1"},
-    // A drag that leaves the window goes on.
-    {SDL_HINT_MOUSE_AUTO_CAPTURE, "1"},
+    // SDL would ask the server half a dozen questions at every press, even when the button has come up
+    // already. The mouse is captured for those that last.
+    {SDL_HINT_MOUSE_AUTO_CAPTURE, "0"},
     // The desktop decides when the program ends.
     {SDL_HINT_QUIT_ON_LAST_WINDOW_CLOSE, "0"},
     // SIGINT and SIGTERM end the program as the session's end does.
@@ -83,6 +85,7 @@ SdlSession::SdlSession() {
 }
 
 SdlSession::~SdlSession() {
+    SdlScreen::Forget();
     SDL_QuitSubSystem(SDL_INIT_VIDEO);
     XSetErrorHandler(theHandlerBeforeSdl);
 }

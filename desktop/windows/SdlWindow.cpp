@@ -1,6 +1,7 @@
 #include "desktop/windows/SdlWindow.h"
 #include "desktop/drawing/Surface.h"
 #include "desktop/drawing/WholePixels.h"
+#include "desktop/windows/SdlScreen.h"
 #include "desktop/windows/SdlWindowSystem.h"
 #include <SDL.h>
 #include <algorithm>
@@ -29,6 +30,7 @@ static SDL_Window *MakeWindow(WindowSpec const &spec, DeviceScale scale) {
                                           std::max(scale.Edge(spec.height), 1), WindowFlags(spec));
     if (window == nullptr)
         throw std::runtime_error("cannot open the window \"" + spec.title + "\": " + SDL_GetError());
+    SdlScreen::IgnoreOtherWindowsMouse(window);
     return window;
 }
 
@@ -52,6 +54,12 @@ SdlWindow::~SdlWindow() {
 }
 
 int SdlWindow::Display() const { return std::max(SDL_GetWindowDisplayIndex(window), 0); }
+
+bool SdlWindow::IsAtEdge(int x, int y) const {
+    int deviceWidth = 0, deviceHeight = 0;
+    SDL_GetWindowSize(window, &deviceWidth, &deviceHeight);
+    return x == 0 || y == 0 || x == deviceWidth - 1 || y == deviceHeight - 1;
+}
 
 int SdlWindow::ScreenX() const {
     int x = 0;

@@ -30,6 +30,7 @@ public:
     // The content's logical pixel at a place of the screen in device pixels.
     int ContentH(int screenX) const { return scale.ToLogical(screenX - ScreenX()); }
     int ContentV(int screenY) const { return scale.ToLogical(screenY - ScreenY()); }
+    bool IsAtEdge(int x, int y) const; // of the content, in device pixels from its top left
     bool Contains(int h, int v) const { return h >= 0 && v >= 0 && h < width && v < height; }
 
     // The window manager has shown the window, and its frame's size is known: brings the content, not the

@@ -1,5 +1,6 @@
 #include "desktop/windows/SdlWindowSystem.h"
 #include "desktop/drawing/WholePixels.h"
+#include "desktop/windows/SdlScreen.h"
 #include "desktop/windows/SdlWindow.h"
 #include <SDL.h>
 #include <algorithm>
@@ -113,7 +114,9 @@ bool SdlWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter, char 
         double left = timeout < 0 ? kLongestBlock : end - Now();
         if (!(left > 0)) // also true for what is not a number
             return false;
-        Block(left);
+        bool const came = Block(left);
+        if (!came && timeout >= 0 && end <= Now())
+            return false;
     }
 }
 
@@ -126,17 +129,21 @@ bool SdlWindowSystem::TakeEvent(InputEvent &event) {
     return false;
 }
 
-void SdlWindowSystem::Block(double seconds) {
+// Whether something came. SDL has looked for it once more when nothing did.
+bool SdlWindowSystem::Block(double seconds) {
     if (windows.empty() && waker == nullptr)
         OpenWaker();
     double longest = keyboard.MustAskInputMethod() ? kInputMethodInterval : kLongestBlock;
     // Rounded up: a rest of less than a millisecond would be waited for without blocking.
     int milliseconds = static_cast<int>(std::ceil(std::min(seconds, longest) * kMillisecondsPerSecond));
-    SDL_WaitEventTimeout(nullptr, milliseconds);
+    return SDL_WaitEventTimeout(nullptr, milliseconds) != 0;
 }
 
 // SDL blocks only while there is a window of its own, and polls a thousand times a second otherwise.
-void SdlWindowSystem::OpenWaker() { waker = SDL_CreateWindow("", 0, 0, 1, 1, SDL_WINDOW_HIDDEN); }
+void SdlWindowSystem::OpenWaker() {
+    waker = SDL_CreateWindow("", 0, 0, 1, 1, SDL_WINDOW_HIDDEN);
+    SdlScreen::IgnoreOtherWindowsMouse(waker);
+}
 
 // Takes over everything that SDL knows, so that moves of the mouse can take each other's place.
 void SdlWindowSystem::Pump() {
@@ -245,7 +252,7 @@ Point SdlWindowSystem::MousePlace(PlatformWindow const &asked) const {
     if (state.PointerWindow() == &window)
         return {SaturatedPixel(state.PointerV()), SaturatedPixel(state.PointerH())};
     int x = 0, y = 0;
-    SDL_GetGlobalMouseState(&x, &y);
+    SdlScreen::GetMousePlace(x, y);
     return {SaturatedPixel(window.ContentV(y)), SaturatedPixel(window.ContentH(x))};
 }
 

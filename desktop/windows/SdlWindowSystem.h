@@ -68,7 +68,7 @@ private:
     void TranslateWindowEvent(SDL_WindowEvent const &);
     void TranslateTextEvent(SDL_Event const &);
     bool TakeEvent(InputEvent &);
-    void Block(double seconds);
+    bool Block(double seconds);
     void OpenWaker();
 
     SdlSession session;

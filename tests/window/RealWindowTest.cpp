@@ -338,6 +338,22 @@ TEST_F(Wait, WithoutAnyWindowWakesUpForNothingEither) {
     EXPECT_LE(Switches() - before, 20);
 }
 
+TEST_F(Wait, IsNotDisturbedByTheMouseOverOtherWindows) {
+    Window window = Open(At(200, 150, 300, 200));
+    Do("mousemove 5 5");
+    Drain();
+    std::string steps;
+    for (int i = 0; i < 100; ++i)
+        steps += " mousemove " + std::to_string(10 + i) + " 10 sleep 0.005";
+    InputEvent event;
+    long before = Switches();
+    ASSERT_EQ(std::system(("xdotool" + steps + " &").c_str()), 0);
+    EXPECT_FALSE(System().WaitEvent(event, 3.0, WindowSystem::Waiter::kMainLoop, "a test"));
+    EXPECT_LE(Switches() - before, 30);
+    EXPECT_NE(RunBeside("xdotool getmouselocation").find("x:109 y:10 "), std::string::npos)
+        << "it has moved all the way meanwhile";
+}
+
 TEST_F(Wait, WithTextInputOnWakesUpForNothingEither) {
     Window window = Open(At(200, 150, 300, 200));
     window->StartTextInput({0, 0, 20, 1});

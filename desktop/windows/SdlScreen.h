@@ -1,0 +1,21 @@
+// The X server that SDL's windows are on.
+#pragma once
+
+struct SDL_Window;
+
+namespace SdlScreen {
+
+// To be called for every window of SDL that is made; only the first one of a session has an effect. SDL asks
+// the server for every movement and press of the mouse on the whole screen, and so wakes the program whenever
+// the mouse moves anywhere: the server is told that these are not wanted. What concerns the windows comes as
+// before.
+void IgnoreOtherWindowsMouse(SDL_Window *);
+
+// Where the mouse is, in device pixels. The server is asked: SDL keeps a place that those events would renew.
+// (0, 0) while there has been no window.
+void GetMousePlace(int &x, int &y);
+
+// SDL has given up its connection to the server.
+void Forget();
+
+} // namespace SdlScreen
