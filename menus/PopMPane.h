@@ -37,8 +37,8 @@ public:
     // Draws and clicks in the pane's place where it sets `handled`, which every operation finds false. Those
     // that are not overridden leave everything to the pane.
     class Agent {
-    public:
-        virtual ~Agent() {}
+    protected:
+        ~Agent() {} // nobody deletes an agent as one
 
     private:
         friend class PopMPane;

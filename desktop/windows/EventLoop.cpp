@@ -18,6 +18,12 @@ double const kActivatingShowWindow = 1.0;
 
 bool IsRelease(InputEvent const &event) { return event.kind == InputEvent::kMouseUp && event.button == 1; }
 
+// What a menu takes while it is open.
+bool IsInput(InputEvent::Kind kind) {
+    return kind == InputEvent::kMouseDown || kind == InputEvent::kMouseUp || kind == InputEvent::kMouseMove ||
+           kind == InputEvent::kWheel || kind == InputEvent::kKeyDown || kind == InputEvent::kTextInput;
+}
+
 bool Drags(InputEvent const &event) { return event.kind == InputEvent::kMouseMove || IsRelease(event); }
 
 } // namespace
@@ -62,7 +68,7 @@ bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter wa
                      PlatformWindow *const *needed) {
     for (;;) {
         RunIdleWork();
-        if (needed && (quitting || !*needed))
+        if (needed && (quitting || !*needed || !pointer.empty()))
             return false;
         if (waiter == WindowSystem::Waiter::kMainLoop && MainLoopIsOver(deadline))
             return false;
@@ -279,6 +285,10 @@ void EventLoop::Sort(InputEvent const &event) {
     PortKeeper const keeper;
     if (HandleWindowEvent(event))
         return;
+    if (menuWindow && IsInput(event.kind)) {
+        pointer.push_back(event); // an open menu takes it when it has its turn again
+        return;
+    }
     // What follows the release belongs to the next press, which waits too.
     bool const released = !pointer.empty() && IsRelease(pointer.back());
     if (heldWindow && !released && Drags(event))
@@ -356,6 +366,7 @@ bool EventLoop::ButtonStillDown() {
 void EventLoop::BeginMenu(PlatformWindow *window) {
     menuWindow = window;
     helpTags->Hide();
+    windows.SetCursor(Cursors::kArrow);
     windows.CaptureMouse(window);
 }
 
@@ -369,14 +380,16 @@ void EventLoop::EndMenu() {
 bool EventLoop::NextMenuEvent(double deadline, InputEvent &event) {
     if (MenuIsOver())
         return false;
-    if (!pointer.empty()) {
-        event = pointer.front();
-        pointer.pop_front();
-    } else if (!Take(event, deadline, WindowSystem::Waiter::kModal, "an open menu", &menuWindow)) {
-        return false;
-    } else {
+    bool const taken =
+        pointer.empty() && Take(event, deadline, WindowSystem::Waiter::kModal, "an open menu", &menuWindow);
+    if (taken) {
         PortKeeper const keeper;
         HandleWindowEvent(event);
+    } else if (!MenuIsOver() && !pointer.empty()) {
+        event = pointer.front();
+        pointer.pop_front();
+    } else {
+        return false;
     }
     if (event.kind == InputEvent::kCloseRequested || event.kind == InputEvent::kQuit)
         deferred.push_back(event);

@@ -66,8 +66,9 @@ public:
 private:
     void RunIdleWork();
     bool MainLoopIsOver(double deadline) const;
-    // Takes one event, or none when the time is over; with `needed` also none when that has become null or
-    // the loop was told to quit. Draws what is damaged before it blocks.
+    // Takes one event, or none when the time is over. With `needed` also none when that has become null, the
+    // loop was told to quit, or something else has put input aside in `pointer` meanwhile. Draws what is
+    // damaged before it blocks.
     bool Take(InputEvent &, double deadline, WindowSystem::Waiter, char const *what,
               PlatformWindow *const *needed = nullptr);
     // In a nested loop: window events are handled, pointer events go to `pointer`, everything else waits for

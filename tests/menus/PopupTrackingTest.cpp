@@ -2,6 +2,7 @@
 #include "desktop/menus/MenuRows.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/windows/SimulatedWindowSystem.h"
+#include "host/Services.h"
 #include "tests/menus/MenuTest.h"
 #include <boost/make_shared.hpp>
 
@@ -588,6 +589,22 @@ TEST_F(PopupTracking, ItsHandleMayBeClearedWhileItIsOpen) {
     auto const change = After(0.2, [&] { menu.clear(); });
     EXPECT_EQ(Choose("wait 0.5\nmenu 2"), 2);
     EXPECT_EQ(chosenMenu, id);
+}
+
+TEST_F(PopupTracking, WhatComesWhileSomethingElsePausesIsItsOwnToo) {
+    Fill(menu, {"a", "b", "c"});
+    auto const pause = After(0.2, [] { Yield(0.5); });
+    EXPECT_EQ(Choose("wait 0.3\nkey Down\nkey Down\nwait 1\nkey Return"), 3);
+}
+
+TEST_F(PopupTracking, TheCursorIsAnArrow) {
+    Fill(menu, {"a"});
+    ShowWindow();
+    System().SetCursor(Cursors::kText);
+    int cursor = Cursors::kText;
+    auto const look = After(0.1, [&] { cursor = System().Cursor(); });
+    Choose("wait 0.5\nmenu 0");
+    EXPECT_EQ(cursor, Cursors::kArrow);
 }
 
 TEST_F(PopupTracking, OtherWindowsStayDrawn) {
