@@ -30,8 +30,8 @@ public:
     // Only stores; answers the mode before.
     virtual ConsoleEditMode SetEditMode(ConsoleEditMode);
 
-    ConsoleEditMode GetEditMode() const { return editMode; }
-    Rect GetEditBox() const { return editBox; }
+    ConsoleEditMode GetEditMode() const { return editMode; } // as SetEditMode stored it
+    Rect GetEditBox() const { return editBox; }              // as SetBox derived it
 
     // GlogPane. Repaints what is selected when the window comes to the front. A window that leaves it
     // repaints nothing: what is selected looks so until something else repaints it.

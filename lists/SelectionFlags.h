@@ -10,8 +10,8 @@ class SelectionFlags {
 public:
     static constexpr int kNone = -1; // no such row
 
-    int Count() const { return static_cast<int>(flags.size()); } // of rows
-    bool Has(int row) const { return row >= 0 && row < Count(); }
+    int Count() const { return static_cast<int>(flags.size()); }  // of rows
+    bool Has(int row) const { return row >= 0 && row < Count(); } // whether there is the row
     // 0 for a row that there is not.
     int At(int row) const { return Has(row) ? flags[static_cast<std::size_t>(row)] : 0; }
     bool IsSelected(int row) const { return At(row) > 0; }

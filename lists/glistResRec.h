@@ -15,7 +15,9 @@ enum GListSelectionMode : int {
 struct glistResRec {
     static short const kType = 4; // tells records of lists from others; the list does not read it
 
+    // Which of its sides follow the glog's.
     enum AutoEdge { kNoEdge = 0, kBottomFollows = 1, kRightFollows = 2, kBothFollow = 3 };
+    // Framed with an inner shadow, or small; others look like the first, without frame.
     enum Style { kDialogStyle = 0, kSmallStyle = 1 };
 
     short type;       // kType
