@@ -42,23 +42,6 @@ bool LiesBelow(short id, OSMenuHandle const &top, std::set<short> &seen) {
 
 } // namespace
 
-// Watches
-
-PopUpMenu::Watch::Watch(PopUpMenu &menu)
-    : watched(&menu)
-    , next(menu.watches) {
-    menu.watches = this;
-}
-
-PopUpMenu::Watch::~Watch() {
-    if (!watched)
-        return;
-    Watch **link = &watched->watches;
-    while (*link != this)
-        link = &(*link)->next;
-    *link = next;
-}
-
 PopUpMenu::PopUpMenu(bool privateCopy, bool mustHaveSelection_)
     : currentSelection(0)
     , flags(0)
@@ -67,11 +50,10 @@ PopUpMenu::PopUpMenu(bool privateCopy, bool mustHaveSelection_)
     , isPrivateCopy(privateCopy)
     , mustHaveSelection(mustHaveSelection_)
     , showsCheckmark(true)
-    , watches(nullptr) {}
+    , existence(std::make_shared<char>()) {}
 
 PopUpMenu::~PopUpMenu() {
-    for (Watch *watch = watches; watch; watch = watch->next)
-        watch->watched = nullptr;
+    existence.reset();
     DropSubmenus();
     if (isPrivateCopy && menu.IsValid())
         menu.clear();

@@ -8,6 +8,7 @@
 #include "host/OSMenuHandle.h"
 #include "host/UString.h"
 #include <boost/shared_ptr.hpp>
+#include <memory>
 #include <vector>
 
 // Items count from 1; 0 is none. All operations allow an invalid menu and items that do not exist: they do
@@ -133,16 +134,12 @@ protected:
     // Whether a menu still exists, for code that calls what may delete it.
     class Watch {
     public:
-        explicit Watch(PopUpMenu &); // may outlive it
-        ~Watch();
-        Watch(Watch const &) = delete;
-        Watch &operator=(Watch const &) = delete;
-        bool MenuExists() const { return watched != nullptr; } // its destructor has not begun
+        explicit Watch(PopUpMenu const &menu) // may outlive it
+            : existence(menu.existence) {}
+        bool MenuExists() const { return !existence.expired(); } // its destructor has not begun
 
     private:
-        friend class PopUpMenu;
-        PopUpMenu *watched;
-        Watch *next; // of the same menu
+        std::weak_ptr<void> existence;
     };
 
 private:
@@ -177,5 +174,5 @@ private:
     bool isPrivateCopy;
     bool mustHaveSelection;
     bool showsCheckmark;
-    Watch *watches; // the first of a list
+    std::shared_ptr<void> existence; // ends with the menu
 };
