@@ -77,6 +77,31 @@ private:
     pixman_image_t *image;
 };
 
+// Drawing a tile at a time is faster than having pixman repeat an image row by row, but for the smallest.
+constexpr int kSmallestTile = 64; // device pixels
+
+// How far `place` lies behind the start of its tile; `first` is where any tile starts.
+int InTile(int place, int first, int length) {
+    int const rest = (place - first) % length;
+    return rest < 0 ? rest + length : rest;
+}
+
+// Calls for every piece of the part that lies in one tile, with where in the tile it begins.
+template <class Draw>
+void ForEachTile(DeviceRect const &part, int left, int top, int width, int height, Draw draw) {
+    for (int y = part.top, fromV = InTile(part.top, top, height); y < part.bottom;) {
+        int const nextY = std::min(y + height - fromV, part.bottom);
+        for (int x = part.left, fromH = InTile(part.left, left, width); x < part.right;) {
+            int const nextX = std::min(x + width - fromH, part.right);
+            draw(DeviceRect{x, y, nextX, nextY}, fromH, fromV);
+            x = nextX;
+            fromH = 0;
+        }
+        y = nextY;
+        fromV = 0;
+    }
+}
+
 } // namespace
 
 template <class Draw> void PixelScope::ForEachVisible(DeviceRect const &r, Draw draw) {
@@ -156,13 +181,19 @@ void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRec
     }
     bool const repeats =
         left > box.left || top > box.top || left + image.width < box.right || top + image.height < box.bottom;
-    WithRepeat repeating(image.pixels, repeats);
+    bool const inTiles = repeats && image.width * image.height >= kSmallestTile;
+    WithRepeat repeating(image.pixels, repeats && !inTiles);
     pixman_image_t *target = port.surface->PixmanImage();
     auto compose = [&](pixman_op_t operation, pixman_image_t *source, pixman_image_t *mask) {
-        ForEachVisible(box, [&](DeviceRect const &part) {
-            int const fromH = part.left - left, fromV = part.top - top;
+        auto const drawPart = [&](DeviceRect const &part, int fromH, int fromV) {
             pixman_image_composite32(operation, source, mask, target, fromH, fromV, fromH, fromV, part.left,
                                      part.top, part.Width(), part.Height());
+        };
+        ForEachVisible(box, [&](DeviceRect const &part) {
+            if (inTiles)
+                ForEachTile(part, left, top, image.width, image.height, drawPart);
+            else
+                drawPart(part, part.left - left, part.top - top);
         });
     };
     if (port.state.darken != 0)

@@ -33,39 +33,64 @@ GlogPane *TopmostAt(std::vector<GlogPane *> const &subpanes, Point p) {
 
 } // namespace
 
+CompoundPane::CompoundRep::Panes &CompoundPane::CompoundRep::OwnList() {
+    if (list.use_count() > 1)
+        list = std::make_shared<Panes>(*list);
+    return *list;
+}
+
 void CompoundPane::CompoundRep::Insert(short index, GlogPane *pane) {
-    subpanes.insert(subpanes.begin() + index, pane);
+    Panes &panes = OwnList();
+    panes.insert(panes.begin() + index, pane);
     ++changes;
     ForgetReaches();
 }
 
 void CompoundPane::CompoundRep::Remove(GlogPane *pane) {
-    auto const found = std::find(subpanes.rbegin(), subpanes.rend(), pane);
-    if (found != subpanes.rend())
-        subpanes.erase(std::next(found).base());
+    Panes &panes = OwnList();
+    auto const found = std::find(panes.rbegin(), panes.rend(), pane);
+    if (found != panes.rend())
+        panes.erase(std::next(found).base());
     ++changes;
     ForgetReaches();
 }
 
 bool CompoundPane::CompoundRep::Has(GlogPane *pane, unsigned long changesThen) const {
-    return changes == changesThen || std::find(subpanes.begin(), subpanes.end(), pane) != subpanes.end();
+    return changes == changesThen || std::find(list->begin(), list->end(), pane) != list->end();
 }
 
 // Asking for a place may settle the layout and so move what was asked before.
-std::vector<GlogPane *> CompoundPane::CompoundRep::Within(Rect const &area) {
+void CompoundPane::CompoundRep::LearnReaches() {
     for (int round = 0; !reachesKnown && round < kMaxRounds; ++round) {
         reachesKnown = true;
-        reaches.assign(subpanes.size(), Rect{0, 0, 0, 0});
-        for (std::size_t i = 0; i < subpanes.size() && i < reaches.size(); ++i)
-            if (PaneAccess::OwnVisibility(*subpanes[i]))
-                reaches[i] = subpanes[i]->GetDrawRectangle();
+        reaches.assign(list->size(), Rect{0, 0, 0, 0});
+        for (std::size_t i = 0; i < list->size() && i < reaches.size(); ++i)
+            if (PaneAccess::OwnVisibility(*(*list)[i]))
+                reaches[i] = (*list)[i]->GetDrawRectangle();
     }
+    auto const isHigher = [](Rect const &below, Rect const &above) {
+        return below.top < above.top || below.bottom < above.bottom;
+    };
+    reachesDescend = std::adjacent_find(reaches.begin(), reaches.end(), [&](Rect const &a, Rect const &b) {
+                         return isHigher(b, a);
+                     }) == reaches.end();
+}
+
+// In rows that lie one below the other, those above and below the area are not even looked at.
+CompoundPane::CompoundRep::Panes CompoundPane::CompoundRep::Within(Rect const &area) {
     if (!reachesKnown)
-        return subpanes;
-    std::vector<GlogPane *> found;
-    for (std::size_t i = 0; i < subpanes.size(); ++i)
-        if (Meet(reaches[i], area))
-            found.push_back(subpanes[i]);
+        LearnReaches();
+    if (!reachesKnown)
+        return *list;
+    auto first = reaches.begin(), last = reaches.end();
+    if (reachesDescend) {
+        first = std::partition_point(first, last, [&](Rect const &r) { return r.bottom <= area.top; });
+        last = std::partition_point(first, last, [&](Rect const &r) { return r.top < area.bottom; });
+    }
+    Panes found;
+    for (auto reach = first; reach != last; ++reach)
+        if (Meet(*reach, area))
+            found.push_back((*list)[static_cast<std::size_t>(reach - reaches.begin())]);
     return found;
 }
 
@@ -77,8 +102,8 @@ CompoundPane::CompoundPane()
 
 CompoundPane::~CompoundPane() {
     // A subpane's destructor takes it out of the list.
-    while (!compoundRep->subpanes.empty())
-        delete compoundRep->subpanes.back();
+    while (!compoundRep->Subpanes().empty())
+        delete compoundRep->Subpanes().back();
     if (compoundRep->layout.get())
         LayoutEngine::PaneGone(*compoundRep->layout);
     delete compoundRep;
@@ -95,17 +120,18 @@ CompoundPane *CompoundPane::CompoundPaneInit(glogRec *glog_, short id) {
 // Subpanes
 
 GlogPane *CompoundPane::Get(short index) const {
-    return index >= 0 && index < NumSubpanes() ? compoundRep->subpanes[static_cast<std::size_t>(index)]
+    return index >= 0 && index < NumSubpanes() ? compoundRep->Subpanes()[static_cast<std::size_t>(index)]
                                                : nullptr;
 }
 
 short CompoundPane::Find(GlogPane *pane) {
-    auto found = std::find(compoundRep->subpanes.begin(), compoundRep->subpanes.end(), pane);
-    return found == compoundRep->subpanes.end() ? short(-1)
-                                                : static_cast<short>(found - compoundRep->subpanes.begin());
+    auto found = std::find(compoundRep->Subpanes().begin(), compoundRep->Subpanes().end(), pane);
+    return found == compoundRep->Subpanes().end()
+               ? short(-1)
+               : static_cast<short>(found - compoundRep->Subpanes().begin());
 }
 
-short CompoundPane::NumSubpanes() const { return static_cast<short>(compoundRep->subpanes.size()); }
+short CompoundPane::NumSubpanes() const { return static_cast<short>(compoundRep->Subpanes().size()); }
 
 short CompoundPane::Add(GlogPane *pane, short position) {
     short const index = AddGuts(pane, position);
@@ -166,14 +192,14 @@ void CompoundPane::DelGuts(short index, bool keep) {
 GlogPane *CompoundPane::FindByID(int id) {
     if (GetID() == id)
         return this;
-    for (GlogPane *pane : compoundRep->subpanes)
+    for (GlogPane *pane : compoundRep->Subpanes())
         if (GlogPane *found = pane->FindByID(id))
             return found;
     return nullptr;
 }
 
 bool CompoundPane::FindGophers(GopherInfo &info) {
-    for (GlogPane *pane : compoundRep->subpanes)
+    for (GlogPane *pane : compoundRep->Subpanes())
         if (pane->FindGophers(info))
             return true;
     return false;
@@ -288,7 +314,7 @@ void CompoundPane::DrawGuts(OSRgn *region) {
         VelaDrawing::EraseRect(&box);
     }
     DrawBackgroundGuts(region);
-    if (compoundRep->subpanes.empty())
+    if (compoundRep->Subpanes().empty())
         return;
     Point const shift = ToContent(*this, {0, 0});
     if (!region) {
@@ -307,23 +333,23 @@ void CompoundPane::DrawGuts(OSRgn *region) {
 int CompoundPane::HandleClick(EventRecordAdapter *event) {
     EventRecordAdapter inside = *event;
     inside.where = ToContent(*this, event->where);
-    GlogPane *pane = TopmostAt(compoundRep->subpanes, inside.where);
+    GlogPane *pane = TopmostAt(compoundRep->Subpanes(), inside.where);
     return pane ? PaneEvents::Click(*pane, inside) : 0;
 }
 
 int CompoundPane::HandleSecondaryButtonClick(EventRecordAdapter *event) {
     EventRecordAdapter inside = *event;
     inside.where = ToContent(*this, event->where);
-    GlogPane *pane = TopmostAt(compoundRep->subpanes, inside.where);
+    GlogPane *pane = TopmostAt(compoundRep->Subpanes(), inside.where);
     return pane ? PaneEvents::SecondaryClick(*pane, inside) : 0;
 }
 
 bool CompoundPane::DispatchCustomEvent(UIEvent *event) {
     PointedEvent *pointed = dynamic_cast<PointedEvent *>(event);
     PaneWatch const watch(this);
-    std::vector<GlogPane *> const snapshot = compoundRep->subpanes;
+    auto const snapshot = compoundRep->Snapshot();
     unsigned long const changes = compoundRep->changes;
-    for (auto i = snapshot.rbegin(); i != snapshot.rend(); ++i) {
+    for (auto i = snapshot->rbegin(); i != snapshot->rend(); ++i) {
         if (!compoundRep->Has(*i, changes))
             continue;
         if (!PaneAccess::OwnVisibility(**i) || (pointed && !pointed->LiesIn(**i)))
@@ -338,7 +364,7 @@ char CompoundPane::DispatchCursor(Point p) {
     if (!Contains(p))
         return 0;
     Point const inside = ToContent(*this, p);
-    if (GlogPane *pane = TopmostAt(compoundRep->subpanes, inside))
+    if (GlogPane *pane = TopmostAt(compoundRep->Subpanes(), inside))
         if (pane->DispatchCursor(inside))
             return 1;
     return GlogPane::DispatchCursor(p);

@@ -93,7 +93,7 @@ void PaneAccess::Adopt(GlogPane &pane, glogRec *glog) {
     if (glog)
         EnsureLayoutItems(pane);
     if (CompoundPane *container = AsContainer(pane))
-        for (GlogPane *inside : container->compoundRep->subpanes)
+        for (GlogPane *inside : container->compoundRep->Subpanes())
             Adopt(*inside, glog);
 }
 

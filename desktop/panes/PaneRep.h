@@ -24,17 +24,22 @@ struct GlogPane::Rep {
 };
 
 struct CompoundPane::CompoundRep {
+    typedef std::vector<GlogPane *> Panes; // from the bottom to the top
+
+    Panes const &Subpanes() const { return *list; }
+    // The subpanes as they are now, whatever becomes of the list.
+    std::shared_ptr<Panes const> Snapshot() const { return list; }
     void Insert(short index, GlogPane *);
     // From the end: a container that goes away deletes its subpanes from there.
     void Remove(GlogPane *);
     // Calls an operation on every subpane, from the bottom to the top. The list may change meanwhile, and the
     // container may go away: what was removed is not called, what was added may be.
     template <class Operation> void ForEach(CompoundPane &container, Operation operation) const {
-        ForEachOf(container, std::vector<GlogPane *>(subpanes), operation);
+        ForEachOf(container, *Snapshot(), operation);
     }
     // The same for those of some subpanes that are left.
     template <class Operation>
-    void ForEachOf(CompoundPane &container, std::vector<GlogPane *> const &some, Operation operation) const {
+    void ForEachOf(CompoundPane &container, Panes const &some, Operation operation) const {
         PaneWatch const watch(&container);
         unsigned long const before = changes;
         for (GlogPane *pane : some) {
@@ -49,16 +54,23 @@ struct CompoundPane::CompoundRep {
 
     // The subpanes that are shown and draw somewhere in the rectangle. Whoever scrolls through thousands asks
     // none of those that are out of sight.
-    std::vector<GlogPane *> Within(Rect const &);
+    Panes Within(Rect const &);
     // A subpane has come or gone, or draws elsewhere, or has been shown or hidden, or may have.
     void ForgetReaches() { reachesKnown = false; }
 
-    std::vector<GlogPane *> subpanes; // owned, from the bottom to the top
-    unsigned long changes = 0;        // how often a subpane has come or gone
-    std::vector<Rect> reaches;        // where each subpane draws; empty for one that is hidden
-    bool reachesKnown = false;
+    unsigned long changes = 0; // how often a subpane has come or gone
     RCPtr<GlogLayoutGroup> layout;
     bool sizesToLayout = false;
     bool noErase = false;
     bool hasFrame = false;
+
+private:
+    Panes &OwnList();
+    void LearnReaches();
+
+    // Owned panes. A list that others look at is copied before it changes.
+    std::shared_ptr<Panes> list = std::make_shared<Panes>();
+    std::vector<Rect> reaches; // where each subpane draws; empty for one that is hidden
+    bool reachesKnown = false;
+    bool reachesDescend = false; // each begins and ends no higher than the one before it
 };
