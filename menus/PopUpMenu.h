@@ -134,7 +134,8 @@ protected:
     // Whether a menu still exists, for code that calls what may delete it.
     class Watch {
     public:
-        explicit Watch(PopUpMenu const &menu) // may outlive it
+        // May outlive the menu.
+        explicit Watch(PopUpMenu const &menu)
             : existence(menu.existence) {}
         bool MenuExists() const { return !existence.expired(); } // its destructor has not begun
 
