@@ -2,6 +2,7 @@
 #include "host/CustomEventHandler.h"
 #include "host/OSPort.h"
 #include "host/OSRgn.h"
+#include "host/PaneWatch.h"
 #include "host/UIEvent.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
@@ -104,7 +105,10 @@ int ScrollGrid::ScrollGuts(int position) {
         }
         if (slaved)
             return moved;
+        PaneWatch const watch(this);
         UpdateGlog(GetGlog());
+        if (!watch.PaneExists())
+            return moved;
     }
     if (slaved)
         return moved;

@@ -1,5 +1,6 @@
 #include "scrolling/ScrollGridPlus.h"
 #include "host/CustomEventHandler.h"
+#include "host/PaneWatch.h"
 #include "host/UIEvent.h"
 #include "host/glogRec.h"
 #include "scrolling/Truncation.h"
@@ -25,7 +26,7 @@ struct ScrollGridPlusMouseWheelHandler : CustomEventHandler {
         int const turned = Truncated(kStepsPerWheelUnit * wheel->delta);
         int const distance = -std::max(turned, -std::numeric_limits<int>::max());
         if (grid->IsVerticalGrid() == (wheel->axis == kWheelVertical))
-            grid->ScrollGrid::Scroll(distance);
+            static_cast<ScrollGrid *>(grid)->Scroll(distance);
         else
             grid->LateralScroll(distance);
         return true;
@@ -77,7 +78,10 @@ void ScrollGridPlus::LateralScrollGuts(int position) {
             Rect box;
             GetScrollBox(&box);
             MovePixels(box, Across(), lateralScrollOffset - old);
+            PaneWatch const watch(this);
             UpdateGlog(GetGlog());
+            if (!watch.PaneExists())
+                return;
         } else {
             Inval();
         }

@@ -3,6 +3,8 @@
 #include "tests/VirtualPlace.h"
 #include "tests/desktop/ProbePane.h"
 #include <limits>
+#include <utility>
+#include <vector>
 
 namespace {
 
@@ -248,6 +250,45 @@ TEST_F(ScrollGridPlusTest, EachWheelAxisScrollsItsAxis) {
     EXPECT_EQ(Offset(), (Point{6, 8}));
     desktop.Play("wheel 50 50 1 0");
     EXPECT_EQ(Offset(), (Point{6, 6}));
+}
+
+TEST_F(ScrollGridPlusTest, TheWheelCallsWhatASubclassMakesOfScrolling) {
+    class Counting : public ScrollGridPlus {
+    public:
+        using ScrollGrid::Scroll;
+        using ScrollGridPlus::ScrollGridPlus;
+        int Scroll(int distance) override {
+            distances.push_back(distance);
+            return 0;
+        }
+        std::vector<int> distances;
+    };
+    Rect empty = {0, 0, 0, 0};
+    grid->SetBox(&empty);
+    Counting *const counting = new Counting(glog, 6, nullptr, nullptr);
+    Rect view = kView;
+    counting->SetBox(&view);
+    Show();
+    desktop.Play("wheel 50 50 0 -3");
+    EXPECT_EQ(counting->distances, std::vector<int>{6});
+}
+
+TEST_F(ScrollGridPlusTest, IsLeftAloneWhenItGoesAwayWhileItsWindowIsDrawn) {
+    class Deleting : public ProbePane {
+    public:
+        using ProbePane::ProbePane;
+        GlogPane *victim = nullptr;
+
+    protected:
+        void DrawGuts(OSRgn *) override { delete std::exchange(victim, nullptr); }
+    };
+    Fill(20);
+    Deleting *const last = new Deleting(glog, {176, 0, 196, 20}, calls, "deleting");
+    Show();
+    last->victim = grid;
+    last->Inval();
+    grid->ScrollTo(nullptr, 10);
+    EXPECT_EQ(last->victim, nullptr) << "the grid is gone";
 }
 
 TEST_F(ScrollGridPlusTest, AHorizontalGridExchangesTheWheelsAxes) {
