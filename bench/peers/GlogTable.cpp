@@ -1,32 +1,25 @@
-// The list in our panes: a GListPane with a drawer that shows texts.
-#include "bench/peers/PeerForm.h"
+// The list in our panes: a GListPane with the drawer of texts.
 #include "bench/peers/PeerTable.h"
 #include "desktop/Desktop.h"
 #include "frame/GListPane_SelectionListener.h"
-#include "host/OSFont.h"
-#include "host/TextLayout.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
 #include "lists/GListPane.h"
+#include "lists/ListTextDrawer.h"
 #include "scrolling/ScrollBarPane.h"
 #include <boost/make_shared.hpp>
 
 namespace {
 
-int const kFont = 0;   // Roboto of 12 pixels
-int const kMargin = 4; // pixels
-int const kCentred = 1;
+int const kMargin = 4;    // pixels
 double const kWait = 0.2; // seconds
 int const kMostWaits = 25;
 
-class GlogTable : public PeerTable, private ListLineDrawer, private GListPane_SelectionListener {
+class GlogTable : public PeerTable, private GListPane_SelectionListener {
 public:
     GlogTable()
         : desktop(DesktopOptions().Scale(1)) {}
-    ~GlogTable() override {
-        list->SetLineDrawer(nullptr, false);
-        list->SetSelectionListener(nullptr);
-    }
+    ~GlogTable() override { list->SetSelectionListener(nullptr); }
 
     void Show() override {
         glog = desktop.NewGlog(GlogOptions().Title("List").Size(kWidth, kHeight));
@@ -36,8 +29,8 @@ public:
         record.selMode = kListSelectOne;
         record.lineHeight = kRowHeight;
         list = GListPane::NewGListPane(glog, &record);
-        list->SetLineDrawer(this, false);
-        list->SetColumnList(columns = NewColumns());
+        list->SetColumnList(NewColumns());
+        list->SetLineDrawer(new ListTextDrawer(list, FillCell), true);
         list->SetSelColumn(1);
         ScrollBarPane *const bar = new ScrollBarPane(glog, 0, 0, 0);
         Rect upright = {0, kWidth - kBarWidth, kHeight, kWidth};
@@ -71,22 +64,17 @@ public:
 private:
     static boost::shared_ptr<ColumnList> NewColumns() {
         boost::shared_ptr<ColumnList> const made = boost::make_shared<ColumnList>(short(kColumns));
-        for (int column = 0; column < kColumns; ++column)
+        for (int column = 0; column < kColumns; ++column) {
             made->SetBothEdges(column, column * kColumnWidth, (column + 1) * kColumnWidth);
+            made->SetColumnMargin(column, kMargin);
+        }
         return made;
     }
 
-    void DrawLine(int line, Rect *row, bool) override {
-        SetFontData(GetIndVelaFont(kFont));
-        for (int column = 0; column < kColumns; ++column) {
-            Rect const cell = {
-                row->top, static_cast<short>(row->left + columns->GetLeftEdge(column) + kMargin), row->bottom,
-                static_cast<short>(row->left + columns->GetRightEdge(column) - kMargin)};
-            DrawStringInRect(UString(TextOf(line, column).c_str(), UString::kByteEncoding1), cell,
-                             TextSettings::kAlignLeft, TextSettings::kTruncateEnd, kCentred, 0, 0, 0.0f, 1.0f,
-                             1.0f, 0.0f);
-        }
+    static void FillCell(int line, int column, ListCell &cell) {
+        cell.text = UString(TextOf(line, column).c_str(), UString::kByteEncoding1);
     }
+
     // Told also when the row before is given up; what counts is the new one.
     void SelectionDone(GListPane *) override {
         if (list->NumSelected() == 0)
@@ -99,7 +87,6 @@ private:
     Desktop desktop;
     glogRec *glog = nullptr;
     GListPane *list = nullptr; // the glog's
-    boost::shared_ptr<ColumnList> columns;
     bool heard = false;
 };
 

@@ -30,10 +30,11 @@ public:
         }
         if (message->kind != 3)
             return false;
-        ++printed;
-        if (onPage)
-            onPage(message->page);
-        return printed < pages;
+        bool const more = ++printed < pages;
+        std::function<void(int)> const draw = onPage; // which may delete the pane
+        if (draw)
+            draw(message->page);
+        return more;
     }
     void DrawGuts(OSRgn *) override {}
 

@@ -120,6 +120,14 @@ TEST_F(PrintingTest, PanesInContainersPrintAndHiddenOnesDoNot) {
     EXPECT_EQ(desktop.Print(glog, file), 0);
 }
 
+TEST_F(PrintingTest, OnePaneMayBePrintedWithoutTheOthers) {
+    Probe(2);
+    PrintProbe *const pane = Probe(1);
+    EXPECT_EQ(desktop.Print(pane, file), 1);
+    EXPECT_EQ(notes, (Notes{"start 1", "page 1", "end 1"}));
+    EXPECT_EQ(PdfReading::Pages(file), 1);
+}
+
 TEST_F(PrintingTest, AWindowThatHasNotBeenShownPrints) {
     glogRec *const other = desktop.NewGlog(GlogOptions().Title("Other"));
     new PrintProbe(other, 1, notes);
@@ -484,10 +492,7 @@ TEST_F(PrintingTest, OneJobAtATime) {
 TEST_F(PrintingTest, APaneMayBeDeletedWhileItPrints) {
     PrintProbe *const pane = Probe(3);
     Probe(1);
-    pane->onPage = [pane](int) {
-        GlogPane *const gone = pane; // the function lives in what is deleted
-        delete gone;
-    };
+    pane->onPage = [pane](int) { delete pane; };
     EXPECT_EQ(desktop.Print(glog, file), 2);
     EXPECT_EQ(PdfReading::Pages(file), 2);
 }
