@@ -14,12 +14,14 @@ int const kTextFont = 0; // in the font table
 int const kGap = 4;      // pixels between icon and text
 int const kCentred = 1, kOneLine = 0, kUpright = 0, kNothing = 0;
 
-// The column's part of the row without its margins, no wider than the row.
+// The column's part of the row without its margins.
 Rect CellBox(Rect const &row, ColumnList const &columns, int column) {
-    int const margin = columns.GetColumnMargin(column);
+    long long const margin = columns.GetColumnMargin(column);
+    int const left = std::max(row.left + columns.GetLeftEdge(column), static_cast<int>(row.left));
+    int const right = std::min(row.left + columns.GetRightEdge(column), static_cast<int>(row.right));
     Rect cell = row;
-    cell.left = std::max(Pixel16(0LL + row.left + columns.GetLeftEdge(column) + margin), row.left);
-    cell.right = std::min(Pixel16(0LL + row.left + columns.GetRightEdge(column) - margin), row.right);
+    cell.left = Pixel16(left + margin);
+    cell.right = Pixel16(right - margin);
     return cell;
 }
 

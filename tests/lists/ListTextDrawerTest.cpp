@@ -124,7 +124,7 @@ TEST_F(ListTextDrawerTest, ACellEndsWithTheList) {
     GListPane *const list = NewTextList(100);
     Restyle(*list, [](ColumnList &columns) { columns.SetBothEdges(2, 120, 500); });
     EXPECT_EQ(TextsOf(*list, 0)[2],
-              Expected(*list, "0:2", {21, 152, 37, 229}, TextSettings::kAlignDefault)[0]);
+              Expected(*list, "0:2", {21, 152, 37, 228}, TextSettings::kAlignDefault)[0]);
 }
 
 TEST_F(ListTextDrawerTest, AMarginThatLeavesNoRoomLeavesTheCellEmpty) {
