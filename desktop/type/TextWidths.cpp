@@ -73,8 +73,11 @@ TextWidths::Slot const *TextWidths::Table::Find(Key const &key) const {
 }
 
 void TextWidths::Table::Add(Key const &key, int width) {
-    if ((used + 1) * 4 > slots.size() * 3)
+    if ((used + 1) * 8 > slots.size() * 7)
         Grow();
+    // By less than a string grows by itself.
+    if (units.size() + key.text.size() > units.capacity())
+        units.reserve(units.size() + units.size() / 4 + key.text.size());
     Enter({key.hash, static_cast<Number>(units.size()), static_cast<Number>(key.text.size()), key.shape,
            width});
     units.append(key.text);
