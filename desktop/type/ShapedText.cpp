@@ -139,7 +139,8 @@ void ShapedText::MeasureLines() {
 }
 
 // Takes what drawing needs out of the layout, and gives the layout up. Glyphs that no font has are boxes with
-// their number, which Pango draws: then the layout stays.
+// their number, which Pango draws: then the layout stays. So it does where glyphs stand for several
+// characters, as ligatures do: from the layout a printed page knows which, and its text can be read.
 void ShapedText::KeepGlyphs() {
     for (std::size_t i = 0; i < lines.size(); ++i) {
         std::size_t const before = runs.size();
@@ -164,7 +165,7 @@ bool ShapedText::AddRunsOf(PangoLayoutLine const &line) {
 bool ShapedText::AddRun(PangoGlyphItem const &run, int &h) {
     cairo_scaled_font_t *const font =
         pango_cairo_font_get_scaled_font(reinterpret_cast<PangoCairoFont *>(run.item->analysis.font));
-    if (!font)
+    if (!font || run.glyphs->num_glyphs != run.item->num_chars)
         return false;
     runs.push_back({cairo_scaled_font_reference(font), 0});
     h += run.start_x_offset;
