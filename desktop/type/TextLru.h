@@ -63,7 +63,9 @@ private:
     struct Key {
         std::u16string_view text;
         TextShape const *shape;
-        bool operator==(Key const &other) const { return Utf::SameUnits(text, other.text) && *shape == *other.shape; }
+        bool operator==(Key const &other) const {
+            return Utf::SameUnits(text, other.text) && *shape == *other.shape;
+        }
     };
     struct Hash {
         std::size_t operator()(Key const &key) const {
