@@ -169,7 +169,7 @@ void TakeListPane::ButtonValueChanged(ButtonGroupPane *, short index, bool value
     TellSelected();
 }
 
-void TakeListPane::GlogButtonPressed(GlogButtonPane *) { Print(); }
+void TakeListPane::GlogButtonPressed(GlogButtonPane *) { PrintToFile(); }
 
 void TakeListPane::SelectionDone(GListPane *) { TellSelected(); }
 
@@ -188,7 +188,7 @@ void TakeListPane::ActOn(int line, int column, Point where) {
     }
 }
 
-void TakeListPane::Print() {
+void TakeListPane::PrintToFile() {
     try {
         std::string const path = (std::filesystem::temp_directory_path() / kPrintedFile).string();
         int const pages = Desktop::Current()->Print(list, path, PrintOptions().Header("Takes", "", ""));

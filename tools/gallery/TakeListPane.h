@@ -53,7 +53,7 @@ private:
     void DrawText(UString const &, Rect const &rowBox, Column) const;
     Rect CellIn(Rect const &rowBox, Column) const;
     void ActOn(int line, int column, Point where);
-    void Print();
+    void PrintToFile();
     void Tell(UString const &);
     void TellSelected();
 
