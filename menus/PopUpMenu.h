@@ -16,7 +16,7 @@
 class PopUpMenu {
 public:
     // What becomes of an item whose text is "-"; any other value stands for kDashIsText.
-    enum DashIsSep { kDashIsSeparator = 0, kDashIsText = 1 };
+    enum DashIsSep : int { kDashIsSeparator = 0, kDashIsText = 1 };
 
     // `privateCopy`: the menu that InitializeMenu takes is this object's own and is cleared with it.
     // `mustHaveSelection`: a menu with items always has a current one.
