@@ -15,6 +15,7 @@ ItemRegistry::ItemRegistry() {
     AddMenuItems(*this);
     AddSelectItems(*this);
     AddListItems(*this);
+    AddGraphicItems(*this);
 }
 
 ItemRegistry &ItemRegistry::Instance() {

@@ -5,6 +5,7 @@
 #include "frame/ResourceReading.h"
 #include "host/LocalizedStrings.h"
 #include <algorithm>
+#include <cstdlib>
 #include <initializer_list>
 #include <limits>
 #include <set>
@@ -115,19 +116,20 @@ void ItemTreeReader::AddAttributes(XMLLib::ContainerItem &container, XmlNode con
     RequireNoText(node);
     Container const inner = ReadAttributes(node, key.keys);
     if (key.kind == KeySchema::kRect)
-        CheckRect(node, *inner);
+        CheckRect(node, key, *inner);
     container.AddItem(Utf8::ToUString(key.itemKey), inner);
 }
 
-void ItemTreeReader::CheckRect(XmlNode const &node, XMLLib::ContainerItem const &rect) const {
+void ItemTreeReader::CheckRect(XmlNode const &node, KeySchema const &key,
+                               XMLLib::ContainerItem const &rect) const {
     auto const edge = [&](char const *name) { return rect.GetSIntItemValue(ResourceKey(name)); };
     long long const height = edge(XMLLib::kRectBottomKey) - edge(XMLLib::kRectTopKey);
     long long const width = edge(XMLLib::kRectRightKey) - edge(XMLLib::kRectLeftKey);
-    if (height < 0)
+    if (height < 0 && !key.anyCorners)
         throw ErrorAt(node, "bottom lies above top");
-    if (width < 0)
+    if (width < 0 && !key.anyCorners)
         throw ErrorAt(node, "right lies left of left");
-    if (std::max(width, height) > KeyList::kLargest)
+    if (std::max(std::abs(width), std::abs(height)) > KeyList::kLargest)
         throw ErrorAt(node, "a side is longer than " + std::to_string(KeyList::kLargest) + " pixels");
 }
 

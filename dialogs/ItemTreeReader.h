@@ -34,7 +34,7 @@ private:
     void AddValue(XMLLib::ContainerItem &, XmlNode const &, KeySchema const &, std::string const &text) const;
     void AddAttributes(XMLLib::ContainerItem &, XmlNode const &, KeySchema const &) const;
     void AddAnything(XMLLib::ContainerItem &, XmlNode const &) const;
-    void CheckRect(XmlNode const &, XMLLib::ContainerItem const &) const;
+    void CheckRect(XmlNode const &, KeySchema const &, XMLLib::ContainerItem const &) const;
     std::string TextOf(XmlNode const &, KeySchema const &) const;
     std::string StringOfList(XmlNode const &) const;
     void RequireKind(XmlNode const &, KeySchema const &) const;

@@ -97,6 +97,11 @@ KeyList &KeyList::Repeated() {
     return *this;
 }
 
+KeyList &KeyList::AnyCorners() {
+    keys.back().anyCorners = true;
+    return *this;
+}
+
 KeyList &KeyList::As(std::string const &itemKey) {
     keys.back().itemKey = itemKey;
     return *this;

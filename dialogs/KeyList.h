@@ -37,10 +37,11 @@ public:
     // All keys of the other list.
     KeyList &All(KeyList const &);
 
-    // Of the key that was added last: it must be there; it may occur several times; the item tree has it
-    // under another name.
+    // Of the key that was added last: it must be there; it may occur several times; a rectangle's corners may
+    // stand in any order; the item tree has it under another name.
     KeyList &Required();
     KeyList &Repeated();
+    KeyList &AnyCorners();
     KeyList &As(std::string const &itemKey);
 
     KeySchema const *Find(std::string const &name) const;       // null when there is none
@@ -61,6 +62,7 @@ struct KeySchema {
     Kind kind = kAnything;                                                // what may stand there
     bool required = false;                                                // an item without it is wrong
     bool repeated = false;                                                // may stand several times
+    bool anyCorners = false;                                              // kRect: bottom may lie above top
     long long smallest = KeyList::kSmallest, largest = KeyList::kLargest; // of kInteger
     std::vector<std::string> words;                                       // of kWord
     KeyList keys;                                                         // of a container, or the attributes

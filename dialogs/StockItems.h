@@ -15,3 +15,4 @@ void AddScrolledItems(ItemRegistry &); // ScrollPane, Grid, ScrollGrid
 void AddMenuItems(ItemRegistry &);     // PopUpMenu, ScrollBarPopUpMenu, DurationNote
 void AddSelectItems(ItemRegistry &);   // Select, SelectString
 void AddListItems(ItemRegistry &);     // List
+void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line

@@ -1,6 +1,7 @@
 #include "menus/DurationNotePane.h"
 #include "menus/ScrollBarPopupMenuPane.h"
 #include "tests/dialogs/DialogTest.h"
+#include "tests/dialogs/OneRecord.h"
 #include <vector>
 
 namespace {
@@ -19,20 +20,6 @@ protected:
         UString name;
         menu.GetItemName(item, name);
         return Utf8::FromUString(name);
-    }
-    // A dialog of one record.
-    glogRec *LoadRecord(std::vector<int> const &shorts) {
-        std::vector<unsigned char> bytes(reinterpret_cast<unsigned char const *>("GLOGREC1"),
-                                         reinterpret_cast<unsigned char const *>("GLOGREC1") + 8);
-        auto const add = [&bytes](int number) {
-            bytes.push_back(static_cast<unsigned char>(number & 0xFF));
-            bytes.push_back(static_cast<unsigned char>(number >> 8 & 0xFF));
-        };
-        for (int number : {320, 200, 1, static_cast<int>(shorts.size() * 2)})
-            add(number);
-        for (int number : shorts)
-            add(number);
-        return LoadGlogFromRecords(bytes.data(), bytes.size(), GlogOptions(), "old.glog");
     }
     std::vector<std::string> Messages(std::string const &script) {
         desktop.TakeMessages();
@@ -146,7 +133,7 @@ TEST_F(MenuItemsTest, TheDumpTellsTheCurrentItem) {
 }
 
 TEST_F(MenuItemsTest, ARecordMakesAPopUp) {
-    glogRec *const loaded = LoadRecord({43, 2, 10, 20, 30, 140, 137});
+    glogRec *const loaded = LoadOneRecord({43, 2, 10, 20, 30, 140, 137});
     PopMPane *const menu = dynamic_cast<PopMPane *>(GetGlogItem(loaded, 1));
     ASSERT_NE(menu, nullptr);
     EXPECT_EQ(menu->GetFlags(), 2);
@@ -156,11 +143,11 @@ TEST_F(MenuItemsTest, ARecordMakesAPopUp) {
 
 TEST_F(MenuItemsTest, ARecordOfAMenuThatIsNotThereIsRefused) {
     EXPECT_TRUE(Holds(Complaint([&] {
-                          LoadRecord({43, 0, 10, 20, 30, 140, 1});
+                          LoadOneRecord({43, 0, 10, 20, 30, 140, 1});
                       }),
                       "there is no menu of the id 1"));
-    EXPECT_NE(Complaint([&] { LoadRecord({43, 0, 10, 20, 30}); }), "no complaint");
-    EXPECT_NE(Complaint([&] { LoadRecord({43, 0, 10, 20, 30, 140, 137, 1}); }), "no complaint");
+    EXPECT_NE(Complaint([&] { LoadOneRecord({43, 0, 10, 20, 30}); }), "no complaint");
+    EXPECT_NE(Complaint([&] { LoadOneRecord({43, 0, 10, 20, 30, 140, 137, 1}); }), "no complaint");
 }
 
 // In scroll bars

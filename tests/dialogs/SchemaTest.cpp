@@ -65,7 +65,9 @@ std::set<std::string> const kStockTypes = {"OvalButton",
                                            "List",
                                            "PopUpMenu",
                                            "ScrollBarPopUpMenu",
-                                           "DurationNote"};
+                                           "DurationNote",
+                                           "ProgressBar",
+                                           "Line"};
 
 std::set<std::string> KeysOfStockTypes() {
     std::set<std::string> names = {"Items"};
@@ -81,8 +83,9 @@ std::set<std::string> KeysOfStockTypes() {
 TEST(Schema, KnowsTheKeysOfTheStockTypesAndNoOthers) {
     XmlFile const schema = XmlFile::Read(kSchema);
     std::set<std::string> known;
-    for (char const *group : {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels",
-                              "Groups", "ScrollBars", "Scrolled", "Selectables", "Lists", "Menus"})
+    for (char const *group :
+         {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels", "Groups",
+          "ScrollBars", "Scrolled", "Selectables", "Lists", "Menus", "Graphics"})
         CollectElements(*Named(schema.Root(), "xs:group", group), known);
     EXPECT_EQ(known, KeysOfStockTypes());
 }
