@@ -13,6 +13,7 @@ ItemRegistry::ItemRegistry() {
     AddScrollItems(*this);
     AddScrolledItems(*this);
     AddMenuItems(*this);
+    AddTabItems(*this);
     AddSelectItems(*this);
     AddListItems(*this);
     AddGraphicItems(*this);

@@ -13,6 +13,7 @@ void AddGroupItems(ItemRegistry &);    // Group, Spacer
 void AddScrollItems(ItemRegistry &);   // ScrollBar, GrowBox
 void AddScrolledItems(ItemRegistry &); // ScrollPane, Grid, ScrollGrid
 void AddMenuItems(ItemRegistry &);     // PopUpMenu, ScrollBarPopUpMenu, DurationNote
+void AddTabItems(ItemRegistry &);      // Tabs
 void AddSelectItems(ItemRegistry &);   // Select, SelectString
 void AddListItems(ItemRegistry &);     // List
 void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line

@@ -67,7 +67,8 @@ std::set<std::string> const kStockTypes = {"OvalButton",
                                            "ScrollBarPopUpMenu",
                                            "DurationNote",
                                            "ProgressBar",
-                                           "Line"};
+                                           "Line",
+                                           "Tabs"};
 
 std::set<std::string> KeysOfStockTypes() {
     std::set<std::string> names = {"Items"};
