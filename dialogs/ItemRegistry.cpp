@@ -17,6 +17,7 @@ ItemRegistry::ItemRegistry() {
     AddSelectItems(*this);
     AddListItems(*this);
     AddGraphicItems(*this);
+    AddThreeDItems(*this);
 }
 
 ItemRegistry &ItemRegistry::Instance() {

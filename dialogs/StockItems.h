@@ -17,3 +17,4 @@ void AddTabItems(ItemRegistry &);      // Tabs
 void AddSelectItems(ItemRegistry &);   // Select, SelectString
 void AddListItems(ItemRegistry &);     // List
 void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line
+void AddThreeDItems(ItemRegistry &);   // ThreeD

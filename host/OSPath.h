@@ -16,6 +16,8 @@ public:
     void AddPath(OSPath const &, double dh, double dv);
     // Joins the last point of the last subpath to its first. Without effect when there is no subpath.
     void CloseSubpath();
+    // Removes all subpaths.
+    void Clear();
 
 private:
     OSPath(OSPath const &);

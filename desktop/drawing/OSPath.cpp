@@ -30,6 +30,8 @@ void OSPath::AddPath(OSPath const &other, double dh, double dv) {
     }
 }
 
+void OSPath::Clear() { rep->steps.clear(); }
+
 void OSPath::CloseSubpath() {
     if (!rep->steps.empty())
         rep->steps.push_back({Rep::Verb::kClose, 0, 0});

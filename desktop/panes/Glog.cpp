@@ -550,8 +550,11 @@ void Glog::Wheel(InputEvent const &event) {
 void Glog::PointerMoved(Point p) {
     HostCall const call;
     GlogPane *const pane = TopmostAt(p);
-    if (WithCursorDispatchingDisabled::fgCount == 0 && (!pane || !pane->DispatchCursor(p)))
-        CrsrMain(Cursors::kArrow);
+    if (WithCursorDispatchingDisabled::fgCount == 0) {
+        EventLoop::CursorChoice const choice(EventLoop::Instance());
+        if (!pane || !pane->DispatchCursor(p))
+            CrsrMain(Cursors::kArrow);
+    }
     EventLoop::Instance().HelpTags().PointerAt(*this, p);
 }
 

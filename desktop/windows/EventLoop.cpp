@@ -85,7 +85,8 @@ bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter wa
         if (quitting || (deadline >= 0 && windows.Now() >= deadline))
             return false;
         // A drag ends with its window, which something that ran here may have closed.
-        if (waiter == WindowSystem::Waiter::kTracking && !heldWindow)
+        if ((waiter == WindowSystem::Waiter::kTracking || waiter == WindowSystem::Waiter::kAsking) &&
+            !heldWindow)
             return false;
     }
 }
@@ -358,9 +359,27 @@ bool EventLoop::ButtonStillDown() {
     auto released = [this] { return std::any_of(pointer.begin(), pointer.end(), IsRelease); };
     InputEvent event;
     while (heldWindow && !released() &&
-           Take(event, windows.Now(), WindowSystem::Waiter::kTracking, "the state of the mouse button"))
+           Take(event, windows.Now(), WindowSystem::Waiter::kAsking, "the state of the mouse button"))
         Sort(event);
     return heldWindow && !released();
+}
+
+void EventLoop::ShowCursor(int cursor) {
+    if (choice)
+        choice->cursor = cursor;
+    else
+        windows.SetCursor(cursor);
+}
+
+EventLoop::CursorChoice::CursorChoice(EventLoop &loop_)
+    : loop(loop_)
+    , outer(loop_.choice) {
+    loop.choice = this;
+}
+
+EventLoop::CursorChoice::~CursorChoice() {
+    loop.choice = outer;
+    loop.ShowCursor(cursor);
 }
 
 void EventLoop::BeginMenu(PlatformWindow *window) {

@@ -50,6 +50,24 @@ public:
     bool MenuIsOver() const { return quitting || !menuWindow; }
     void EndMenu();
 
+    // What CrsrMain asks for.
+    void ShowCursor(int cursor);
+    // While a pane is asked for the cursor under the mouse: it shows at the end, and is an arrow where the
+    // pane has not asked for one.
+    class CursorChoice {
+    public:
+        explicit CursorChoice(EventLoop &);
+        ~CursorChoice();
+        CursorChoice(CursorChoice const &) = delete;
+        CursorChoice &operator=(CursorChoice const &) = delete;
+
+    private:
+        friend class EventLoop;
+        EventLoop &loop;
+        CursorChoice *outer; // panes may wait while they are asked
+        int cursor = Cursors::kArrow;
+    };
+
     void Pause(double seconds);
     void PauseUntilKeyUp(int key);
 
@@ -95,6 +113,7 @@ private:
     PlatformWindow *shownWindow = nullptr;     // and has not been activated since
     double shownAt = 0;
     int lastPressClicks = 0;
+    CursorChoice *choice = nullptr; // that is being made, or null
     bool quitting = false;
     int status = 0;
 };

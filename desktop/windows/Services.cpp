@@ -86,7 +86,7 @@ void CrsrMain(short cursor) {
     if (WithCursorDispatchingDisabled::fgCount > 0)
         return;
     if (EventLoop *loop = EventLoop::Open())
-        loop->Windows().SetCursor(cursor);
+        loop->ShowCursor(cursor);
 }
 
 // This desktop makes its drag images from what a window shows and never draws panes for them.

@@ -97,7 +97,7 @@ bool SimulatedWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter 
         if (Deliver(event))
             return true;
         if (steps.empty()) {
-            if (waiter == Waiter::kTracking && captured) {
+            if ((waiter == Waiter::kTracking || waiter == Waiter::kAsking) && captured) {
                 ScriptStep release;
                 release.kind = ScriptStep::kRelease;
                 Perform(release);
@@ -110,6 +110,11 @@ bool SimulatedWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter 
             return false;
         }
         ScriptStep const step = steps.front();
+        // Only once for each movement: who does nothing but ask has to see the end of the script some time.
+        if (waiter == Waiter::kAsking && step.kind == ScriptStep::kMove && !moveHeldBack) {
+            moveHeldBack = true;
+            return false;
+        }
         // A pause in the script begins when its turn comes.
         if (!stepTimed) {
             stepTimed = true;
@@ -122,6 +127,7 @@ bool SimulatedWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter 
         now = std::max(now, nextStepAt);
         steps.pop_front();
         stepTimed = false;
+        moveHeldBack = false;
         Perform(step);
         // After a step without events the wait's limit may have passed, or the script have ended.
         if (queue.empty() &&

@@ -65,6 +65,7 @@ private:
     std::deque<ScriptStep> steps;
     double nextStepAt = 0; // when the step at the front is due
     bool stepTimed = false;
+    bool moveHeldBack = false; // the next step is a movement that has not happened yet, as somebody was told
     bool placesPopups = true;
     std::deque<InputEvent> queue;
     InputState state;

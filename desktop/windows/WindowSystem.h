@@ -21,6 +21,7 @@ public:
     enum class Waiter {
         kMainLoop, // without more events the simulated system asks the loop to quit
         kTracking, // without more events a held mouse button is released
+        kAsking,   // wants what has happened only; in a script movements take time, and have not happened yet
         kPause,    // has a timeout of its own
         kModal     // a dialog or menu: a wait that nothing can end is an error
     };

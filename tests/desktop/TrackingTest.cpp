@@ -110,6 +110,20 @@ TEST_F(TrackingTest, StillDownSeesTheReleaseThatHasHappened) {
     EXPECT_EQ(log, (Calls{"down", "down", "up"}));
 }
 
+TEST_F(TrackingTest, StillDownIsTrueWhenAMovementIsToCome) {
+    Track("press 30 20\nmove 40 20\nrelease", [&] {
+        Log(OS::Services::StillDown() ? "down" : "up");
+        Point p{0, 0};
+        Log(MouseIsDragging(&p, nullptr) ? "moved" : "up");
+    });
+    EXPECT_EQ(log, (Calls{"down", "moved"}));
+}
+
+TEST_F(TrackingTest, StillDownIsFalseAfterAClick) {
+    Track("click 30 20", [&] { Log(OS::Services::StillDown() ? "down" : "up"); });
+    EXPECT_EQ(log, Calls{"up"});
+}
+
 TEST_F(TrackingTest, AReleaseThatATrackerLeavesIsHandledLater) {
     Track("press 30 20\nmove 31 21\nrelease\nclick 30 20", [&] { Log("click"); });
     EXPECT_EQ(log, (Calls{"click", "click"}));

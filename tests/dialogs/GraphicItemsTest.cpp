@@ -1,11 +1,18 @@
 #include "graphics/GLinePane.h"
 #include "graphics/ProgressBarPane.h"
+#include "graphics/ThreeDPane.h"
 #include "tests/dialogs/DialogTest.h"
 #include "tests/dialogs/OneRecord.h"
 
 namespace {
 
 std::string const kPlace = "<BoundsRect top=\"10\" left=\"20\" bottom=\"30\" right=\"140\"/>";
+
+std::string const kCube = "<BoundsRect top=\"0\" left=\"0\" bottom=\"238\" right=\"224\"/>";
+
+std::ostream &operator<<(std::ostream &out, Point3D const &p) {
+    return out << "{x " << p.x << ", y " << p.y << ", z " << p.z << "}";
+}
 
 class GraphicItemsTest : public DialogTest {};
 
@@ -54,4 +61,50 @@ TEST_F(GraphicItemsTest, ARecordMakesALine) {
     EXPECT_EQ(BoxOf(line), (Rect{10, 20, 13, 141}));
     EXPECT_NE(Complaint([&] { LoadOneRecord({11, 10, 20, 10}); }), "no complaint");
     EXPECT_NE(Complaint([&] { LoadOneRecord({11, 10, 20, 10, 140, 0}); }), "no complaint");
+}
+
+// The point in a cube
+
+TEST_F(GraphicItemsTest, ACubeShowsThePointThatItIsTold) {
+    ThreeDPane *const cube =
+        LoadOne<ThreeDPane>("ThreeD", kCube + "<Location x=\"250\" y=\"-1000\" z=\"0\"/>");
+    EXPECT_EQ(cube->GetValue(), (Point3D{0.25, -1.0, 0.0}));
+    EXPECT_TRUE(Holds(Dump(cube->GetGlog()), "\"x\":0.25,\"y\":-1,\"z\":0")) << Dump(cube->GetGlog());
+    EXPECT_EQ(LoadOne<ThreeDPane>("ThreeD", kCube)->GetValue(), (Point3D{0.0, 0.0, 0.0}));
+}
+
+TEST_F(GraphicItemsTest, ACubeIsSeenFromWhereItIsTold) {
+    ThreeDPane *const cube = LoadOne<ThreeDPane>(
+        "ThreeD", "<BoundsRect top=\"0\" left=\"0\" bottom=\"200\" right=\"200\"/><Angle>0</Angle>"
+                  "<Viewpoint x=\"0\" y=\"0\" z=\"-3000\"/><Radius>0</Radius>"
+                  "<Margins top=\"0\" left=\"0\" bottom=\"0\" right=\"0\"/>");
+    // 100 + 200 * 0.5 / 3 across, 100 + 200 * 0.25 / 3 down
+    EXPECT_EQ(cube->Project({0.5, -0.25, 0.0}).h, 133);
+    EXPECT_EQ(cube->Project({0.5, -0.25, 0.0}).v, 116);
+}
+
+TEST_F(GraphicItemsTest, ACubeFollowsItsBox) {
+    ThreeDPane *const cube = LoadOne<ThreeDPane>("ThreeD", kCube);
+    Point const before = cube->Project({0.1, 0.2, 0.3});
+    cube->Offset({30, 40});
+    EXPECT_EQ(cube->Project({0.1, 0.2, 0.3}).h, before.h + 40);
+    EXPECT_EQ(cube->Project({0.1, 0.2, 0.3}).v, before.v + 30);
+}
+
+TEST_F(GraphicItemsTest, WatchersHearWhereThePointGoes) {
+    ThreeDPane *const cube = LoadOne<ThreeDPane>("ThreeD", kCube);
+    desktop.TakeMessages();
+    cube->SetValue({0.5, 0.0, -0.25});
+    std::vector<std::string> const heard = desktop.TakeMessages();
+    ASSERT_EQ(heard.size(), 1u);
+    EXPECT_TRUE(Holds(heard.front(), "\"message\":\"PointMoved\",\"x\":0.5,\"y\":0,\"z\":-0.25"))
+        << heard.front();
+}
+
+TEST_F(GraphicItemsTest, ACubeRefusesPlacesOutsideOfIt) {
+    for (std::string const key :
+         {"<Location x=\"1001\" y=\"0\" z=\"0\"/>", "<Location x=\"0\" y=\"0\"/>", "<Angle>361</Angle>",
+          "<Radius>-1</Radius>", "<Radius>1001</Radius>", "<Viewpoint x=\"0\" y=\"0\" z=\"32768\"/>"})
+        EXPECT_NE(ComplaintAboutItem("ThreeD", kCube + key), "no complaint") << key;
+    EXPECT_NE(ComplaintAboutItem("ThreeD", ""), "no complaint");
 }

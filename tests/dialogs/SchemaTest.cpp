@@ -68,7 +68,8 @@ std::set<std::string> const kStockTypes = {"OvalButton",
                                            "DurationNote",
                                            "ProgressBar",
                                            "Line",
-                                           "Tabs"};
+                                           "Tabs",
+                                           "ThreeD"};
 
 std::set<std::string> KeysOfStockTypes() {
     std::set<std::string> names = {"Items"};
