@@ -10,10 +10,6 @@ std::string const kPlace = "<BoundsRect top=\"10\" left=\"20\" bottom=\"30\" rig
 
 std::string const kCube = "<BoundsRect top=\"0\" left=\"0\" bottom=\"238\" right=\"224\"/>";
 
-std::ostream &operator<<(std::ostream &out, Point3D const &p) {
-    return out << "{x " << p.x << ", y " << p.y << ", z " << p.z << "}";
-}
-
 class GraphicItemsTest : public DialogTest {};
 
 } // namespace
