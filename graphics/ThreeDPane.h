@@ -87,7 +87,7 @@ protected:
     bool PointOnAxis(Point, Axis3D *) const; // the nearest axis less than 6 pixels away; null is not allowed
     bool NearZero(Point, Axis3D) const;      // less than 5 pixels from the axis's zero
     Axis3D GetDragAxis(Point) const;         // along which a drag from there goes
-    void SetCursorForAxis(Axis3D, bool atZero) const;
+    void SetCursorForAxis(Axis3D, bool atZero) const; // of moving along it, or of moving at its zero
     // Follows the mouse until its button is up; the offset, in pixels, is from the mouse to the point that is
     // dragged.
     void TrackClick(Axis3D, Point offset);
