@@ -22,7 +22,7 @@ public:
     struct Image {
         double x, y;
     };
-    Image Project(Point3D const &) const;
+    Image Project(Point3D const &) const; // the point times the matrix, by its w
 
 private:
     static int const kSide = 4;

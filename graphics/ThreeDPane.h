@@ -34,7 +34,7 @@ public:
 
     // Where things lie, in pixels of the pane. What cannot be seen from the viewpoint gives any pixel.
 
-    Point Project(Point3D) const;
+    Point Project(Point3D) const; // of a place in the cube
     // Of the value with the coordinate 0.0 instead of its own.
     Point AxisZeroPoint(Axis3D) const;
     // The ends of the line through the value along the axis: a at -1.0, b at 1.0.
@@ -70,11 +70,11 @@ protected:
 
     // Drawing, all on the current port
 
-    void DrawLine(Axis3D) const;      // through the value
-    void DrawBackHalfOfZLine() const; // from the ball to the back wall, and the front half to the eye
-    void DrawFrontHalfOfZLine() const;
-    void DrawIndicator() const; // the ball
-    void DrawShadow() const;    // of the ball, within the walls
+    void DrawLine(Axis3D) const;       // through the value
+    void DrawBackHalfOfZLine() const;  // from the ball to the back wall
+    void DrawFrontHalfOfZLine() const; // from the ball to the front; nothing when it touches that
+    void DrawIndicator() const;        // the ball
+    void DrawShadow() const;           // of the ball, within the walls
     // Appends the grid of a wall, in steps of 0.25, and makes the colour a green; for subclasses that draw
     // the cube themselves.
     void DrawWall(OSPath &, Axis3D, double wall) const;
