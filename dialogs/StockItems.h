@@ -18,3 +18,4 @@ void AddSelectItems(ItemRegistry &);   // Select, SelectString
 void AddListItems(ItemRegistry &);     // List
 void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line
 void AddThreeDItems(ItemRegistry &);   // ThreeD
+void AddTextItems(ItemRegistry &);     // TextField, TextEdit

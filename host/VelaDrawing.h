@@ -143,5 +143,6 @@ void Frame3DRect(Rect const *, short depth, short gray);
 // Draws the inner shadow of a list below a horizontal line or to the right of a vertical one; other lines
 // draw nothing.
 void DrawShadowLine(Point, Point);
-// Draws the frame of an editable text just inside the rectangle.
+// Draws the frame of an editable text just inside the rectangle: an outline and, within it, as much paper,
+// both one pixel wide.
 void FrameTextWell(Rect const &);

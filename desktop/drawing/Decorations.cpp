@@ -99,6 +99,12 @@ void FrameTextWell(Rect const &r) {
         return;
     Rect inside = r;
     VelaDrawing::InsetRect(&inside, 1, 1);
+    // Text begins a little inside of the frame, and its paper with it.
+    Rect text = inside;
+    VelaDrawing::InsetRect(&text, 1, 1);
+    if (VelaDrawing::EmptyRect(&text))
+        text = {inside.top, inside.left, inside.top, inside.left};
+    pixels.FillFrame(pixels.ToDevice(inside), pixels.ToDevice(text), ToRGBA(kTextWellBackgroundColor));
     pixels.FillFrame(pixels.ToDevice(r), pixels.ToDevice(inside), Outline(kWellBorderAlpha));
     // The well lies deeper than its surroundings: light from above leaves its upper edge in the shade.
     pixels.Fill(pixels.ToDevice(r.left, r.top, r.right, r.top + 1), Shade(kWellTopBorderAlpha));

@@ -2,6 +2,9 @@
 #include "desktop/drawing/PixelOverlay.h"
 #include "desktop/drawing/Region.h"
 #include "desktop/drawing/ThemeColors.h"
+#include "desktop/editing/KeyEvent.h"
+#include "desktop/editing/TextEditor.h"
+#include "desktop/editing/TextFocus.h"
 #include "desktop/layout/LayoutEngine.h"
 #include "desktop/menus/MenuTracker.h"
 #include "desktop/panes/DesktopRep.h"
@@ -12,20 +15,24 @@
 #include "desktop/resources/Utf.h"
 #include "desktop/windows/HelpTagWindow.h"
 #include "host/CompoundPane.h"
+#include "host/EditCommands.h"
 #include "host/NamedColors.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/Services.h"
 #include <algorithm>
+#include <list>
 
 namespace {
 
 int const kMaxSide = 16000;
 
-// Kinds of a classic event record.
-unsigned short const kMouseDownEvent = 1;
-unsigned short const kKeyDownEvent = 3;
-unsigned short const kAutoKeyEvent = 5;
 double const kTicksPerSecond = 60.0;
+
+// What Key answers when the pane counts as hit.
+int const kHitByModifying = 2;
+// With these the tab key does not move on to another pane.
+unsigned short const kTabModifiers = Modifiers::kCommand | Modifiers::kControl | Modifiers::kOption;
 
 unsigned int Ticks(double seconds) { return static_cast<unsigned int>(seconds * kTicksPerSecond + 0.5); }
 
@@ -37,13 +44,11 @@ short Coordinate16(int value) { return static_cast<short>(std::clamp(value, -327
 
 Point InWindow(InputEvent const &event) { return {Coordinate16(event.v), Coordinate16(event.h)}; }
 
-EventRecordAdapter RecordOf(InputEvent const &event, unsigned short what) {
-    EventRecordAdapter record;
+void FillRecord(EventRecordAdapter &record, InputEvent const &event, unsigned short what) {
     record.what = what;
     record.when = Ticks(event.time);
     record.where = InWindow(event);
     record.modifiers = event.modifiers;
-    return record;
 }
 
 // The low byte is the ASCII character where there is one, else a named key; the next sixteen bits are the
@@ -74,7 +79,7 @@ Glog::Glog(Desktop &desktop_, GlogOptions const &options_)
 Glog::~Glog() {
     HostCall const call;
     if (window)
-        Tell(&TarnOSWindow::OSWindow_PlatformWindowListener::PlatformWindow_Closing);
+        TellClosing();
     current = nullptr;
     while (!items.empty())
         delete items.back();
@@ -82,6 +87,24 @@ Glog::~Glog() {
         DrawingPort::MakeCurrent(nullptr);
     if (EventLoop *loop = EventLoop::Open())
         loop->WindowGone(window.get());
+}
+
+// A pane that leaves its glog because the window closes would be nobody's: it goes all the same.
+void Glog::TellClosing() {
+    struct Owned {
+        explicit Owned(GlogPane *pane_)
+            : pane(pane_)
+            , watch(pane_) {}
+        GlogPane *pane;
+        PaneWatch const watch;
+    };
+    std::list<Owned> before;
+    for (GlogPane *pane : items)
+        before.emplace_back(pane);
+    Tell(&TarnOSWindow::OSWindow_PlatformWindowListener::PlatformWindow_Closing);
+    for (Owned const &owned : before)
+        if (owned.watch.PaneExists() && !owned.pane->GetGlog() && !PaneAccess::Container(*owned.pane))
+            delete owned.pane;
 }
 
 void Glog::Tell(void (TarnOSWindow::OSWindow_PlatformWindowListener::*what)(TarnOSWindow::OSWindow &)) {
@@ -395,7 +418,8 @@ void Glog::ReportHit(int value) {
 
 void Glog::Click(InputEvent const &event) {
     HostCall const call;
-    EventRecordAdapter record = RecordOf(event, kMouseDownEvent);
+    EventRecordAdapter record;
+    FillRecord(record, event, EventKinds::kMouseDown);
     GlogPane *const pane = TopmostAt(record.where);
     if (current && current != pane && current->GetVisibility()) {
         Point const origin = PaneAccess::Origin(*current);
@@ -466,26 +490,55 @@ void Glog::GrowTo(int newWidth, int newHeight) {
 }
 
 bool Glog::DispatchKey(EventRecordAdapter &record, InputEvent const &event) {
-    if (event.key == KeyCodes::kTab &&
-        !(event.modifiers & (Modifiers::kCommand | Modifiers::kControl | Modifiers::kOption)))
+    if (event.key == KeyCodes::kTab && !(event.modifiers & kTabModifiers))
         return OfferTab(event.modifiers & Modifiers::kShift ? -1 : 1);
     if (!current)
         return false;
     GlogPane *const pane = current;
     int const id = pane->GetID();
     int const value = PaneEvents::Key(*pane, record);
-    if (value == 2 && !disposed) {
+    if (value == kHitByModifying && !disposed) {
         hitItem = id;
         ReportHit(value);
     }
     return value != 0;
 }
 
+// What an active text does not take is the current item's.
 void Glog::KeyDown(InputEvent const &event) {
     HostCall const call;
-    EventRecordAdapter record = RecordOf(event, event.repeat ? kAutoKeyEvent : kKeyDownEvent);
+    KeyEvent record;
+    FillRecord(record, event, event.repeat ? EventKinds::kAutoKey : EventKinds::kKeyDown);
     record.message = KeyMessage(event);
-    DispatchKey(record, event);
+    record.text = event.text;
+    if (RunEditCommand(event))
+        return;
+    TextEditor *const text = TextFocus::Of(*this);
+    bool const movesOn = event.key == KeyCodes::kTab && !(event.modifiers & kTabModifiers);
+    if (!text || movesOn || !text->TakeKey(record))
+        DispatchKey(record, event);
+}
+
+// The shortcuts of editing reach whichever pane has the keyboard, if it knows them.
+bool Glog::RunEditCommand(InputEvent const &event) {
+    CommandSpecifier const command = EditCommands::OfKey(event.key, event.modifiers);
+    if (command.classID == 0 || !current)
+        return false;
+    int const id = current->GetID();
+    bool commits = false;
+    if (!EditCommands::Run(this, command, commits))
+        return false;
+    if (commits && !disposed) {
+        hitItem = id;
+        ReportHit(kHitByModifying);
+    }
+    return true;
+}
+
+void Glog::ComposeText(InputEvent const &event) {
+    HostCall const call;
+    if (TextEditor *const text = TextFocus::Of(*this))
+        text->Compose(event.text, event.compositionCaret);
 }
 
 void Glog::AddToTabOrder(GlogPane &pane, std::vector<GlogPane *> &order) const {

@@ -84,6 +84,7 @@ public:
     // Events; positions in window coordinates
     void Click(InputEvent const &);
     void KeyDown(InputEvent const &);
+    void ComposeText(InputEvent const &); // by an input method
     void Wheel(InputEvent const &);
     void PointerMoved(Point);
     void PointerLeft();
@@ -113,7 +114,9 @@ private:
     std::vector<GlogPane *> TabOrder(char direction) const;
     void AddToTabOrder(GlogPane &, std::vector<GlogPane *> &) const;
     void Tell(void (TarnOSWindow::OSWindow_PlatformWindowListener::*what)(TarnOSWindow::OSWindow &));
+    void TellClosing();
     bool DispatchKey(EventRecordAdapter &, InputEvent const &);
+    bool RunEditCommand(InputEvent const &);
 
     Desktop &desktop;
     GlogOptions options;

@@ -244,6 +244,8 @@ FontMetrics const &FontLibrary::Metrics(FontSpec const &spec) {
     return font.metrics;
 }
 
+PangoFontDescription const *FontLibrary::Description(FontSpec const &spec) { return Find(spec).description; }
+
 // Other copies of the pinned files' families are left out: they would take turns with these.
 bool FontLibrary::AddSystemFonts() {
     if (systemFonts)

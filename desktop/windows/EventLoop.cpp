@@ -151,6 +151,9 @@ void EventLoop::Handle(InputEvent const &event) {
         helpTags->Hide();
         glog->KeyDown(event);
         break;
+    case InputEvent::kTextEditing:
+        glog->ComposeText(event);
+        break;
     case InputEvent::kCloseRequested:
         DisposeGlog(glog);
         break;

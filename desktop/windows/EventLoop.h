@@ -73,6 +73,7 @@ public:
 
     double LastEventTime() const;
     bool LastPressWasDouble() const { return lastPressClicks == 2; }
+    int LastPressClicks() const { return lastPressClicks; }
     void WindowShown(PlatformWindow *); // is about to be, which will activate it
     void WindowHidden(PlatformWindow *);
     void WindowGone(PlatformWindow *);
