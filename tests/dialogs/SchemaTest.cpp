@@ -63,6 +63,8 @@ std::set<std::string> const kStockTypes = {"OvalButton",
                                            "Select",
                                            "SelectString",
                                            "List",
+                                           "TextField",
+                                           "TextEdit",
                                            "PopUpMenu",
                                            "ScrollBarPopUpMenu",
                                            "DurationNote",
@@ -87,7 +89,7 @@ TEST(Schema, KnowsTheKeysOfTheStockTypesAndNoOthers) {
     std::set<std::string> known;
     for (char const *group :
          {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels", "Groups",
-          "ScrollBars", "Scrolled", "Selectables", "Lists", "Menus", "Graphics"})
+          "ScrollBars", "Scrolled", "Selectables", "Lists", "TextFields", "Menus", "Graphics"})
         CollectElements(*Named(schema.Root(), "xs:group", group), known);
     EXPECT_EQ(known, KeysOfStockTypes());
 }
