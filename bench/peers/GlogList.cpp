@@ -1,4 +1,5 @@
 // The list in our panes: a grid, which moves the pixels that stay in view.
+#include "bench/peers/GlogToolkit.h"
 #include "bench/peers/PeerList.h"
 #include "desktop/Desktop.h"
 #include "host/UString.h"
@@ -31,7 +32,7 @@ public:
     }
     void ScrollTo(int position) override {
         grid->Scroll(position - grid->GetScrollOffset());
-        UpdateGlog(glog); // the bar, which is told last
+        FinishDrawing(glog); // the bar, which is told last
     }
     void Settle() override { desktop.ProcessEvents(0); }
 

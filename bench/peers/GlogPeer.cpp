@@ -1,4 +1,5 @@
 // The form in our panes: one group of all check boxes, or with PEER_PANE_EACH a pane for each of them.
+#include "bench/peers/GlogToolkit.h"
 #include "bench/peers/Peer.h"
 #include "bench/peers/PeerForm.h"
 #include "buttons/CheckBoxPane.h"
@@ -76,14 +77,14 @@ public:
         Rect const all = {0, 0, GetGlogHeight(glog), GetGlogWidth(glog)};
         SetPortToGlog(glog);
         VelaDrawing::InvalRect(&all);
-        UpdateGlog(glog); // returns when the server has the pixels
+        FinishDrawing(glog);
     }
     void Toggle(int box) override {
         if (kPaneEach)
             panes[static_cast<std::size_t>(box)]->ToggleOne(0);
         else
             panes.front()->ToggleOne(static_cast<short>(box));
-        UpdateGlog(glog);
+        FinishDrawing(glog);
     }
     void RepaintOffscreen() override { Repaint(); }
 

@@ -1,4 +1,5 @@
 // The list in our panes: a GListPane with the drawer of texts.
+#include "bench/peers/GlogToolkit.h"
 #include "bench/peers/PeerTable.h"
 #include "desktop/Desktop.h"
 #include "frame/GListPane_SelectionListener.h"
@@ -48,11 +49,11 @@ public:
         Rect const all = {0, 0, kHeight, kWidth};
         SetPortToGlog(glog);
         VelaDrawing::InvalRect(&all);
-        UpdateGlog(glog);
+        FinishDrawing(glog);
     }
     void ScrollTo(int row) override {
         list->SetScrollPosition(row);
-        UpdateGlog(glog);
+        FinishDrawing(glog);
     }
     void Settle() override { desktop.ProcessEvents(0); }
     void WaitUntilHeard() override {

@@ -116,13 +116,7 @@ void MenuPanel::Present(Rect const &local) {
         return;
     }
     DeviceRect const part = scale.ToDevice(local.left, local.top, local.right, local.bottom);
-    if (window->Present(*surface, &part, 1))
-        return;
-    port.SetSurface(nullptr, scale);
-    surface.reset();
-    MakeSurface(scale);
-    DeviceRect const all{0, 0, surface->Width(), surface->Height()};
-    window->Present(*surface, &all, 1);
+    window->Present(*surface, &part, 1);
 }
 
 // Geometry

@@ -361,15 +361,12 @@ void Glog::DrawDamage(OSRgn const &region) {
 }
 
 void Glog::Present(std::vector<DeviceRect> const &rects) {
-    auto const present = [&] {
-        WithOutline const outlined(*surface, scale, outline);
-        WithOverlays const menus(*surface, MenuTracker::DrawnOver(*this));
-        return window->Present(*surface, rects.data(), rects.size());
-    };
-    if (present())
-        return;
-    MakeSurface();
-    Update();
+    std::vector<PixelOverlay> const menus = MenuTracker::DrawnOver(*this);
+    WithOutline const outlined(*surface, scale, outline);
+    WithOverlays const covered(*surface, menus);
+    window->Present(*surface, rects.data(), rects.size());
+    if (outline.Shown() || !menus.empty())
+        window->Finish(); // before they are taken off again
 }
 
 void Glog::PresentAll() {

@@ -29,6 +29,12 @@ bool InputQueue::Pop(InputEvent &event) {
     return true;
 }
 
+bool InputQueue::HasOnlyLasting() const {
+    return !events.empty() && std::none_of(events.begin(), events.end(), [](InputEvent const &event) {
+        return event.kind == InputEvent::kMouseMove || IsOfLatestOnly(event.kind);
+    });
+}
+
 bool InputQueue::HasRelease(PlatformWindow const *window) const {
     return std::any_of(events.begin(), events.end(), [window](InputEvent const &event) {
         return event.kind == InputEvent::kMouseUp && event.window == window;

@@ -14,6 +14,8 @@ public:
     // False when there is none.
     bool Pop(InputEvent &);
     bool Empty() const { return events.empty(); }
+    // Whether something waits, and no event that is still to come could take the place of any of it.
+    bool HasOnlyLasting() const;
     // Whether a release of a mouse button waits, for the window.
     bool HasRelease(PlatformWindow const *) const;
     // The event pushed last, while it waits; null otherwise.

@@ -39,9 +39,11 @@ public:
     // one may be there at a time: let go of it before the next call, and before the window.
     virtual std::unique_ptr<Surface> NewSurface(int deviceWidth, int deviceHeight);
     // Copies the rectangles of the surface to the screen. They may reach beyond the surface; what does is not
-    // copied. False, with nothing shown, when the window system has dropped the memory that NewSurface gave,
-    // as it does when the window's size changes: that surface may still be drawn on, but another is needed.
-    virtual bool Present(Surface const &, DeviceRect const *, std::size_t count) = 0;
+    // copied. The surface that NewSurface gave may still be read from when the call returns: what is drawn on
+    // it then may be seen, until the next call shows all of it.
+    virtual void Present(Surface const &, DeviceRect const *, std::size_t count) = 0;
+    // Returns when nothing is read from a presented surface any more.
+    virtual void Finish() {}
     // Lets an input method work at the place (content coordinates), or stops it.
     virtual void StartTextInput(Rect const &caret) = 0;
     virtual void StopTextInput() = 0;

@@ -1,6 +1,7 @@
 #include "desktop/windows/SdlWindow.h"
 #include "desktop/drawing/Surface.h"
 #include "desktop/drawing/WholePixels.h"
+#include "desktop/windows/SdlPicture.h"
 #include "desktop/windows/SdlScreen.h"
 #include "desktop/windows/SdlWindowSystem.h"
 #include <SDL.h>
@@ -50,6 +51,7 @@ SdlWindow::SdlWindow(SdlWindowSystem &system_, WindowSpec const &spec, DeviceSca
 
 SdlWindow::~SdlWindow() {
     system.Remove(this);
+    picture.reset();
     SDL_DestroyWindow(window);
 }
 
@@ -106,13 +108,19 @@ void SdlWindow::CorrectPlace() {
         SetPlace(placeH, placeV);
 }
 
-// The picture goes out at once: it would otherwise wait for the exposure, and so for all events before it.
-// SDL refuses one that has not the window's size.
+// The pixels go out at once: they would otherwise wait for the exposure, and so for all events before it. SDL
+// refuses a picture that has not the window's size.
 void SdlWindow::Show() {
     SDL_ShowWindow(window);
-    if (keptHidden)
-        SDL_UpdateWindowSurface(window);
+    if (!keptHidden)
+        return;
     keptHidden = false;
+    if (!picture) {
+        SDL_UpdateWindowSurface(window);
+        return;
+    }
+    SDL_Rect const all = {0, 0, picture->Width(), picture->Height()};
+    picture->Show(&all, 1);
 }
 
 void SdlWindow::Hide() { SDL_HideWindow(window); }
@@ -161,47 +169,61 @@ static void CopyPixels(Surface const &from, DeviceRect const &rect, SDL_Surface 
                       from.Width() * kSurfacePixelBytes, to.format->format, target, to.pitch);
 }
 
-static bool HasFormatOfSurfaces(SDL_Surface const &screen) {
-    return screen.format->format == kSurfaceFormat && screen.pitch == screen.w * kSurfacePixelBytes;
+std::unique_ptr<Surface> SdlWindow::NewSurface(int deviceWidth, int deviceHeight) {
+    picture = SdlPicture::New(window, deviceWidth, deviceHeight);
+    if (!picture)
+        return PlatformWindow::NewSurface(deviceWidth, deviceHeight);
+    return std::make_unique<Surface>(picture->Pixels(), deviceWidth, deviceHeight);
 }
 
-std::unique_ptr<Surface> SdlWindow::NewSurface(int deviceWidth, int deviceHeight) {
-    lent = nullptr;
-    SDL_Surface *screen = SDL_GetWindowSurface(window);
-    if (screen == nullptr || screen->w != deviceWidth || screen->h != deviceHeight ||
-        !HasFormatOfSurfaces(*screen))
-        return PlatformWindow::NewSurface(deviceWidth, deviceHeight);
-    std::unique_ptr<Surface> surface(
-        new Surface(static_cast<std::uint32_t *>(screen->pixels), deviceWidth, deviceHeight));
-    lent = surface->Pixels();
-    return surface;
+bool SdlWindow::IsInPicture(Surface const &surface) const {
+    return picture && surface.Pixels() == picture->Pixels();
 }
 
 // A rectangle that lies wholly outside the window would be refused by the X server, which ends the program:
 // nothing but what both have goes there. They differ between a resize and the surface that answers it.
-bool SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
-    bool const inPlace = lent != nullptr && surface.Pixels() == lent;
-    SDL_Surface *screen = inPlace ? nullptr : SDL_GetWindowSurface(window);
-    DeviceRect common = {0, 0, surface.Width(), surface.Height()};
-    if (screen != nullptr)
-        common = common.Intersected({0, 0, screen->w, screen->h});
-    else if (!inPlace)
-        return true; // the server is out of memory for pictures: the next exposure tries again
-    updated.clear();
-    for (std::size_t i = 0; i < count; ++i) {
-        DeviceRect rect = rects[i].Intersected(common);
+void SdlWindow::CopyToSdl(Surface const &surface) {
+    SDL_Surface *const screen = SDL_GetWindowSurface(window);
+    if (screen == nullptr) {
+        updated.clear(); // the server is out of memory for pictures: the next exposure tries again
+        return;
+    }
+    DeviceRect const common = DeviceRect{0, 0, screen->w, screen->h};
+    std::size_t kept = 0;
+    for (SDL_Rect const &wanted : updated) {
+        DeviceRect const rect =
+            common.Intersected({wanted.x, wanted.y, wanted.x + wanted.w, wanted.y + wanted.h});
         if (rect.Empty())
             continue;
-        if (screen != nullptr)
-            CopyPixels(surface, rect, *screen);
-        updated.push_back({rect.left, rect.top, rect.Width(), rect.Height()});
+        CopyPixels(surface, rect, *screen);
+        updated[kept++] = {rect.left, rect.top, rect.Width(), rect.Height()};
     }
+    updated.resize(kept);
+}
+
+void SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
+    DeviceRect const all = {0, 0, surface.Width(), surface.Height()};
+    updated.clear();
+    for (DeviceRect const *rect = rects; rect != rects + count; ++rect) {
+        DeviceRect const part = rect->Intersected(all);
+        if (!part.Empty())
+            updated.push_back({part.left, part.top, part.Width(), part.Height()});
+    }
+    bool const inPicture = IsInPicture(surface);
+    if (!inPicture)
+        CopyToSdl(surface);
     keptHidden = (SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) != 0;
     if (updated.empty() || keptHidden)
-        return true;
-    int const refused =
+        return;
+    if (inPicture)
+        picture->Show(updated.data(), updated.size());
+    else
         SDL_UpdateWindowSurfaceRects(window, updated.data(), static_cast<int>(updated.size()));
-    return refused == 0 || !inPlace;
+}
+
+void SdlWindow::Finish() {
+    if (picture)
+        picture->Finish();
 }
 
 void SdlWindow::StartTextInput(Rect const &caret) {

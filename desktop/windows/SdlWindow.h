@@ -7,11 +7,10 @@
 
 struct SDL_Rect;
 struct SDL_Window;
+class SdlPicture;
 class SdlWindowSystem;
 
-// Larger than its logical size by its scale. SDL keeps its pixels in memory that NewSurface gives away where
-// it suits, and that other surfaces are copied to; only until the next resize. The window system must outlive
-// it.
+// Larger than its logical size by its scale. The window system must outlive it.
 class SdlWindow : public PlatformWindow {
 public:
     // Throws std::runtime_error with SDL's reason.
@@ -54,7 +53,8 @@ public:
     Point ScreenPlace() const override;
     double Scale() const override { return scale.Factor(); }
     std::unique_ptr<Surface> NewSurface(int deviceWidth, int deviceHeight) override;
-    bool Present(Surface const &, DeviceRect const *, std::size_t count) override;
+    void Present(Surface const &, DeviceRect const *, std::size_t count) override;
+    void Finish() override;
     void StartTextInput(Rect const &caret) override;
     void StopTextInput() override;
 
@@ -67,6 +67,8 @@ private:
         }
     };
     void ApplySizeLimits();
+    bool IsInPicture(Surface const &) const;
+    void CopyToSdl(Surface const &);
     static int WholeLogicalPixels(DeviceScale, int device, int current);
 
     SdlWindowSystem &system;
@@ -77,7 +79,7 @@ private:
     SizeLimits limits;
     bool placePending; // `placeH` and `placeV` wait for the frame
     int placeH, placeV;
-    std::uint32_t const *lent = nullptr; // SDL's pixels that a surface of ours lies in
-    bool keptHidden = false;             // SDL has a picture of ours that could not be shown yet
+    std::unique_ptr<SdlPicture> picture; // of the surface that was given; null: SDL's is shown
+    bool keptHidden = false;             // there are pixels of ours that could not be shown yet
     std::vector<SDL_Rect> updated;       // of one Present; kept for its memory
 };

@@ -9,6 +9,7 @@
 
 static double const kMillisecondsPerSecond = 1000.0;
 static double const kLongestBlock = 3600.0;     // seconds; SDL counts milliseconds in 32 bits
+static double const kShortestBlock = 0.001;     // seconds
 static double const kInputMethodInterval = 0.1; // seconds
 
 SdlWindowSystem::SdlWindowSystem(double forcedScale_)
@@ -105,17 +106,23 @@ void SdlWindowSystem::Send(InputEvent::Kind kind, SdlWindow *window) {
     queue.Push(event);
 }
 
+// The server is asked as seldom as that goes: each look for events is several calls of the system.
 bool SdlWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter, char const *) {
+    if (queue.HasOnlyLasting() && TakeEvent(event))
+        return true;
     double const end = Now() + timeout;
+    bool const blocks = timeout < 0 || timeout > kShortestBlock;
+    bool mayHaveCome = !blocks || !queue.Empty();
     for (;;) {
-        Pump();
+        if (mayHaveCome)
+            Pump();
         if (TakeEvent(event))
             return true;
-        double left = timeout < 0 ? kLongestBlock : end - Now();
+        double const left = timeout < 0 ? kLongestBlock : end - Now();
         if (!(left > 0)) // also true for what is not a number
             return false;
-        bool const came = Block(left);
-        if (!came && timeout >= 0 && end <= Now())
+        mayHaveCome = Block(left);
+        if (!mayHaveCome && timeout >= 0 && end <= Now())
             return false;
     }
 }

@@ -48,7 +48,7 @@ void SimulatedWindow::SetSizeLimits(int minWidth_, int minHeight_, int maxWidth_
     maxHeight = maxHeight_;
 }
 
-bool SimulatedWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
+void SimulatedWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
     if (!picture || picture->Width() != surface.Width() || picture->Height() != surface.Height())
         picture.reset(new Surface(surface.Width(), surface.Height()));
     for (std::size_t i = 0; i < count; ++i) {
@@ -62,7 +62,6 @@ bool SimulatedWindow::Present(Surface const &surface, DeviceRect const *rects, s
             std::memcpy(picture->Row(y) + r.left, surface.Row(y) + r.left,
                         static_cast<std::size_t>(r.Width()) * sizeof(std::uint32_t));
     }
-    return true;
 }
 
 std::vector<DeviceRect> SimulatedWindow::TakePresented() {

@@ -23,7 +23,7 @@ public:
     int Height() const override { return height; }
     Point ScreenPlace() const override { return place; }
     double Scale() const override { return scale; }
-    bool Present(Surface const &, DeviceRect const *, std::size_t count) override;
+    void Present(Surface const &, DeviceRect const *, std::size_t count) override;
     void StartTextInput(Rect const &) override {} // a script types what it wants
     void StopTextInput() override {}
 

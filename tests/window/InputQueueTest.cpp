@@ -121,3 +121,17 @@ TEST(InputQueue, AReleaseOfTheMouseWaitsForItsWindowAlone) {
     TakeAll(queue);
     EXPECT_FALSE(queue.HasRelease(Window(1)));
 }
+
+TEST(InputQueue, WhatTheNextEventCouldReplaceIsNotLasting) {
+    InputQueue queue;
+    EXPECT_FALSE(queue.HasOnlyLasting());
+    queue.Push(Event(InputEvent::kMouseUp, 1));
+    EXPECT_TRUE(queue.HasOnlyLasting());
+    for (InputEvent::Kind const kind :
+         {InputEvent::kMouseMove, InputEvent::kResized, InputEvent::kMoved, InputEvent::kExposed}) {
+        InputQueue replaceable;
+        replaceable.Push(Event(kind, 1));
+        replaceable.Push(Event(InputEvent::kKeyDown, 1));
+        EXPECT_FALSE(replaceable.HasOnlyLasting()) << kind;
+    }
+}

@@ -1,4 +1,6 @@
 #include "tests/window/XScreen.h"
+#include <SDL.h>
+#include <SDL_syswm.h>
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
 #include <X11/extensions/Xfixes.h>
@@ -22,7 +24,20 @@ XScreen::XScreen()
 
 XScreen::~XScreen() {}
 
+// The server may take requests of two clients in any order.
+static void FinishRequestsOfSdl() {
+    Uint32 const kMostWindows = 1000; // of one process of tests
+    SDL_SysWMinfo info;
+    SDL_VERSION(&info.version);
+    for (Uint32 id = 1; SDL_WasInit(SDL_INIT_VIDEO) != 0 && id < kMostWindows; ++id)
+        if (SDL_Window *const window = SDL_GetWindowFromID(id); SDL_GetWindowWMInfo(window, &info)) {
+            XSync(info.info.x11.display, False);
+            return;
+        }
+}
+
 std::uint32_t XScreen::PixelAt(int x, int y) const {
+    FinishRequestsOfSdl();
     Display *display = connection->display;
     XImage *image = XGetImage(display, DefaultRootWindow(display), x, y, 1, 1, AllPlanes, ZPixmap);
     if (image == nullptr)

@@ -10,7 +10,7 @@ public:
     XScreen(XScreen const &) = delete;
     XScreen &operator=(XScreen const &) = delete;
 
-    // The colour at the place of the screen, as 0xRRGGBB.
+    // The colour at the place of the screen, as 0xRRGGBB, when all that SDL's windows have sent is there.
     std::uint32_t PixelAt(int x, int y) const;
     // Bits of each of the colours red, green and blue that the screen can show.
     // Sends an event to a window that there is not, as happens when one closes at that moment; returns when

@@ -1,0 +1,152 @@
+#include "desktop/windows/SdlPicture.h"
+#include <SDL.h>
+#include <SDL_syswm.h>
+#include <X11/Xutil.h>
+#include <X11/extensions/XShm.h>
+#include <sys/ipc.h>
+#include <sys/shm.h>
+
+static unsigned long const kRedMask = 0xFF0000, kGreenMask = 0xFF00, kBlueMask = 0xFF;
+static int const kPixelBits = 32, kPixelBytes = 4;
+static int const kOwnerOnly = 0600;
+
+struct SdlPicture::Shared {
+    Display *display = nullptr; // SDL's
+    ::Window window = 0;
+    GC context = nullptr;
+    XImage *image = nullptr;
+    XShmSegmentInfo segment = {};
+    bool attached = false;
+    unsigned long shown = 0; // number of the last request to the server that shows pixels
+
+    ~Shared();
+    bool FindWindow(SDL_Window *);
+    bool MakeImage(int width, int height);
+    bool MakeMemory();
+    bool Attach();
+};
+
+SdlPicture::Shared::~Shared() {
+    if (attached) {
+        XShmDetach(display, &segment);
+        XSync(display, False); // it may still be reading
+    }
+    if (context != nullptr)
+        XFreeGC(display, context);
+    if (image != nullptr) {
+        image->data = nullptr;
+        XDestroyImage(image);
+    }
+    if (segment.shmaddr != nullptr)
+        shmdt(segment.shmaddr);
+}
+
+bool SdlPicture::Shared::FindWindow(SDL_Window *of) {
+    SDL_SysWMinfo info;
+    SDL_VERSION(&info.version);
+    if (SDL_GetWindowWMInfo(of, &info) != SDL_TRUE || info.subsystem != SDL_SYSWM_X11)
+        return false;
+    display = info.info.x11.display;
+    window = info.info.x11.window;
+    return XShmQueryExtension(display) == True;
+}
+
+static bool HasOurPixels(XImage const &image, int width) {
+    int const probe = 1;
+    int const ourOrder = *reinterpret_cast<char const *>(&probe) != 0 ? LSBFirst : MSBFirst;
+    return image.bits_per_pixel == kPixelBits && image.bytes_per_line == width * kPixelBytes &&
+           image.byte_order == ourOrder && image.red_mask == kRedMask && image.green_mask == kGreenMask &&
+           image.blue_mask == kBlueMask;
+}
+
+bool SdlPicture::Shared::MakeImage(int width, int height) {
+    XWindowAttributes attributes;
+    if (!XGetWindowAttributes(display, window, &attributes))
+        return false;
+    image = XShmCreateImage(display, attributes.visual, static_cast<unsigned int>(attributes.depth), ZPixmap,
+                            nullptr, &segment, static_cast<unsigned int>(width),
+                            static_cast<unsigned int>(height));
+    return image != nullptr && HasOurPixels(*image, width);
+}
+
+// The system frees it when nobody has it any more, however the program ends.
+bool SdlPicture::Shared::MakeMemory() {
+    std::size_t const bytes =
+        static_cast<std::size_t>(image->bytes_per_line) * static_cast<std::size_t>(image->height);
+    segment.shmid = shmget(IPC_PRIVATE, bytes, IPC_CREAT | kOwnerOnly);
+    if (segment.shmid < 0)
+        return false;
+    void *const place = shmat(segment.shmid, nullptr, 0);
+    bool const mapped = place != reinterpret_cast<void *>(-1);
+    if (mapped)
+        segment.shmaddr = image->data = static_cast<char *>(place);
+    return mapped;
+}
+
+static bool theServerRefused = false;
+
+static int NoteRefusal(Display *, XErrorEvent *) {
+    theServerRefused = true;
+    return 0;
+}
+
+// A server on another machine refuses.
+bool SdlPicture::Shared::Attach() {
+    XSync(display, False);
+    theServerRefused = false;
+    XErrorHandler const before = XSetErrorHandler(NoteRefusal);
+    XShmAttach(display, &segment);
+    XSync(display, False);
+    XSetErrorHandler(before);
+    attached = !theServerRefused;
+    return attached;
+}
+
+std::unique_ptr<SdlPicture> SdlPicture::New(SDL_Window *window, int width, int height) {
+    std::unique_ptr<Shared> shared(new Shared);
+    if (!shared->FindWindow(window) || !shared->MakeImage(width, height))
+        return nullptr;
+    bool const usable = shared->MakeMemory() && shared->Attach();
+    if (shared->segment.shmid >= 0)
+        shmctl(shared->segment.shmid, IPC_RMID, nullptr);
+    if (!usable)
+        return nullptr;
+    shared->context = XCreateGC(shared->display, shared->window, 0, nullptr);
+    return std::unique_ptr<SdlPicture>(new SdlPicture(std::move(shared)));
+}
+
+SdlPicture::SdlPicture(std::unique_ptr<Shared> shared_)
+    : shared(std::move(shared_)) {}
+
+SdlPicture::~SdlPicture() {}
+
+std::uint32_t *SdlPicture::Pixels() const {
+    return reinterpret_cast<std::uint32_t *>(shared->segment.shmaddr);
+}
+
+int SdlPicture::Width() const { return shared->image->width; }
+
+int SdlPicture::Height() const { return shared->image->height; }
+
+// Every event and answer of the server tells how far it has come.
+static bool IsBehind(Display *display, unsigned long request) {
+    return LastKnownRequestProcessed(display) < request;
+}
+
+void SdlPicture::Show(SDL_Rect const *rects, std::size_t count) {
+    Display *const display = shared->display;
+    bool const behind = IsBehind(display, shared->shown);
+    for (SDL_Rect const *rect = rects; rect != rects + count; ++rect)
+        XShmPutImage(display, shared->window, shared->context, shared->image, rect->x, rect->y, rect->x,
+                     rect->y, static_cast<unsigned int>(rect->w), static_cast<unsigned int>(rect->h), False);
+    shared->shown = NextRequest(display) - 1;
+    if (behind)
+        XSync(display, False);
+    else
+        XFlush(display);
+}
+
+void SdlPicture::Finish() {
+    if (IsBehind(shared->display, shared->shown))
+        XSync(shared->display, False);
+}
