@@ -2,6 +2,7 @@
 #include <SDL.h>
 #include <SDL_syswm.h>
 #include <X11/extensions/XInput2.h>
+#include <poll.h>
 
 static Display *theDisplay = nullptr; // SDL's
 
@@ -28,6 +29,16 @@ void SdlScreen::GetMousePlace(int &x, int &y) {
     unsigned int modifiers = 0;
     XQueryPointer(theDisplay, DefaultRootWindow(theDisplay), &root, &child, &x, &y, &windowX, &windowY,
                   &modifiers);
+}
+
+bool SdlScreen::CanWait() { return theDisplay != nullptr; }
+
+bool SdlScreen::Wait(int milliseconds) {
+    XFlush(theDisplay);
+    if (XEventsQueued(theDisplay, QueuedAlready) > 0)
+        return true;
+    pollfd connection = {ConnectionNumber(theDisplay), POLLIN, 0};
+    return poll(&connection, 1, milliseconds) != 0; // an interruption by a signal counts
 }
 
 void SdlScreen::Forget() { theDisplay = nullptr; }

@@ -15,6 +15,12 @@ void IgnoreOtherWindowsMouse(SDL_Window *);
 // (0, 0) while there has been no window.
 void GetMousePlace(int &x, int &y);
 
+// Whether there is a connection to wait for; not before the first window.
+bool CanWait();
+// Waits for the server to send something, or for a signal, no longer than so many milliseconds. Whether
+// something came. SDL, whose own wait looks for events first, does not learn of it.
+bool Wait(int milliseconds);
+
 // SDL has given up its connection to the server.
 void Forget();
 

@@ -10,6 +10,7 @@
 static double const kMillisecondsPerSecond = 1000.0;
 static double const kLongestBlock = 3600.0;     // seconds; SDL counts milliseconds in 32 bits
 static double const kShortestBlock = 0.001;     // seconds
+static double const kLongestPause = 0.2;        // seconds
 static double const kInputMethodInterval = 0.1; // seconds
 
 SdlWindowSystem::SdlWindowSystem(double forcedScale_)
@@ -112,7 +113,7 @@ bool SdlWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter, char 
         return true;
     double const end = Now() + timeout;
     bool const blocks = timeout < 0 || timeout > kShortestBlock;
-    bool mayHaveCome = !blocks || !queue.Empty();
+    bool mayHaveCome = !blocks || !queue.Empty() || hasPaused;
     for (;;) {
         if (mayHaveCome)
             Pump();
@@ -136,13 +137,19 @@ bool SdlWindowSystem::TakeEvent(InputEvent &event) {
     return false;
 }
 
-// Whether something came. SDL has looked for it once more when nothing did.
+// Whether something came. SDL looks for events before it waits: for a pause of a moment that is more than all
+// the rest, so it is put off until the pause is over.
 bool SdlWindowSystem::Block(double seconds) {
     if (windows.empty() && waker == nullptr)
         OpenWaker();
     double longest = keyboard.MustAskInputMethod() ? kInputMethodInterval : kLongestBlock;
     // Rounded up: a rest of less than a millisecond would be waited for without blocking.
     int milliseconds = static_cast<int>(std::ceil(std::min(seconds, longest) * kMillisecondsPerSecond));
+    bool const brief = seconds < kLongestPause && !keyboard.MustAskInputMethod() && SdlScreen::CanWait();
+    if (brief && !SDL_HasEvents(SDL_FIRSTEVENT, SDL_LASTEVENT)) {
+        hasPaused = true;
+        return SdlScreen::Wait(milliseconds);
+    }
     return SDL_WaitEventTimeout(nullptr, milliseconds) != 0;
 }
 
@@ -154,6 +161,7 @@ void SdlWindowSystem::OpenWaker() {
 
 // Takes over everything that SDL knows, so that moves of the mouse can take each other's place.
 void SdlWindowSystem::Pump() {
+    hasPaused = false;
     SDL_PumpEvents();
     SDL_Event event;
     while (SDL_PeepEvents(&event, 1, SDL_GETEVENT, SDL_FIRSTEVENT, SDL_LASTEVENT) > 0)

@@ -83,4 +83,5 @@ private:
     SdlCursors cursors;
     SDL_Window *waker = nullptr; // see OpenWaker
     bool activationLost = false; // since the last Pump
+    bool hasPaused = false;      // since then; signals and input methods may have been missed
 };
