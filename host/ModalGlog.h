@@ -11,8 +11,14 @@ enum RunIdleChores { kDontRunIdleChores = 0, kRunIdleChores = 1 };
 // event: the filter has written the item that was hit and its value, and the glog does not see it.
 typedef char (*GlogFilterHook)(glogRec *, void *self, EventRecordAdapter *, short *item, int *value);
 
-// Runs the glog, and no other, until one of its items is hit; writes the item's number and its value, and
-// leaves the glog open. The filter may be null; `self` is handed to it. The numbers and flags between filter
-// and chores are kept for callers and change nothing.
-void DoModalGlog(glogRec *, short *item, int *value, GlogFilterHook, void *self, bool flag, int two, int a,
-                 int b, bool no, RunIdleChores);
+// Runs the glog, which is shown, and no other, until one of its items is hit; writes the item's number and
+// its value, and leaves the glog open. Writes -1 as the item, and perhaps no value, when there is no glog or
+// none is shown, when it goes away, and when the program is to end. The filter may be null; `self` is handed
+// to it.
+//
+// Return and enter press the item `confirm`, escape and closing the window the item `cancel`; 0 stands for
+// the items 1 and 2. A pane that has the keyboard may take the keys itself, and a button that is disabled is
+// not hit. Where no pane has the number of the cancelling item, that item counts as hit all the same. The
+// flags, and the 2, change nothing.
+void DoModalGlog(glogRec *, short *item, int *value, GlogFilterHook, void *self, bool flag, int two,
+                 int confirm, int cancel, bool no, RunIdleChores);

@@ -54,7 +54,8 @@ bool GlogError(glogRec *);
 
 namespace LowLevelGlogOpening {
 
-// Opens the glog of a window resource, invisible at first; null when there is no such resource or it cannot
-// be opened. The flag is false and the container null.
+// Opens the glog of a window resource, invisible at first: the dialog windows/NUMBER.xml in one of the
+// resources' directories, for programs that have the library of dialogs. Null when there is no such resource
+// or it cannot be opened. The flag is false and the container null.
 glogRec *NewGlog(short resource, TarnOSWindow::OSWindow::SendBehindArg, bool, ContainerGlog *);
 } // namespace LowLevelGlogOpening

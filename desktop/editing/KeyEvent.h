@@ -6,7 +6,7 @@
 
 namespace EventKinds {
 // As in classic event records.
-enum Kind : unsigned short { kMouseDown = 1, kKeyDown = 3, kAutoKey = 5 };
+enum Kind : unsigned short { kNull = 0, kMouseDown = 1, kMouseUp = 2, kKeyDown = 3, kAutoKey = 5 };
 } // namespace EventKinds
 
 // What the desktop gives to panes for a key. Panes hand it on as the record that it is; copies that they make

@@ -8,11 +8,12 @@
 #include "desktop/layout/LayoutEngine.h"
 #include "desktop/menus/MenuTracker.h"
 #include "desktop/panes/DesktopRep.h"
+#include "desktop/panes/EventRecords.h"
 #include "desktop/panes/HostCall.h"
+#include "desktop/panes/ModalRun.h"
 #include "desktop/panes/PaneAccess.h"
 #include "desktop/panes/PaneEvents.h"
 #include "desktop/panes/PortKeeper.h"
-#include "desktop/resources/Utf.h"
 #include "desktop/windows/HelpTagWindow.h"
 #include "host/CompoundPane.h"
 #include "host/EditCommands.h"
@@ -27,39 +28,16 @@ namespace {
 
 int const kMaxSide = 16000;
 
-double const kTicksPerSecond = 60.0;
-
 // What Key answers when the pane counts as hit.
 int const kHitByModifying = 2;
 // With these the tab key does not move on to another pane.
 unsigned short const kTabModifiers = Modifiers::kCommand | Modifiers::kControl | Modifiers::kOption;
-
-unsigned int Ticks(double seconds) { return static_cast<unsigned int>(seconds * kTicksPerSecond + 0.5); }
 
 OS::RGBAColor ToRGBA(RGBColor const &c) {
     return OS::RGBAColor(c.red / 65535.0, c.green / 65535.0, c.blue / 65535.0, 1.0);
 }
 
 short Coordinate16(int value) { return static_cast<short>(std::clamp(value, -32768, 32767)); }
-
-Point InWindow(InputEvent const &event) { return {Coordinate16(event.v), Coordinate16(event.h)}; }
-
-void FillRecord(EventRecordAdapter &record, InputEvent const &event, unsigned short what) {
-    record.what = what;
-    record.when = Ticks(event.time);
-    record.where = InWindow(event);
-    record.modifiers = event.modifiers;
-}
-
-// The low byte is the ASCII character where there is one, else a named key; the next sixteen bits are the
-// key's code. Other characters leave the byte 0, since their low bytes would pass for keys.
-unsigned long long KeyMessage(InputEvent const &event) {
-    std::u16string_view const units = Utf::View(event.text);
-    unsigned long long character = event.key < 0x80 ? static_cast<unsigned long long>(event.key) : 0;
-    if (units.size() == 1 && units[0] < 0x80)
-        character = units[0];
-    return character | static_cast<unsigned long long>(event.key) << 8;
-}
 
 } // namespace
 
@@ -408,6 +386,8 @@ GlogPane *Glog::TopmostAt(Point p) const {
 }
 
 void Glog::ReportHit(int value) {
+    if (ModalRun *const modal = ModalRun::Innermost(); modal && modal->NoteHit(*this, hitItem, value))
+        return;
     Desktop::HitHandler const handler = DesktopRep::Of(desktop).hitHandler;
     if (handler)
         handler(this, hitItem, value);
@@ -415,8 +395,7 @@ void Glog::ReportHit(int value) {
 
 void Glog::Click(InputEvent const &event) {
     HostCall const call;
-    EventRecordAdapter record;
-    FillRecord(record, event, EventKinds::kMouseDown);
+    EventRecordAdapter record = EventRecords::Of(event);
     GlogPane *const pane = TopmostAt(record.where);
     if (current && current != pane && current->GetVisibility()) {
         Point const origin = PaneAccess::Origin(*current);
@@ -502,18 +481,16 @@ bool Glog::DispatchKey(EventRecordAdapter &record, InputEvent const &event) {
 }
 
 // What an active text does not take is the current item's.
-void Glog::KeyDown(InputEvent const &event) {
+bool Glog::KeyDown(InputEvent const &event) {
     HostCall const call;
     KeyEvent record;
-    FillRecord(record, event, event.repeat ? EventKinds::kAutoKey : EventKinds::kKeyDown);
-    record.message = KeyMessage(event);
+    EventRecords::Fill(record, event);
     record.text = event.text;
     if (RunEditCommand(event))
-        return;
+        return true;
     TextEditor *const text = TextFocus::Of(*this);
     bool const movesOn = event.key == KeyCodes::kTab && !(event.modifiers & kTabModifiers);
-    if (!text || movesOn || !text->TakeKey(record))
-        DispatchKey(record, event);
+    return (text && !movesOn && text->TakeKey(record)) || DispatchKey(record, event);
 }
 
 // The shortcuts of editing reach whichever pane has the keyboard, if it knows them.
@@ -591,8 +568,8 @@ void Glog::Wheel(InputEvent const &event) {
     for (Axis axis : {Axis{event.wheelH, 0}, Axis{event.wheelV, 1}}) {
         if (axis.delta == 0)
             continue;
-        WheelEvent wheel(InWindow(event), static_cast<float>(axis.delta), axis.number);
-        if (GlogPane *pane = TopmostAt(InWindow(event)))
+        WheelEvent wheel(EventRecords::PlaceOf(event), static_cast<float>(axis.delta), axis.number);
+        if (GlogPane *pane = TopmostAt(EventRecords::PlaceOf(event)))
             pane->DispatchCustomEvent(&wheel);
     }
 }

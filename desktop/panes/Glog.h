@@ -83,7 +83,7 @@ public:
 
     // Events; positions in window coordinates
     void Click(InputEvent const &);
-    void KeyDown(InputEvent const &);
+    bool KeyDown(InputEvent const &);     // whether a pane has taken it
     void ComposeText(InputEvent const &); // by an input method
     void Wheel(InputEvent const &);
     void PointerMoved(Point);

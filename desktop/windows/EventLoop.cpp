@@ -3,6 +3,7 @@
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/HostCall.h"
+#include "desktop/panes/ModalRun.h"
 #include "desktop/panes/PortKeeper.h"
 #include "desktop/windows/HelpTagWindow.h"
 #include <algorithm>
@@ -53,7 +54,8 @@ void EventLoop::RunIdleWork() {
     HostCall const call;
     PortKeeper const keeper;
     double const now = windows.Now();
-    chores.Run(now);
+    if (!choresPaused)
+        chores.Run(now);
     helpTags->Tick(now);
     DesktopRep::Of(desktop).Idle();
     DesktopRep::Of(desktop).UpdateAll();
@@ -65,10 +67,10 @@ bool EventLoop::MainLoopIsOver(double deadline) const {
 }
 
 bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter waiter, char const *what,
-                     PlatformWindow *const *needed) {
+                     Condition const &isOver) {
     for (;;) {
         RunIdleWork();
-        if (needed && (quitting || !*needed || !pointer.empty()))
+        if (isOver && (quitting || isOver()))
             return false;
         if (waiter == WindowSystem::Waiter::kMainLoop && MainLoopIsOver(deadline))
             return false;
@@ -77,7 +79,7 @@ bool EventLoop::Take(InputEvent &event, double deadline, WindowSystem::Waiter wa
         // Where nobody is left who could answer, chores that come again and again must not keep a dialog or
         // menu waiting for ever.
         bool const nobodyAnswers = waiter == WindowSystem::Waiter::kModal && deadline < 0 && windows.AtEnd();
-        for (double next : {chores.UntilNext(now), helpTags->UntilNext(now)})
+        for (double next : {choresPaused ? -1.0 : chores.UntilNext(now), helpTags->UntilNext(now)})
             if (next >= 0 && (limit < 0 || next < limit) && !nobodyAnswers)
                 limit = next;
         if (windows.WaitEvent(event, limit, waiter, what))
@@ -130,6 +132,8 @@ void EventLoop::Handle(InputEvent const &event) {
     default:
         break;
     }
+    if (ModalRun *const modal = ModalRun::Innermost(); modal && modal->Takes(event, glog))
+        return;
     if (!glog || glog->disposed)
         return;
     switch (event.kind) {
@@ -402,8 +406,8 @@ void EventLoop::EndMenu() {
 bool EventLoop::NextMenuEvent(double deadline, InputEvent &event) {
     if (MenuIsOver())
         return false;
-    bool const taken =
-        pointer.empty() && Take(event, deadline, WindowSystem::Waiter::kModal, "an open menu", &menuWindow);
+    bool const taken = pointer.empty() && Take(event, deadline, WindowSystem::Waiter::kModal, "an open menu",
+                                               [this] { return !menuWindow || !pointer.empty(); });
     if (taken) {
         PortKeeper const keeper;
         HandleWindowEvent(event);
@@ -422,6 +426,33 @@ bool EventLoop::NextMenuEvent(double deadline, InputEvent &event) {
         windows.CaptureMouse(menuWindow);
     }
     return true;
+}
+
+void EventLoop::RunModal(Condition const &isOver, bool runChores) {
+    struct PausedChores {
+        PausedChores(int &count_, bool on_)
+            : count(count_)
+            , on(on_ ? 1 : 0) {
+            count += on;
+        }
+        ~PausedChores() { count -= on; }
+        int &count;
+        int const on;
+    } const paused(choresPaused, !runChores);
+    menuWindow = nullptr;
+    heldWindow = nullptr;
+    windows.CaptureMouse(nullptr);
+    helpTags->Hide();
+    while (!quitting && !isOver()) {
+        InputEvent event;
+        if (!deferred.empty()) {
+            event = deferred.front();
+            deferred.pop_front();
+        } else if (!Take(event, -1, WindowSystem::Waiter::kModal, "a modal dialog", isOver)) {
+            continue;
+        }
+        Handle(event);
+    }
 }
 
 void EventLoop::Pause(double seconds) {

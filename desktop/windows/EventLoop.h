@@ -5,6 +5,7 @@
 #include "desktop/windows/WindowSystem.h"
 #include "host/MouseTask.h"
 #include <deque>
+#include <functional>
 #include <memory>
 #include <vector>
 
@@ -18,6 +19,8 @@ class HelpTagWindow;
 // no use for wait for the main loop.
 class EventLoop {
 public:
+    typedef std::function<bool()> Condition;
+
     EventLoop(Desktop &, WindowSystem &);
     ~EventLoop();
     static EventLoop &Instance(); // of the open desktop
@@ -67,6 +70,9 @@ public:
         CursorChoice *outer; // panes may wait while they are asked
         int cursor = Cursors::kArrow;
     };
+    // A modal window: handles events until the function says that it is over, or the loop is told to quit.
+    // What tracks the mouse, or is an open menu, ends. Chores may have to wait meanwhile.
+    void RunModal(Condition const &isOver, bool runChores);
 
     void Pause(double seconds);
     void PauseUntilKeyUp(int key);
@@ -85,11 +91,10 @@ public:
 private:
     void RunIdleWork();
     bool MainLoopIsOver(double deadline) const;
-    // Takes one event, or none when the time is over. With `needed` also none when that has become null, the
-    // loop was told to quit, or something else has put input aside in `pointer` meanwhile. Draws what is
-    // damaged before it blocks.
+    // Takes one event, or none when the time is over. With a condition also none once that holds, or the loop
+    // was told to quit. Draws what is damaged before it blocks.
     bool Take(InputEvent &, double deadline, WindowSystem::Waiter, char const *what,
-              PlatformWindow *const *needed = nullptr);
+              Condition const &isOver = nullptr);
     // In a nested loop: window events are handled, pointer events go to `pointer`, everything else waits for
     // the main loop.
     void Sort(InputEvent const &);
@@ -115,6 +120,7 @@ private:
     double shownAt = 0;
     int lastPressClicks = 0;
     CursorChoice *choice = nullptr; // that is being made, or null
+    int choresPaused = 0;           // by so many modal windows
     bool quitting = false;
     int status = 0;
 };
