@@ -70,6 +70,7 @@ public:
         CursorChoice *outer; // panes may wait while they are asked
         int cursor = Cursors::kArrow;
     };
+
     // A modal window: handles events until the function says that it is over, or the loop is told to quit.
     // What tracks the mouse, or is an open menu, ends. Chores may have to wait meanwhile.
     void RunModal(Condition const &isOver, bool runChores);
