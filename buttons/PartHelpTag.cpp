@@ -8,13 +8,14 @@ double const kDelay = 0.5; // seconds
 
 } // namespace
 
-void AttachPartHelpTag(GlogPane &pane, LocalizedStrings::HelpTag const *tag, Rect const &rect) {
-    HelpTagHelper *helper = pane.GetHelpTagHelper();
-    if (!helper || helper->IsDefaultHelper()) {
+MultiHelpTagHelper *PartHelpTags(GlogPane &pane) {
+    HelpTagHelper *const helper = pane.GetHelpTagHelper();
+    if (!helper || helper->IsDefaultHelper())
         pane.SetHelpTagHelper(AutoPtr<HelpTagHelper>(new MultiHelpTagHelper));
-        helper = pane.GetHelpTagHelper();
-    }
-    // A helper of the program's own, for the whole pane or not, is left in charge.
-    if (MultiHelpTagHelper *const parts = dynamic_cast<MultiHelpTagHelper *>(helper))
+    return dynamic_cast<MultiHelpTagHelper *>(pane.GetHelpTagHelper());
+}
+
+void AttachPartHelpTag(GlogPane &pane, LocalizedStrings::HelpTag const *tag, Rect const &rect) {
+    if (MultiHelpTagHelper *const parts = PartHelpTags(pane))
         parts->AddHelpTag(tag, rect, OS::Help::kPlacementForParts, kDelay);
 }

@@ -16,6 +16,6 @@ void AddMenuItems(ItemRegistry &);     // PopUpMenu, ScrollBarPopUpMenu, Duratio
 void AddTabItems(ItemRegistry &);      // Tabs
 void AddSelectItems(ItemRegistry &);   // Select, SelectString
 void AddListItems(ItemRegistry &);     // List
-void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line
+void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line, Picture
 void AddThreeDItems(ItemRegistry &);   // ThreeD
 void AddTextItems(ItemRegistry &);     // TextField, TextEdit

@@ -67,18 +67,26 @@ struct PngImage::Rep {
         if (!known) {
             known = true;
             picture = ReadPicture(id, kPlainSuffix);
-            if (picture)
-                detailed = ReadPicture(id, kDetailedSuffix);
             opaque = picture && picture->IsOpaque();
         }
         return picture.get();
+    }
+
+    // The one with more pixels, which most windows do not need; null when there is none.
+    Surface *Detailed() {
+        if (!detailedKnown) {
+            detailedKnown = true;
+            detailed = ReadPicture(id, kDetailedSuffix);
+            opaque = opaque && (!detailed || detailed->IsOpaque());
+        }
+        return detailed.get();
     }
 
     // The picture in that many device pixels. Kept, since a picture is nearly always drawn in the same size.
     PixelImage Sized(int width, int height) {
         width = std::min(width, kLongestScaledSide);
         height = std::min(height, kLongestScaledSide);
-        Surface *shown = detailed && width > picture->Width() ? detailed.get() : picture.get();
+        Surface *shown = width > picture->Width() && Detailed() ? detailed.get() : picture.get();
         if (shown->Width() != width || shown->Height() != height) {
             if (!scaled || scaled->Width() != width || scaled->Height() != height) {
                 scaled.reset(new Surface(width, height));
@@ -91,14 +99,14 @@ struct PngImage::Rep {
     }
 
     void Forget() {
-        known = false;
+        known = detailedKnown = false;
         picture.reset();
         detailed.reset();
         scaled.reset();
     }
 
     short const id;
-    bool known = false; // whether the file has been looked for
+    bool known = false, detailedKnown = false; // whether the files have been looked for
     bool opaque = false;
     std::unique_ptr<Surface> picture;  // in its own size
     std::unique_ptr<Surface> detailed; // with twice as many pixels each way, for larger sizes; or null

@@ -1,4 +1,5 @@
 #include "graphics/GLinePane.h"
+#include "graphics/PictPane.h"
 #include "graphics/ProgressBarPane.h"
 #include "graphics/ThreeDPane.h"
 #include "tests/dialogs/DialogTest.h"
@@ -103,4 +104,48 @@ TEST_F(GraphicItemsTest, ACubeRefusesPlacesOutsideOfIt) {
           "<Radius>-1</Radius>", "<Radius>1001</Radius>", "<Viewpoint x=\"0\" y=\"0\" z=\"32768\"/>"})
         EXPECT_NE(ComplaintAboutItem("ThreeD", kCube + key), "no complaint") << key;
     EXPECT_NE(ComplaintAboutItem("ThreeD", ""), "no complaint");
+}
+
+// Pictures
+
+TEST_F(GraphicItemsTest, APictureIsFoundByItsName) {
+    PictPane *const picture =
+        LoadOne<PictPane>("Picture", kPlace + "<ResIDName>kKeyboardPicture</ResIDName>");
+    EXPECT_EQ(picture->GetPictureID(), 9003);
+    EXPECT_EQ(BoxOf(picture), (Rect{10, 20, 30, 140}));
+    EXPECT_TRUE(Holds(Dump(picture->GetGlog()), "\"picture\":9003"));
+}
+
+TEST_F(GraphicItemsTest, APictureMayHaveItsOwnSize) {
+    EXPECT_EQ(BoxOf(LoadOne<PictPane>("Picture", kPlace + "<ResIDName>kKeyboardPicture</ResIDName>"
+                                                          "<PicUseImageSize>1</PicUseImageSize>")),
+              (Rect{10, 20, 96, 316}));
+}
+
+TEST_F(GraphicItemsTest, APictureThatIsNotThereIsAnError) {
+    EXPECT_TRUE(Holds(ComplaintAboutItem("Picture", "<ResIDName>kNoPicture</ResIDName>"),
+                      "key ResIDName: there is no picture \"kNoPicture\""));
+    EXPECT_NE(ComplaintAboutItem("Picture", kPlace), "no complaint");
+}
+
+TEST_F(GraphicItemsTest, WatchersHearOfClicksOnAPicture) {
+    PictPane *const picture =
+        LoadOne<PictPane>("Picture", kPlace + "<ResIDName>kKeyboardPicture</ResIDName>");
+    ShowGlog(picture->GetGlog(), kShowGlog);
+    desktop.TakeMessages();
+    desktop.Play("click 30 20");
+    std::string heard;
+    for (std::string const &line : desktop.TakeMessages())
+        heard += line;
+    EXPECT_TRUE(Holds(heard, "\"message\":\"PictClicked\",\"where\":[20,30]")) << heard;
+}
+
+TEST_F(GraphicItemsTest, ARecordMakesAPicture) {
+    PictPane *const picture =
+        dynamic_cast<PictPane *>(GetGlogItem(LoadOneRecord({10, 10, 20, 30, 140, 1, 9003}), 1));
+    ASSERT_NE(picture, nullptr);
+    EXPECT_EQ(picture->GetPictureID(), 9003);
+    EXPECT_EQ(BoxOf(picture), (Rect{10, 20, 96, 316}));
+    EXPECT_NE(Complaint([&] { LoadOneRecord({10, 10, 20, 30, 140, 1}); }), "no complaint");
+    EXPECT_NE(Complaint([&] { LoadOneRecord({10, 10, 20, 30, 140, 1, 9003, 0}); }), "no complaint");
 }

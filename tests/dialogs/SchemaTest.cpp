@@ -70,6 +70,7 @@ std::set<std::string> const kStockTypes = {"OvalButton",
                                            "DurationNote",
                                            "ProgressBar",
                                            "Line",
+                                           "Picture",
                                            "Tabs",
                                            "ThreeD"};
 

@@ -106,3 +106,72 @@ TEST_F(Pictures, FollowTheThemeByThemselves) {
     picture.Draw({0, 0, 4, 4});
     EXPECT_EQ(canvas.Count(Canvas::kRed), 16);
 }
+
+TEST_F(Pictures, AreReadOnce) {
+    Write("light/42.png", 3, 2, kBlue);
+    Write("light/42@2x.png", 6, 4, Canvas::kRed);
+    PngImage picture(42);
+    {
+        Canvas plain(12, 10);
+        picture.Draw({0, 0, 2, 3});
+    }
+    Write("light/42.png", 3, 2, 0xFF00FF00u);
+    {
+        Canvas plain(12, 10);
+        picture.Draw({0, 0, 2, 3});
+        EXPECT_EQ(plain.Count(kBlue), 6);
+    }
+    Canvas sharp(12, 10, 2);
+    picture.Draw({0, 0, 2, 3});
+    Write("light/42@2x.png", 6, 4, 0xFF00FF00u);
+    picture.Draw({0, 3, 2, 6});
+    EXPECT_EQ(sharp.Count(Canvas::kRed), 48);
+}
+
+TEST_F(Pictures, TheDetailedOneIsReadWhereItIsWanted) {
+    Write("light/42.png", 3, 2, kBlue);
+    PngImage picture(42);
+    {
+        Canvas plain(12, 10);
+        picture.Draw({0, 0, 2, 3});
+    }
+    Write("light/42@2x.png", 6, 4, Canvas::kRed);
+    Canvas sharp(12, 10, 2);
+    picture.Draw({0, 0, 2, 3});
+    EXPECT_EQ(sharp.Count(Canvas::kRed), 24);
+}
+
+TEST_F(Pictures, ATranslucentDetailedOneLetsTheGroundShow) {
+    Write("light/42.png", 3, 2, kBlue);
+    Write("light/42@2x.png", 6, 4, 0x80000000u);
+    PngImage picture(42);
+    Canvas sharp(12, 10, 2);
+    picture.Draw({0, 0, 2, 3});
+    EXPECT_NEAR(sharp.At(1, 1) & 0xFF, 127, 1);
+}
+
+TEST_F(Pictures, AreReadHoweverTheyAreStored) {
+    for (char const *name : {"gray.png", "gray-1-bit.png", "palette.png", "rgb.png", "rgb-16-bit.png",
+                             "interlaced-whole.png", "rgba.png", "rgba-16-bit.png", "gray-alpha.png"}) {
+        std::filesystem::copy_file(std::string(GLOG_TEST_SOURCE_DIR) + "/../fuzz/corpus/FuzzPng/" + name,
+                                   directory.Path() + "/pictures/light/42.png",
+                                   std::filesystem::copy_options::overwrite_existing);
+        PngImage picture(42);
+        EXPECT_GT(picture.GetFrameRect().right, 0) << name;
+    }
+}
+
+TEST_F(Pictures, FilesThatAreNoPicturesDrawNothing) {
+    for (char const *name :
+         {"bad-depth", "bad-filter", "claim-65535", "cut-in-data", "cut-in-header", "empty", "jpeg",
+          "no-width", "one-too-wide", "signature-only", "wide-claim", "wrong-checksum"}) {
+        std::filesystem::copy_file(std::string(GLOG_TEST_SOURCE_DIR) + "/../fuzz/corpus/FuzzPng/" + name,
+                                   directory.Path() + "/pictures/light/42.png",
+                                   std::filesystem::copy_options::overwrite_existing);
+        PngImage picture(42);
+        EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 0, 0})) << name;
+        Canvas canvas(5, 5);
+        picture.Draw({0, 0, 5, 5});
+        EXPECT_EQ(canvas.Count(Canvas::kWhite), 25) << name;
+    }
+}
