@@ -18,6 +18,7 @@ ItemRegistry::ItemRegistry() {
     AddListItems(*this);
     AddGraphicItems(*this);
     AddThreeDItems(*this);
+    AddGraphItems(*this);
     AddTextItems(*this);
 }
 

@@ -18,4 +18,5 @@ void AddSelectItems(ItemRegistry &);   // Select, SelectString
 void AddListItems(ItemRegistry &);     // List
 void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line, Picture
 void AddThreeDItems(ItemRegistry &);   // ThreeD
+void AddGraphItems(ItemRegistry &);    // Graph
 void AddTextItems(ItemRegistry &);     // TextField, TextEdit

@@ -1,4 +1,5 @@
 #include "graphics/GLinePane.h"
+#include "graphics/GraphPane.h"
 #include "graphics/PictPane.h"
 #include "graphics/ProgressBarPane.h"
 #include "graphics/ThreeDPane.h"
@@ -9,6 +10,7 @@ namespace {
 
 std::string const kPlace = "<BoundsRect top=\"10\" left=\"20\" bottom=\"30\" right=\"140\"/>";
 
+std::string const kGraph = "<BoundsRect top=\"0\" left=\"0\" bottom=\"52\" right=\"102\"/>";
 std::string const kCube = "<BoundsRect top=\"0\" left=\"0\" bottom=\"238\" right=\"224\"/>";
 
 class GraphicItemsTest : public DialogTest {};
@@ -148,4 +150,40 @@ TEST_F(GraphicItemsTest, ARecordMakesAPicture) {
     EXPECT_EQ(BoxOf(picture), (Rect{10, 20, 96, 316}));
     EXPECT_NE(Complaint([&] { LoadOneRecord({10, 10, 20, 30, 140, 1}); }), "no complaint");
     EXPECT_NE(Complaint([&] { LoadOneRecord({10, 10, 20, 30, 140, 1, 9003, 0}); }), "no complaint");
+}
+
+// Graphs
+
+TEST_F(GraphicItemsTest, AGraphHasItsAxesAndPoints) {
+    GraphPane *const graph = LoadOne<GraphPane>(
+        "Graph", kGraph + "<HorizontalAxis min=\"-10\" max=\"10\" interval=\"5\"/>"
+                          "<VerticalAxis min=\"0\" max=\"1000\"/>"
+                          "<Points><DataPoint h=\"-10\" v=\"0\"/><DataPoint h=\"3\" v=\"500\"/></Points>");
+    EXPECT_EQ(graph->CoordsToGraphDataPoint(100, 1).horizontal, 10);
+    EXPECT_EQ(graph->CoordsToGraphDataPoint(100, 1).vertical, 1000);
+    ASSERT_NE(graph->GetGraphData(), nullptr);
+    ASSERT_EQ(graph->GetGraphData()->CountPoints(), 2);
+    EXPECT_EQ(graph->GetGraphData()->GetPoint(1).horizontal, 3);
+    EXPECT_EQ(graph->GetGraphData()->GetPoint(1).vertical, 500);
+    EXPECT_TRUE(Holds(Dump(graph->GetGlog()), "\"points\":2"));
+}
+
+TEST_F(GraphicItemsTest, AGraphWithoutKeysHasTheUsualAxes) {
+    GraphPane *const graph = LoadOne<GraphPane>("Graph", kGraph);
+    EXPECT_EQ(graph->CoordsToGraphDataPoint(100, 1).horizontal, 127);
+    EXPECT_EQ(graph->GetGraphData(), nullptr);
+}
+
+TEST_F(GraphicItemsTest, AGraphRefusesAxesWithoutLength) {
+    for (std::string const key :
+         {"<HorizontalAxis min=\"5\" max=\"5\"/>", "<VerticalAxis min=\"6\" max=\"5\"/>",
+          "<HorizontalAxis min=\"0\"/>", "<HorizontalAxis min=\"0\" max=\"9\" interval=\"-1\"/>",
+          "<Points><DataPoint h=\"1\"/></Points>"})
+        EXPECT_NE(ComplaintAboutItem("Graph", kGraph + key), "no complaint") << key;
+}
+
+TEST_F(GraphicItemsTest, ARecordMakesAGraph) {
+    GraphPane *const graph = dynamic_cast<GraphPane *>(GetGlogItem(LoadOneRecord({12, 10, 20, 60, 140}), 1));
+    ASSERT_NE(graph, nullptr);
+    EXPECT_EQ(BoxOf(graph), (Rect{10, 20, 60, 140}));
 }

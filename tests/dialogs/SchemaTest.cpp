@@ -71,6 +71,7 @@ std::set<std::string> const kStockTypes = {"OvalButton",
                                            "ProgressBar",
                                            "Line",
                                            "Picture",
+                                           "Graph",
                                            "Tabs",
                                            "ThreeD"};
 
