@@ -36,6 +36,8 @@ public:
     GlogOptions &Title(std::string const &utf8) { return title = utf8, *this; } // of the window
     GlogOptions &Size(int w, int h) { return width = w, height = h, *this; } // content in pixels, 1 to 16000
     GlogOptions &Growable(bool on) { return growable = on, *this; }          // by the user; default: not
+    // Without a frame, above other windows, and never the active one: for what is up while the mouse is held.
+    GlogOptions &Popup(bool on) { return popup = on, *this; }
     // The glog's own style sheet; the glog takes it over. Default: none.
     GlogOptions &StyleSheet(std::shared_ptr<GlogStyleSheet> sheet) {
         return styleSheet = std::move(sheet), *this;
@@ -44,7 +46,7 @@ public:
     // What was set.
     std::string title;
     int width = 320, height = 200;
-    bool growable = false;
+    bool growable = false, popup = false;
     std::shared_ptr<GlogStyleSheet> styleSheet;
 };
 

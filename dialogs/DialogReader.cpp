@@ -29,6 +29,7 @@ KeyList const &GlogAttributes() {
                                     .Integer("height", 1, kLargestSide)
                                     .Required()
                                     .Word("growable", {"yes", "no"})
+                                    .Word("popup", {"yes", "no"})
                                     .Integer("minWidth", 0, kLargestSide)
                                     .Integer("minHeight", 0, kLargestSide)
                                     .Integer("maxWidth", 0, kLargestSide)
@@ -127,7 +128,8 @@ void DialogReader::ReadGlogAttributes(XmlNode const &root, Dialog &dialog) const
     };
     dialog.options.Title(Title(root))
         .Size(number("width"), number("height"))
-        .Growable(attributes->GetUStringItemValue(ResourceKey("growable")) == ResourceKey("yes"));
+        .Growable(attributes->GetUStringItemValue(ResourceKey("growable")) == ResourceKey("yes"))
+        .Popup(attributes->GetUStringItemValue(ResourceKey("popup")) == ResourceKey("yes"));
     dialog.minWidth = number("minWidth");
     dialog.minHeight = number("minHeight");
     dialog.maxWidth = number("maxWidth");

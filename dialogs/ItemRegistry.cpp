@@ -19,6 +19,7 @@ ItemRegistry::ItemRegistry() {
     AddGraphicItems(*this);
     AddThreeDItems(*this);
     AddGraphItems(*this);
+    AddZoomItems(*this);
     AddTextItems(*this);
 }
 

@@ -19,4 +19,5 @@ void AddListItems(ItemRegistry &);     // List
 void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line, Picture
 void AddThreeDItems(ItemRegistry &);   // ThreeD
 void AddGraphItems(ItemRegistry &);    // Graph
+void AddZoomItems(ItemRegistry &);     // ZoomSlider, ZoomButtons
 void AddTextItems(ItemRegistry &);     // TextField, TextEdit

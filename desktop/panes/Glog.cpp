@@ -211,6 +211,7 @@ void Glog::Show() {
         spec.width = width;
         spec.height = height;
         spec.resizable = options.growable;
+        spec.popup = options.popup;
         spec.placed = placed;
         spec.h = screenPlace.left;
         spec.v = screenPlace.top;
@@ -223,9 +224,10 @@ void Glog::Show() {
             return;
     }
     shown = true;
-    rep.CameToFront(this);
+    if (!options.popup)
+        rep.CameToFront(this);
     Update();
-    if (EventLoop *loop = EventLoop::Open())
+    if (EventLoop *loop = options.popup ? nullptr : EventLoop::Open())
         loop->WindowShown(window.get());
     window->Show();
 }

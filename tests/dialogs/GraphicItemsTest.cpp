@@ -3,6 +3,8 @@
 #include "graphics/PictPane.h"
 #include "graphics/ProgressBarPane.h"
 #include "graphics/ThreeDPane.h"
+#include "graphics/ZoomControlPane.h"
+#include "graphics/ZoomPopUpPane.h"
 #include "tests/dialogs/DialogTest.h"
 #include "tests/dialogs/OneRecord.h"
 
@@ -186,4 +188,48 @@ TEST_F(GraphicItemsTest, ARecordMakesAGraph) {
     GraphPane *const graph = dynamic_cast<GraphPane *>(GetGlogItem(LoadOneRecord({12, 10, 20, 60, 140}), 1));
     ASSERT_NE(graph, nullptr);
     EXPECT_EQ(BoxOf(graph), (Rect{10, 20, 60, 140}));
+}
+
+// Zooming
+
+TEST_F(GraphicItemsTest, AZoomSliderHasItsLevels) {
+    ZoomPopUpPane *const slider =
+        LoadOne<ZoomPopUpPane>("ZoomSlider", "<Origin v=\"20\" h=\"30\"/><Level>3</Level><Levels>4</Levels>");
+    EXPECT_EQ(BoxOf(slider), (Rect{20, 30, 32, 42}));
+    EXPECT_TRUE(Holds(Dump(slider->GetGlog()), "\"level\":3,\"levels\":4"));
+    ShowGlog(slider->GetGlog(), kShowGlog);
+    desktop.TakeMessages();
+    desktop.Play("wheel 35 25 0 1\nwheel 35 25 0 1\npress 35 25\nmove 10 25");
+    std::string heard;
+    for (std::string const &line : desktop.TakeMessages())
+        heard += line;
+    EXPECT_TRUE(Holds(heard, "\"message\":\"Zoomed\",\"level\":4")) << heard;
+    EXPECT_TRUE(Holds(Dump(slider->GetGlog()), "\"level\":2,\"levels\":4")) << "20 pixels to the left";
+}
+
+TEST_F(GraphicItemsTest, ZoomButtonsHaveTheirLevels) {
+    ZoomControlPane *const buttons = LoadOne<ZoomControlPane>(
+        "ZoomButtons", "<Origin v=\"20\" h=\"30\"/><Levels>1</Levels><Direction>horiz</Direction>");
+    EXPECT_EQ(BoxOf(buttons), (Rect{20, 30, 35, 60}));
+    ShowGlog(buttons->GetGlog(), kShowGlog);
+    desktop.TakeMessages();
+    desktop.Play("click 52 25\nclick 52 25\nclick 35 25");
+    std::string heard;
+    for (std::string const &line : desktop.TakeMessages())
+        if (Holds(line, "Zoomed"))
+            heard += line.substr(line.find("\"level\""));
+    EXPECT_EQ(heard, "\"level\":1}\"level\":0}") << "the second click meets a disabled button";
+}
+
+TEST_F(GraphicItemsTest, ZoomButtonsStandAboveEachOtherUnlessTheDialogSaysOtherwise) {
+    EXPECT_EQ(BoxOf(LoadOne<ZoomControlPane>("ZoomButtons", "")), (Rect{0, 0, 30, 15}));
+}
+
+TEST_F(GraphicItemsTest, ZoomingRefusesLevelsThatAreNotThere) {
+    for (std::string const type : {"ZoomSlider", "ZoomButtons"}) {
+        EXPECT_TRUE(
+            Holds(ComplaintAboutItem(type, "<Level>11</Level>"), "there is no level 11: the last one is 10"));
+        for (std::string const key : {"<Level>-1</Level>", "<Levels>0</Levels>", "<Levels>1001</Levels>"})
+            EXPECT_NE(ComplaintAboutItem(type, key), "no complaint") << key;
+    }
 }

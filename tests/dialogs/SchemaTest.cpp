@@ -72,6 +72,8 @@ std::set<std::string> const kStockTypes = {"OvalButton",
                                            "Line",
                                            "Picture",
                                            "Graph",
+                                           "ZoomSlider",
+                                           "ZoomButtons",
                                            "Tabs",
                                            "ThreeD"};
 
