@@ -12,7 +12,8 @@ import sys
 
 PANES = ("buttons/", "scrolling/", "lists/", "text/", "menus/", "tabs/", "graphics/")
 PANE_LAYER = ("host/", "frame/") + PANES
-PROGRAM_LAYER = PANE_LAYER + ("dialogs/", "desktop/Desktop.h", "desktop/SimulatedDesktop.h")
+PROGRAM_LAYER = PANE_LAYER + ("dialogs/", "desktop/Desktop.h", "desktop/SimulatedDesktop.h",
+                              "desktop/resources/Resources.h")
 
 # What a file may include from this tree: by folder, the longest entry that fits counts. A name that ends in a slash
 # stands for everything below it.

@@ -46,6 +46,13 @@ bool DescribeTabs(GlogPane &pane, JsonLine &line) {
     return true;
 }
 
+// In the order of the tabs; those beyond the last tab have no use.
+void TakeShortNames(TabPane &tabs, boost::shared_ptr<XMLLib::ContainerItem> const &names) {
+    std::size_t const count = static_cast<std::size_t>(tabs.CountItems());
+    for (std::size_t i = 0; names && i < names->GetNumItems() && i < count; ++i)
+        tabs.SetItemShortName(static_cast<int>(i), XMLLib::UStringFromItem(names->GetNthItem(i))->Get());
+}
+
 GlogPane *MakeTabs(glogRec *glog, GlogStyleSheet *sheet) {
     std::unique_ptr<TabPane> tabs(new (std::nothrow) TabPane(glog, sheet));
     if (!tabs || !tabs->GetGlog())
@@ -57,6 +64,7 @@ GlogPane *MakeTabs(glogRec *glog, GlogStyleSheet *sheet) {
                                        std::to_string(tabs->CountItems()) + ", counted from 0");
     if (selected != 0)
         tabs->SetSelectedItem_NoBroadcast(selected);
+    TakeShortNames(*tabs, sheet->GetItemRes()->GetContainerItem(ResourceKey("ShortNames")));
     if (sheet->GetSInt32ItemValue(ResourceKey("FitToRect")) != 0)
         tabs->FitIntoRect(OptionalRect(sheet->GetItemRes(), "BoundsRect"));
     return tabs.release();
@@ -71,6 +79,7 @@ void AddTabItems(ItemRegistry &registry) {
                                .Rect("BoundsRect")
                                .Container("Items", KeyList().String("Tab").Repeated())
                                .Required()
+                               .Container("ShortNames", KeyList().String("Tab").Repeated())
                                .Integer("Selected", 0, KeyList::kLargest)
                                .Flag("FitToRect"))
                      .MadeBy(MakeTabs)

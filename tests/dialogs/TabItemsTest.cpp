@@ -65,6 +65,14 @@ TEST_F(TabItemsTest, RefusesNumbersOutOfTheirRanges) {
         EXPECT_NE(ComplaintAboutItem("Tabs", key + kNames), "no complaint") << key;
 }
 
+TEST_F(TabItemsTest, TabsMayHaveShortNames) {
+    TabPane *const tabs = LoadTabs(kNames + "<ShortNames><Tab>N</Tab><Tab/></ShortNames>");
+    EXPECT_EQ(Utf8::FromUString(tabs->GetItemShortName(0)), "N");
+    EXPECT_TRUE(tabs->GetItemShortName(1).empty());
+    EXPECT_EQ(Utf8::FromUString(tabs->GetItemShortName(2)), "Lyrics");
+    EXPECT_EQ(LoadTabs("<Items/><ShortNames><Tab>N</Tab></ShortNames>")->CountItems(), 0);
+}
+
 TEST_F(TabItemsTest, ARowMayFitItsBox) {
     TabPane *const tabs = LoadTabs(kNames + "<FitToRect>1</FitToRect>");
     EXPECT_LE(BoxOf(tabs).right, 140);

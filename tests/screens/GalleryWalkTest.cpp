@@ -8,6 +8,7 @@
 //     slide ITEM[.PART]             the mouse is pressed there, moved off, and released
 //     hold ITEM[.PART]              the mouse is held there for half a second
 //     choose ITEM ANSWER            it is clicked, and the menu that opens is answered, as in scripts
+//     ask ITEM ANSWER...            it is clicked, and the dialog that opens gets the keys, or clicks at H,V
 //     drag ITEM[.PART] H V          the mouse is pressed there, moved that far right and down, and released
 //     grab ITEM[.PART] H V H2 V2    the mouse is pressed so far from its top left corner, and dragged so far
 //     wheel ITEM[.PART] H V         the wheel is turned there
@@ -198,6 +199,8 @@ protected:
             desktop.Play("click " + spot + (words >> modifier ? ' ' + modifier : "") + "\nwait 1\n");
         else if (gesture == "choose" && words >> answer)
             desktop.Play("click " + spot + "\nmenu " + answer + "\nwait 1\n");
+        else if (gesture == "ask")
+            Ask(spot, words);
         else if (gesture == "drag" && words >> right >> down)
             desktop.Play("press " + spot + "\nmove " + Spot(place, right, down) + "\nrelease\nwait 1\n");
         else if (gesture == "grab" && words >> right >> down)
@@ -211,6 +214,15 @@ protected:
             desktop.Play("press " + spot + "\nwait 0.5\nrelease\nwait 1\n");
         else
             throw std::runtime_error("there is no step \"" + gesture + '"');
+    }
+
+    void Ask(std::string const &spot, std::istream &words) {
+        std::string script = "click " + spot + "\nwait 1\n";
+        for (std::string key; words >> key;)
+            script += (key.find(',') == std::string::npos ? "key " + key
+                                                          : "click " + key.replace(key.find(','), 1, " ")) +
+                      "\nwait 1\n";
+        desktop.Play(script);
     }
 
     // So far from the place's top left corner.

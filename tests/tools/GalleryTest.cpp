@@ -69,7 +69,7 @@ TEST_F(GalleryProgram, TogglesFrameButtonsThatArePressed) {
 
 TEST_F(GalleryProgram, TurnsPagesAndChangesThemeAndScale) {
     directory.Write("script",
-                    "click 60 105\nwait 1\nsnapshot labels.png\nclick 135 574\nwait 1\nsnapshot dark.png\n"
+                    "click 60 88\nwait 1\nsnapshot labels.png\nclick 135 574\nwait 1\nsnapshot dark.png\n"
                     "click 150 628\nwait 1\nsnapshot large.png\ndump a.json\n");
     ProgramResult const result = Run("--script script");
     EXPECT_EQ(result.status, 0) << result.errors;
@@ -100,7 +100,7 @@ TEST_F(GalleryProgram, EndsWithOneForAnUnknownPage) {
     EXPECT_EQ(result.errors,
               "gallery: there is no page \"lay\"; there are push-buttons, labels, layout, help-tags, "
               "check-boxes, box-select, icon-buttons, small-buttons, scroll-bars, "
-              "scroll-pane, grid, lists, select-panes, pop-up-menus, durations\n");
+              "scroll-pane, grid, lists, select-panes, pop-up-menus, durations, tabs, modal-dialog\n");
 }
 
 TEST_F(GalleryProgram, EndsWithOneWhereThereAreNoPages) {

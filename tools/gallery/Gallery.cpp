@@ -6,6 +6,7 @@
 #include "buttons/GIconButtonPane.h"
 #include "buttons/RadioButtonPane.h"
 #include "buttons/TwistDownButton.h"
+#include "desktop/resources/Resources.h"
 #include "dialogs/LoadGlog.h"
 #include "dialogs/Utf8.h"
 #include "host/CompoundPane.h"
@@ -39,12 +40,13 @@ struct ScaleChoice {
 };
 ScaleChoice const kScales[] = {{9020, 1.0}, {9021, 1.5}, {9022, 2.0}};
 
-short const kPageButtonHeight = 28; // pixels
+short const kPageButtonHeight = 18; // pixels
 int const kFill = 3;                // alignment: as wide as the group
 
-glogRec *LoadFrame(std::string const &path) {
+glogRec *LoadFrame(PageFiles const &files) {
     GalleryItems::Add();
-    return LoadGlog(path);
+    Resources::Instance().AddDirectory(files.Directory());
+    return LoadGlog(files.Frame());
 }
 
 // What a hit pane without a name of its own is called.
@@ -73,7 +75,7 @@ UString Text(char const *utf8) { return Utf8::ToUString(utf8); }
 Gallery::Gallery(Desktop &desktop_, PageFiles const &files_, double scale_)
     : desktop(desktop_)
     , files(files_)
-    , window(LoadFrame(files_.Frame()))
+    , window(LoadFrame(files_))
     , commands([this](CommandSpecifier const &command) { ReportCommand(command); })
     , scale(scale_) {
     AddPageButtons();

@@ -5,9 +5,11 @@
 #include "host/GlogStyleSheet.h"
 #include "host/Icons.h"
 #include "menus/PopMPane.h"
+#include "tools/gallery/AskButtonPane.h"
 #include "tools/gallery/BackdropPane.h"
 #include "tools/gallery/ChoiceButtonPane.h"
 #include "tools/gallery/ColorMenuPane.h"
+#include "tools/gallery/FittedTabsPane.h"
 #include "tools/gallery/HoldButtonPane.h"
 #include "tools/gallery/StepperPane.h"
 #include "tools/gallery/TakeListPane.h"
@@ -125,6 +127,29 @@ void GalleryItems::Add() {
                          return WellPane::NewWellPane(glog, sheet);
                      })
                      .HoldsItems());
+    registry.Add(ItemType("FittedTabs")
+                     .Keys(KeyList()
+                               .Rect("BoundsRect")
+                               .Required()
+                               .Integer("Num")
+                               .Required()
+                               .Integer("TextID")
+                               .Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return FittedTabsPane::NewFittedTabsPane(glog, sheet);
+                     })
+                     .ReportedBy(registry.Find("Tabs")->reporter));
+    registry.Add(ItemType("AskButton")
+                     .Keys(KeyList()
+                               .Rect("BoundsRect")
+                               .Required()
+                               .String("ButtonText")
+                               .Required()
+                               .Integer("TextID")
+                               .Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return AskButtonPane::NewAskButtonPane(glog, sheet);
+                     }));
     registry.Add(BadgeButtonType());
     registry.Add(
         ItemType("BarMenu")

@@ -33,16 +33,17 @@ std::string NameOf(fs::path const &page) {
 } // namespace
 
 PageFiles::PageFiles(std::string const &given) {
-    fs::path const directory = given.empty() ? OwnDirectory() : fs::path(given);
-    frame = (directory / "gallery.xml").string();
+    fs::path const place = given.empty() ? OwnDirectory() : fs::path(given);
+    directory = place.string();
+    frame = (place / "gallery.xml").string();
     std::error_code failed;
     std::vector<fs::path> found;
-    for (fs::directory_entry const &entry : fs::directory_iterator(directory / "pages", failed)) {
+    for (fs::directory_entry const &entry : fs::directory_iterator(place / "pages", failed)) {
         if (entry.path().extension() == ".xml")
             found.push_back(entry.path());
     }
     if (failed || found.empty())
-        throw std::runtime_error(directory.string() + ": there are no pages of a gallery here");
+        throw std::runtime_error(directory + ": there are no pages of a gallery here");
     std::sort(found.begin(), found.end(), ComesBefore);
     for (fs::path const &page : found)
         pages.push_back({NameOf(page), page.string()});

@@ -15,12 +15,14 @@ public:
     // Throws std::runtime_error, naming the directory, when they are not there.
     explicit PageFiles(std::string const &directory);
 
-    std::string const &Frame() const { return frame; } // the dialog round the pages
+    std::string const &Directory() const { return directory; } // also of the windows that pages open
+    std::string const &Frame() const { return frame; }         // the dialog round the pages
     std::vector<PageFile> const &Pages() const { return pages; }
     // The place of the page in Pages(). Throws std::runtime_error, naming the pages there are.
     std::size_t Find(std::string const &name) const;
 
 private:
+    std::string directory;
     std::string frame;
     std::vector<PageFile> pages;
 };
