@@ -9,6 +9,7 @@ ItemRegistry::ItemRegistry() {
     AddIconItems(*this);
     AddBoxItems(*this);
     AddLabelItems(*this);
+    AddStringItems(*this);
     AddGroupItems(*this);
     AddScrollItems(*this);
     AddScrolledItems(*this);

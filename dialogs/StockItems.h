@@ -9,6 +9,7 @@ void AddIconItems(ItemRegistry &);     // Icon, IconButton, SuccessiveIcons, Twi
 void AddBoxItems(ItemRegistry &);      // Box, BoxSelect
 void AddChoiceItems(ItemRegistry &);   // CheckBox, RadioButton
 void AddLabelItems(ItemRegistry &);    // Label
+void AddStringItems(ItemRegistry &);   // Text, StyledText, StringGroup, MultiString
 void AddGroupItems(ItemRegistry &);    // Group, Spacer
 void AddScrollItems(ItemRegistry &);   // ScrollBar, GrowBox
 void AddScrolledItems(ItemRegistry &); // ScrollPane, Grid, ScrollGrid

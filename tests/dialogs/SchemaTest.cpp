@@ -53,6 +53,10 @@ std::set<std::string> const kStockTypes = {"OvalButton",
                                            "Box",
                                            "BoxSelect",
                                            "Label",
+                                           "Text",
+                                           "StyledText",
+                                           "StringGroup",
+                                           "MultiString",
                                            "Group",
                                            "Spacer",
                                            "ScrollBar",
@@ -92,8 +96,8 @@ TEST(Schema, KnowsTheKeysOfTheStockTypesAndNoOthers) {
     XmlFile const schema = XmlFile::Read(kSchema);
     std::set<std::string> known;
     for (char const *group :
-         {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels", "Groups",
-          "ScrollBars", "Scrolled", "Selectables", "Lists", "TextFields", "Menus", "Graphics"})
+         {"EveryItem", "SeveralTypes", "Buttons", "Choices", "Icons", "Boxes", "Labels", "StaticTexts",
+          "Groups", "ScrollBars", "Scrolled", "Selectables", "Lists", "TextFields", "Menus", "Graphics"})
         CollectElements(*Named(schema.Root(), "xs:group", group), known);
     EXPECT_EQ(known, KeysOfStockTypes());
 }

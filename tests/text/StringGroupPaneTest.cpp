@@ -1,0 +1,165 @@
+#include "text/StringGroupPane.h"
+#include "host/CompoundPane.h"
+#include "host/NamedColors.h"
+#include "host/TextLayout.h"
+#include "host/VelaDrawing.h"
+#include "tests/PaneTest.h"
+
+namespace {
+
+short const kSpacing = 21;
+
+class StringGroupTest : public PaneTest {
+protected:
+    struct Line {
+        char const *text;
+        bool placed;
+        Point origin;
+    };
+
+    StringGroupTest()
+        : list(XMLLib::CreateContainer(Text("TextList"))) {}
+
+    StringGroupTest &Add(Line const &line) {
+        TestItem item;
+        item.String("Text", line.text);
+        if (line.placed)
+            item.Spot("TextOrigin", line.origin);
+        list->AddItem(Text("Line"), item.Container());
+        return *this;
+    }
+    StringGroupPane *New(int fsrid = 0) {
+        item.Integer("FSRID", fsrid).Integer("LineSpacing", kSpacing);
+        item.Container()->AddItem(Text("TextList"), list);
+        return StringGroupPane::NewStringGroupPane(glog, 5, item.Sheet());
+    }
+    // Two lines, 40 pixels apart.
+    StringGroupPane *NewPair() {
+        Add({"Attack", true, {30, 20}});
+        Add({"Release", true, {70, 24}});
+        return New();
+    }
+    static short AscentOf(int font) {
+        SaveTextState const state;
+        SetFontData(GetIndVelaFont(font));
+        TarnQuickDrawText::FontInfo info;
+        tarn::GetFontInfo(info);
+        return info.ascent;
+    }
+    static int WidthOf(char const *text, int font = 0) {
+        SaveTextState const state;
+        SetFontData(GetIndVelaFont(font));
+        return LooseStringWidth(Text(text), 0.0f, 1.0f);
+    }
+    // Where the text of a box starts.
+    static Point StartIn(Rect const &box) {
+        return {static_cast<short>(box.top + AscentOf(0) / 2 + (box.bottom - box.top) / 2), box.left};
+    }
+    Lines DrawnAt(GlogPane &pane, std::vector<std::pair<char const *, Point>> const &texts) {
+        return Traced(pane, [&] {
+            SaveTextState const textState;
+            SaveColors const colors;
+            SetFontData(GetIndVelaFont(0));
+            VelaDrawing::RGBForeColor(kDialogActiveTextColor);
+            for (auto const &text : texts)
+                DrawStringAtPoint(Text(text.first), text.second, -1, TextSettings::kTruncateNone);
+        });
+    }
+
+    boost::shared_ptr<XMLLib::ContainerItem> list;
+    TestItem item;
+};
+
+} // namespace
+
+TEST_F(StringGroupTest, HasABoxRoundAllOfItsStrings) {
+    StringGroupPane *const pane = NewPair();
+    short const ascent = AscentOf(0);
+    EXPECT_EQ(BoxOf(*pane),
+              (Rect{static_cast<short>(30 - ascent), 20, static_cast<short>(70 - ascent + kSpacing),
+                    static_cast<short>(std::max(20 + WidthOf("Attack"), 24 + WidthOf("Release")))}));
+    EXPECT_EQ(pane->GetID(), 5);
+    ASSERT_EQ(pane->CountStrings(), 2U);
+    EXPECT_EQ(pane->StringAt(1), Text("Release"));
+}
+
+TEST_F(StringGroupTest, AStringWithoutOriginHangsAboveTheCorner) {
+    Add({"Attack", false, {}});
+    short const ascent = AscentOf(0);
+    EXPECT_EQ(BoxOf(*New()), (Rect{static_cast<short>(-ascent), 0, static_cast<short>(kSpacing - ascent),
+                                   static_cast<short>(WidthOf("Attack"))}));
+}
+
+TEST_F(StringGroupTest, WithoutStringsHasTheBoxThatContainsNothing) {
+    StringGroupPane *const pane = New();
+    EXPECT_EQ(BoxOf(*pane), (Rect{10000, 10000, -10000, -10000}));
+    Rect anywhere = {1, 2, 3, 4};
+    pane->SetBox(&anywhere);
+    EXPECT_EQ(BoxOf(*pane), (Rect{10000, 10000, -10000, -10000}));
+    EXPECT_EQ(Only("DrawStringAtPoint", DrawingOf(*pane)), Lines());
+    Show();
+}
+
+TEST_F(StringGroupTest, WithoutAListFailsTheAssertionOfItsPointer) {
+    TestItem empty;
+    EXPECT_THROW(StringGroupPane::NewStringGroupPane(glog, 5, empty.Sheet()), BrokenInvariant);
+}
+
+TEST_F(StringGroupTest, DrawsEachTextInTheMiddleOfItsBox) {
+    StringGroupPane *const pane = NewPair();
+    short const ascent = AscentOf(0);
+    Rect const first = {static_cast<short>(30 - ascent), 20, static_cast<short>(30 - ascent + kSpacing), 0};
+    Rect const second = {static_cast<short>(70 - ascent), 24, static_cast<short>(70 - ascent + kSpacing), 0};
+    EXPECT_EQ(Only("DrawStringAtPoint", DrawingOf(*pane)),
+              Only("DrawStringAtPoint",
+                   DrawnAt(*pane, {{"Attack", StartIn(first)}, {"Release", StartIn(second)}})));
+    EXPECT_TRUE(KeepsColors(*pane));
+}
+
+TEST_F(StringGroupTest, MovesItsStringsByTheCornerAlone) {
+    StringGroupPane *const pane = NewPair();
+    Rect const before = BoxOf(*pane);
+    Rect wanted = {static_cast<short>(before.top + 7), static_cast<short>(before.left - 3), 500, 600};
+    pane->SetBox(&wanted);
+    EXPECT_EQ(BoxOf(*pane), (Rect{wanted.top, wanted.left, static_cast<short>(before.bottom + 7),
+                                  static_cast<short>(before.right - 3)}));
+}
+
+TEST_F(StringGroupTest, TakesItsFontFromTheItem) {
+    Add({"Attack", true, {30, 20}});
+    EXPECT_EQ(BoxOf(*New(7)).right, 20 + WidthOf("Attack", 7));
+    EXPECT_NE(WidthOf("Attack", 7), WidthOf("Attack", 0));
+}
+
+TEST_F(StringGroupTest, LeavesItsFontInThePort) {
+    SetPortToGlog(glog);
+    SetFontData(GetIndVelaFont(0));
+    Add({"Attack", true, {30, 20}});
+    New(7);
+    EXPECT_EQ(LooseStringWidth(Text("Attack"), 0.0f, 1.0f), WidthOf("Attack", 7));
+}
+
+TEST_F(StringGroupTest, AnswersNothingToAClick) {
+    StringGroupPane *const pane = NewPair();
+    Show();
+    Rect const box = BoxOf(*pane);
+    EXPECT_EQ(ResultOfClick("click " + std::to_string(box.left + 2) + " " + std::to_string(box.top + 5)), 0);
+    EXPECT_EQ(ResultOfClick("click " + std::to_string(box.left + 2) + " " + std::to_string(box.bottom - 2)),
+              0);
+}
+
+TEST_F(StringGroupTest, InALayoutDrawsEachTextInTheItemOfItsOwn) {
+    CompoundPane *const column = new CompoundPane;
+    column->CompoundPaneInit(glog, 1);
+    Rect all = {0, 0, 200, 300};
+    column->SetBox(&all);
+    column->SetUseLayout(true);
+    StringGroupPane *const pane = NewPair();
+    column->Add(pane, -1);
+    Show();
+    ASSERT_TRUE(pane->IsInLayout());
+    Rect given = {40, 50, 140, 250};
+    pane->SetBox(&given);
+    EXPECT_EQ(BoxOf(*pane), given);
+    EXPECT_EQ(Only("DrawStringAtPoint", DrawingOf(*pane)).size(), 2U);
+}
