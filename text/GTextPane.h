@@ -182,6 +182,9 @@ protected:
     void UpdateTextEdit();
 
 private:
+    // A field of several lines is scrolled by the wheel.
+    CustomEventHandler *CanHandleCustomEvent(UIEvent *) override;
+
     friend class Client;
     class WithTextColors;
 

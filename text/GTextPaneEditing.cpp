@@ -2,13 +2,18 @@
 #include "frame/Message.h"
 #include "host/CallbackAPI.h"
 #include "host/Coordinate.h"
+#include "host/CustomEventHandler.h"
 #include "host/EventRecordAdapter.h"
 #include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/Services.h"
+#include "host/UIEvent.h"
 #include "host/glogRec.h"
+#include "scrolling/Truncation.h"
+#include "scrolling/WheelAxis.h"
 #include "text/GTextPane.h"
 #include "text/WithTextColors.h"
+#include <new>
 
 namespace {
 
@@ -288,6 +293,35 @@ void GTextPane::SetText(const UString &text) {
 }
 
 // Scrolling
+
+// Scrolls by three lines a notch.
+struct GTextMouseWheelHandler : CustomEventHandler {
+    explicit GTextMouseWheelHandler(GTextPane *scrolled)
+        : pane(scrolled) {}
+
+    // A wheel across the text, and one that has nothing to scroll, is left to others.
+    bool HandleEvent(UIEvent *event) override {
+        int const kLinesOfNotch = 3;
+        boost::shared_ptr<UIEvent::MouseWheelParams> const wheel = event->GetMouseWheelParams();
+        int const before = pane->GetCurrentScrolledOffset();
+        if (wheel->axis != kWheelVertical)
+            return false;
+        double const pixels = static_cast<double>(wheel->delta) * kLinesOfNotch * pane->GetScrollDelta();
+        pane->SetVScrollPos(Truncated(before - pixels), 0);
+        return pane->GetCurrentScrolledOffset() != before;
+    }
+
+    CustomEventHandler *Clone() override { return new (std::nothrow) GTextMouseWheelHandler(pane); }
+
+private:
+    GTextPane *pane;
+};
+
+CustomEventHandler *GTextPane::CanHandleCustomEvent(UIEvent *event) {
+    if (!multiLine || !IsMouseWheelEvent(*event))
+        return nullptr;
+    return new (std::nothrow) GTextMouseWheelHandler(this);
+}
 
 void GTextPane::SetVScrollPos(int first, int second) {
     if (textEdit)

@@ -50,6 +50,16 @@ PangoAttrList *NewAttributes(ShownText const &text, StyleRuns::List const &runs)
     return list;
 }
 
+// Which way the character at the byte is written.
+bool RunsToLeft(PangoLayoutLine const &line, int byte) {
+    for (GSList const *node = line.runs; node; node = node->next) {
+        PangoItem const &item = *static_cast<PangoGlyphItem const *>(node->data)->item;
+        if (byte >= item.offset && byte < item.offset + item.length)
+            return item.analysis.level % 2 != 0;
+    }
+    return false;
+}
+
 PangoLogAttr const *AttributesOf(PangoLayout *layout, std::size_t &count) {
     int all = 0;
     PangoLogAttr const *const attributes = pango_layout_get_log_attrs_readonly(layout, &all);
@@ -146,11 +156,23 @@ std::size_t ParagraphLayout::LineAtHeight(int v) const {
 
 // Places
 
+// Where the direction changes there are two places; it stands at the one that goes on as the line does.
 int ParagraphLayout::LeftOf(std::size_t unit) const {
-    std::size_t const line = LineAtUnit(unit);
+    std::size_t const index = LineAtUnit(unit);
+    Line const &line = lines[index];
+    PangoLayoutLine *const pangoLine = PangoLine(index);
+    int const byte = text.ByteOf(unit);
+    if (byte <= pangoLine->start_index)
+        return line.rightToLeft ? line.left + line.width : line.left;
+    int const before = text.ByteOf(text.UnitOfCharacter(text.CharacterOf(unit) - 1));
     int h = 0;
-    pango_layout_line_index_to_x(PangoLine(line), text.ByteOf(unit), FALSE, &h);
-    return lines[line].left + Pixels(h);
+    if (RunsToLeft(*pangoLine, before) == line.rightToLeft)
+        pango_layout_line_index_to_x(pangoLine, before, TRUE, &h);
+    else if (byte < pangoLine->start_index + pangoLine->length)
+        pango_layout_line_index_to_x(pangoLine, byte, FALSE, &h);
+    else
+        return line.rightToLeft ? line.left : line.left + line.width;
+    return line.left + Pixels(h);
 }
 
 std::size_t ParagraphLayout::UnitAt(std::size_t line, int h) const {

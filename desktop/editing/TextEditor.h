@@ -79,8 +79,6 @@ public:
     // What an input method composes stands in the place of the selection, marked, until it is typed or given
     // up; an empty text gives it up. The caret counts characters from its start.
     void Compose(UString const &, int caret);
-    // Turns the wheel by so many notches, positive toward the start. False when there is nothing to scroll.
-    bool Wheel(double notches);
     bool Contains(Point window) const;
     Rect CaretBox() const; // in the window
     TarnOSWindow::OSWindow *WindowNow() const { return window; }

@@ -10,7 +10,6 @@ namespace {
 
 int const kSidePadding = 2; // pixels between the bounds' sides and the text
 int const kCaretWidth = 1;
-int const kNotchLines = 3; // that a notch of the wheel scrolls by
 // Scrolling to a place lays out what shows there, which may move the place.
 int const kMostRounds = 4;
 std::size_t const kNeighbours = 16; // paragraphs beyond those that show are kept laid out
@@ -165,16 +164,6 @@ void TextEditor::SetVScrollPos(int pixels, int) {
 void TextEditor::VScrollToCharacterPosition(unsigned int unit) {
     if (ScrollIntoView(std::min<std::size_t>(unit, document.Size())) && active)
         TextFocus::CaretMoved(*this);
-}
-
-bool TextEditor::Wheel(double notches) {
-    if (!HasSeveralLines() || flow.Height() <= ViewHeight())
-        return false;
-    constexpr double kMostNotches = 10000;
-    double const lines = std::clamp(notches, -kMostNotches, kMostNotches) * kNotchLines;
-    SetVScrollPos(Saturated(std::max<long long>(ScrollTop() - std::llround(lines * flow.LineHeight()), 0)),
-                  0);
-    return true;
 }
 
 bool TextEditor::Contains(Point p) const { return IsWithin(p, BoundsBox()); }

@@ -6,7 +6,8 @@
 
 namespace {
 
-int const kFarthest = 32000; // pixels
+int const kFarthest = 32000;    // pixels
+int const kMostComposed = 1000; // characters
 double const kMostNotches = 1000;
 double const kLongestWait = 86400; // a day
 long const kLastMenuItem = 32767;
@@ -158,6 +159,11 @@ void ReadKey(LineReader &reader, ScriptStep &step) {
 
 void ReadType(LineReader &reader, ScriptStep &step) { step.text = reader.Quoted(); }
 
+void ReadCompose(LineReader &reader, ScriptStep &step) {
+    step.text = reader.Quoted();
+    step.caret = reader.AtEnd() ? kMostComposed : reader.Whole("a count of characters", 0, kMostComposed);
+}
+
 void ReadWait(LineReader &reader, ScriptStep &step) {
     step.seconds = reader.Number("a number of seconds", 0, kLongestWait);
 }
@@ -193,6 +199,7 @@ StepForm const kStepForms[] = {
     {"wheel", ScriptStep::kWheel, ReadWheel},
     {"key", ScriptStep::kKey, ReadKey},
     {"type", ScriptStep::kType, ReadType},
+    {"compose", ScriptStep::kCompose, ReadCompose},
     {"wait", ScriptStep::kWait, ReadWait},
     {"resize", ScriptStep::kResize, ReadResize},
     {"activate", ScriptStep::kActivate, ReadActivate},

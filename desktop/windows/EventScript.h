@@ -16,6 +16,7 @@ struct ScriptStep {
         kWheel,
         kKey,
         kType,
+        kCompose, // `text`, and `caret` characters into it
         kWait,
         kResize,
         kActivate, // `on`
@@ -29,6 +30,7 @@ struct ScriptStep {
     double wheelH = 0, wheelV = 0;
     unsigned short modifiers = 0;
     int key = 0;
+    int caret = 0;
     double seconds = 0;
     bool on = true;
     std::vector<int> path; // of kMenu: item numbers, each but the last of a submenu; a single 0 dismisses

@@ -249,6 +249,14 @@ void SimulatedWindowSystem::Perform(ScriptStep const &step) {
     case ScriptStep::kType:
         Type(step);
         break;
+    case ScriptStep::kCompose: {
+        InputEvent event;
+        event.kind = InputEvent::kTextEditing;
+        event.text = Utf::FromUtf8(step.text);
+        event.compositionCaret = step.caret;
+        Push(event, step);
+        break;
+    }
     case ScriptStep::kWait:
         break;
     case ScriptStep::kResize: {

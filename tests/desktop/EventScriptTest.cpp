@@ -38,10 +38,10 @@ TEST(EventScript, EveryStepOfTheLanguageIsRead) {
           Case{"click 1 2", ScriptStep::kClick}, Case{"doubleclick 1 2", ScriptStep::kDoubleClick},
           Case{"rightclick 1 2", ScriptStep::kRightClick}, Case{"wheel 1 2 0 -1", ScriptStep::kWheel},
           Case{"key Return", ScriptStep::kKey}, Case{"type \"a\"", ScriptStep::kType},
-          Case{"wait 0.5", ScriptStep::kWait}, Case{"resize 640 480", ScriptStep::kResize},
-          Case{"activate off", ScriptStep::kActivate}, Case{"menu 3", ScriptStep::kMenu},
-          Case{"print a.pdf", ScriptStep::kPrint}, Case{"snapshot a.png", ScriptStep::kSnapshot},
-          Case{"dump a.json", ScriptStep::kDump}})
+          Case{"compose \"a\" 1", ScriptStep::kCompose}, Case{"wait 0.5", ScriptStep::kWait},
+          Case{"resize 640 480", ScriptStep::kResize}, Case{"activate off", ScriptStep::kActivate},
+          Case{"menu 3", ScriptStep::kMenu}, Case{"print a.pdf", ScriptStep::kPrint},
+          Case{"snapshot a.png", ScriptStep::kSnapshot}, Case{"dump a.json", ScriptStep::kDump}})
         EXPECT_EQ(One(c.line).kind, c.kind) << c.line;
 }
 
