@@ -17,16 +17,25 @@ bool GoesOn(std::u16string_view text, std::size_t at) {
            text[at - 1] == 0x200D;
 }
 
-// A place to cut: behind a space if there is one nearby.
-std::size_t CutOf(std::u16string_view text) {
-    std::size_t const farthest = ParagraphBreaks::kLongestParagraph - kFarthestBack;
-    for (std::size_t at = ParagraphBreaks::kLongestParagraph; at > farthest; --at)
+// A place to cut at or before the one given: behind a space if there is one nearby.
+std::size_t CutOf(std::u16string_view text, std::size_t longest) {
+    std::size_t const farthest = longest - kFarthestBack;
+    for (std::size_t at = longest; at > farthest; --at)
         if (text[at - 1] == ' ' && !GoesOn(text, at))
             return at;
-    for (std::size_t at = ParagraphBreaks::kLongestParagraph; at > farthest; --at)
+    for (std::size_t at = longest; at > farthest; --at)
         if (!GoesOn(text, at))
             return at;
-    return ParagraphBreaks::kLongestParagraph;
+    return longest;
+}
+
+// Where text is cut that has no break: its length if it is not.
+std::size_t LengthOfOpen(std::u16string_view text) {
+    if (text.size() > ParagraphBreaks::kLongestWord &&
+        text.substr(0, ParagraphBreaks::kLongestWord).find(u' ') == text.npos)
+        return CutOf(text, ParagraphBreaks::kLongestWord);
+    return text.size() > ParagraphBreaks::kLongestParagraph ? CutOf(text, ParagraphBreaks::kLongestParagraph)
+                                                            : text.size();
 }
 
 } // namespace
@@ -51,12 +60,11 @@ std::vector<std::uint32_t> ParagraphBreaks::Split(std::u16string_view text, bool
         std::size_t const most = std::min(rest.size(), kLongestParagraph);
         auto const found =
             std::find_if(rest.begin(), rest.begin() + static_cast<std::ptrdiff_t>(most), IsBreak);
-        std::size_t length = static_cast<std::size_t>(found - rest.begin());
-        open = length == most;
+        std::size_t const body = static_cast<std::size_t>(found - rest.begin());
+        std::size_t length = LengthOfOpen(body == most ? rest : rest.substr(0, body));
+        open = body == most || length < body;
         if (!open)
             length += rest[length] == '\r' && length + 1 < rest.size() && rest[length + 1] == '\n' ? 2 : 1;
-        else if (rest.size() > kLongestParagraph)
-            length = CutOf(rest);
         lengths.push_back(static_cast<std::uint32_t>(length));
         at += length;
     }

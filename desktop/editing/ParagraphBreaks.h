@@ -10,6 +10,8 @@ namespace ParagraphBreaks {
 // A paragraph without end would be laid out as a whole for each character that is typed into it: after so
 // many units, line breaks included, another one begins as if the line had been full.
 constexpr std::size_t kLongestParagraph = 4096;
+// The same where there is no space in it: then each of its lines costs what all that follow do.
+constexpr std::size_t kLongestWord = 1024;
 
 // Whether the unit ends a line: as in CR, LF, their pair, and the separators of Unicode.
 bool IsBreak(char16_t);
