@@ -257,8 +257,9 @@ bool TextEditor::TakeKey(KeyEvent &event) {
     boost::shared_ptr<OS::TextEditClient> const asked = client;
     Action const action = Action::OfKey(KeyReading::CodeOf(event), event.modifiers);
     UString const text = KeyReading::TextOf(event);
+    bool const wasComposing = composing; // then all keys are the input method's
     if (action.kind == Action::kNone && text.empty())
-        return false;
+        return wasComposing;
     if (asked) {
         OS::TextEditClient::DispatchPath path = asked->TextEditClient_HandleEvent(*this, &event);
         if (path == OS::TextEditClient::kPlatformPath && !self.expired())
@@ -270,5 +271,5 @@ bool TextEditor::TakeKey(KeyEvent &event) {
         if (path != OS::TextEditClient::kPlatformPath)
             return false;
     }
-    return HandleEvent(&event);
+    return HandleEvent(&event) || wasComposing;
 }

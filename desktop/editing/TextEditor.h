@@ -15,6 +15,7 @@
 class DrawingPort;
 class Glog;
 class KeyEvent;
+class PixelScope;
 
 namespace TextEditFlags {
 // What OSTextEdit::Create is told.
@@ -152,6 +153,7 @@ private:
     void DrawText(DrawingPort &);
     void DrawMark(DrawingPort &);
     void DrawCaret(DrawingPort &) const;
+    void FillWithin(PixelScope &, DrawingPort const &, Rect const &window, OS::RGBAColor const &) const;
     enum RangeShape { kWholeLine, kUnderline };
     void FillRanges(DrawingPort &, std::size_t start, std::size_t end, OS::RGBAColor const &, RangeShape);
     void Trace(DrawingPort const &) const;

@@ -73,6 +73,16 @@ void TextEditor::DrawGround(DrawingPort &port) const {
         pixels.Fill(pixels.ToDevice(ToLocal(port, BoundsBox())), groundColor);
 }
 
+// Letters may stand higher than the bounds; what lies behind and between them ends there.
+void TextEditor::FillWithin(PixelScope &pixels, DrawingPort const &port, Rect const &window,
+                            OS::RGBAColor const &color) const {
+    Rect const box = BoundsBox();
+    Rect const part{std::max(window.top, box.top), window.left, std::min(window.bottom, box.bottom),
+                    window.right};
+    if (part.top < part.bottom)
+        pixels.Fill(pixels.ToDevice(ToLocal(port, part)), color);
+}
+
 // In each line what the units cover there; as bars below the text instead.
 void TextEditor::FillRanges(DrawingPort &port, std::size_t start, std::size_t end, OS::RGBAColor const &color,
                             RangeShape shape) {
@@ -94,9 +104,10 @@ void TextEditor::FillRanges(DrawingPort &port, std::size_t start, std::size_t en
                 shape == kUnderline ? lineTop + kMarkThickness : top + line.top + line.height;
             for (ParagraphLayout::Range const &range :
                  layout.RangesOf(i, std::max(from, line.start), std::min(to, line.end))) {
-                Rect const bar{Coordinate(lineTop), Coordinate(TextLeft() + range.first),
-                               Coordinate(lineBottom), Coordinate(TextLeft() + range.second)};
-                pixels.Fill(pixels.ToDevice(ToLocal(port, bar)), color);
+                FillWithin(pixels, port,
+                           {Coordinate(lineTop), Coordinate(TextLeft() + range.first), Coordinate(lineBottom),
+                            Coordinate(TextLeft() + range.second)},
+                           color);
             }
         }
     }
@@ -140,5 +151,5 @@ void TextEditor::DrawCaret(DrawingPort &port) const {
         return;
     PixelScope pixels(port);
     if (pixels.CanDraw())
-        pixels.Fill(pixels.ToDevice(ToLocal(port, CaretBox())), textColor);
+        FillWithin(pixels, port, CaretBox(), textColor);
 }

@@ -12,6 +12,8 @@
 //     drag ITEM[.PART] H V          the mouse is pressed there, moved that far right and down, and released
 //     grab ITEM[.PART] H V H2 V2    the mouse is pressed so far from its top left corner, and dragged so far
 //     wheel ITEM[.PART] H V         the wheel is turned there
+//     type TEXT                     the letters are typed
+//     key NAME [MODIFIER]           the key is pressed
 //     label ITEM                    nothing is done; the label's text follows
 //     bar ITEM                      the same with where a scroll bar stands
 //
@@ -244,6 +246,10 @@ protected:
         record += step + '\n';
         if (gesture == "page")
             OpenPage(where);
+        else if (gesture == "type")
+            desktop.Play("type \"" + where + "\"\n");
+        else if (gesture == "key")
+            desktop.Play(step + "\n");
         else if (gesture != "label" && gesture != "bar")
             Use(gesture, Place(where), words);
         RecordMessages();

@@ -114,6 +114,18 @@ Press const kPresses[] = {
     {"select", "rest", ""},
     {"select", "selected", "click 30 48\nclick 200 30\n"},
     {"select", "behind", "click 30 48\nclick 200 30\nactivate off\nclick 1 110\n"},
+    {"text", "rest", ""},
+    {"text", "word-selected", "doubleclick 30 24\n"},
+    {"text", "all-selected", "click 60 24\nwait 1\nkey Tab\n"},
+    {"text", "lines-selected", "press 180 26\nmove 290 40\n"},
+    {"text", "mixed-selected", "press 210 82\nmove 188 82\n"},
+    {"text", "behind", "press 180 26\nmove 290 40\nrelease\nactivate off\n"},
+    {"text", "insertion-point", "click 200 26\nwait 0.6\n"},
+    {"text", "typed", "click 60 88\ntype \"Take 12\"\nwait 0.6\n"},
+    {"text", "too-long", "click 60 88\ntype \"A name that is longer than its field\"\nwait 0.6\n"},
+    {"text", "composed", "click 60 88\ntype \"ab\"\ncompose \"\u00E9\u00E8\u00EA\" 2\nwait 0.6\n"},
+    {"text", "large-selected", "doubleclick 170 124\n"},
+    {"text", "bare-edited", "doubleclick 30 160\n"},
 };
 
 void PrintTo(Press const &press, std::ostream *out) { *out << press.Name(); }

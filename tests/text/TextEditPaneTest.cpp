@@ -1,0 +1,144 @@
+#include "text/TextEditPane.h"
+#include "host/PaneWatch.h"
+#include "tests/PaneTest.h"
+
+namespace {
+
+typedef OS::RectBase<OS::RectTag> PlaneRect;
+
+class PaneEar : public TextEditPane_Listener {
+public:
+    void TextEditPane_TextChanged(TextEditPane &) override { ++changes; }
+    void TextEditPane_Autoscrolled(TextEditPane &) override { ++scrolls; }
+    int changes = 0, scrolls = 0;
+};
+
+class TextEditPaneTest : public PaneTest {
+protected:
+    TextEditPaneTest() {
+        Rect box = {20, 20, 60, 120};
+        pane->SetBox(&box);
+        ear.DependUpon(pane);
+        Show();
+        desktop.Play("");
+    }
+    void SetText(char const *text) { pane->GetTextEdit().SetText(Text(text)); }
+
+    TextEditPane *pane = new TextEditPane(glog, 7, 0);
+    PaneEar ear;
+};
+
+bool Same(PlaneRect const &a, PlaneRect const &b) {
+    return a.origin.x == b.origin.x && a.origin.y == b.origin.y && a.size.width == b.size.width &&
+           a.size.height == b.size.height;
+}
+
+TEST_F(TextEditPaneTest, IsAttachedUnderItsNumber) {
+    EXPECT_EQ(pane->GetID(), 7);
+    EXPECT_EQ(pane->GetGlog(), glog);
+}
+
+TEST_F(TextEditPaneTest, WithoutAGlogItHasAnEngineAllTheSame) {
+    TextEditPane loose(nullptr, 1, 2);
+    loose.GetTextEdit().SetText(Text("a"));
+    loose.SetFractionalOffset(OS::Point(0.5, 0.5), OS::Size(1, 1));
+    EXPECT_EQ(loose.GetTextEdit().GetText(), Text("a"));
+}
+
+TEST_F(TextEditPaneTest, KeysGoToItsEngineWhileItIsEditing) {
+    pane->BeginEditing();
+    desktop.Play("type \"ab\"");
+    EXPECT_EQ(pane->GetTextEdit().GetText(), Text("ab"));
+    EXPECT_EQ(ear.changes, 2);
+    pane->EndEditing();
+    desktop.Play("type \"c\"");
+    EXPECT_EQ(ear.changes, 2);
+}
+
+TEST_F(TextEditPaneTest, TellsThatItsTextHasScrolledByItself) {
+    pane->BeginEditing();
+    desktop.Play("type \"a text that is wider than the pane\"");
+    EXPECT_GT(ear.scrolls, 0);
+}
+
+TEST_F(TextEditPaneTest, ItsFractionIsWhatIsLeftOfWholePixels) {
+    pane->SetFractionalBounds(PlaneRect(10.25, 20, 5.5, 8));
+    EXPECT_EQ(BoxOf(*pane), (Rect{20, 10, 28, 16}));
+    EXPECT_EQ(pane->GetFractionalOffset().first.x, 0.25);
+    EXPECT_EQ(pane->GetFractionalOffset().second.width, -0.5);
+    EXPECT_TRUE(Same(pane->GetFractionalBounds(), PlaneRect(10.25, 20, 5.5, 8)));
+    EXPECT_TRUE(Same(pane->GetTextEdit().GetBounds(), PlaneRect(10.25, 20, 5.5, 8)));
+}
+
+TEST_F(TextEditPaneTest, ANegativeSizeLiesOnTheOtherSide) {
+    pane->SetFractionalBounds(PlaneRect(10, 20, -2.5, 8));
+    EXPECT_EQ(BoxOf(*pane), (Rect{20, 7, 28, 10}));
+    EXPECT_EQ(pane->GetFractionalOffset().first.x, 3.0);
+    EXPECT_EQ(pane->GetFractionalOffset().second.width, -5.5);
+    EXPECT_TRUE(Same(pane->GetFractionalBounds(), PlaneRect(10, 20, -2.5, 8)));
+}
+
+TEST_F(TextEditPaneTest, SettingTheBoundsRepaintsTheOldAndTheNewBox) {
+    Repainted();
+    pane->SetFractionalBounds(PlaneRect(200, 100, 40, 20));
+    std::vector<Rect> const rects = Repainted();
+    ASSERT_EQ(rects.size(), 2u);
+    EXPECT_EQ(rects[0], (Rect{20, 20, 60, 120}));
+    EXPECT_EQ(rects[1], (Rect{100, 200, 120, 240}));
+}
+
+TEST_F(TextEditPaneTest, TheOffsetMovesTheEngine) {
+    pane->SetFractionalOffset(OS::Point(0.5, 1.5), OS::Size(-1, -2));
+    EXPECT_TRUE(Same(pane->GetTextEdit().GetBounds(), PlaneRect(20.5, 21.5, 99, 38)));
+}
+
+TEST_F(TextEditPaneTest, CommandsNeverCount) {
+    SetText("Bass");
+    bool commits = true;
+    pane->SelectAll();
+    pane->Cut(commits);
+    EXPECT_FALSE(commits);
+    EXPECT_EQ(pane->GetTextEdit().GetText(), UString());
+    commits = true;
+    pane->Paste(commits);
+    EXPECT_FALSE(commits);
+    EXPECT_EQ(pane->GetTextEdit().GetText(), Text("Bass"));
+    commits = true;
+    EXPECT_FALSE(pane->Clear(commits));
+    EXPECT_TRUE(commits);
+    pane->SelectAll();
+    EXPECT_TRUE(pane->Clear(commits));
+    EXPECT_FALSE(commits);
+}
+
+TEST_F(TextEditPaneTest, KnowsTheFiveCommands) {
+    for (short id = 0; id < 20; ++id)
+        EXPECT_EQ(pane->CanDoOp(CommandSpecifier(0, id)), id == 1 || (id >= 11 && id <= 13) || id == 15)
+            << id;
+}
+
+TEST_F(TextEditPaneTest, DrawsItsEngine) {
+    SetText("Bass");
+    EXPECT_EQ(Only("DrawTextEdit", DrawingOf(*pane)).size(), 1u);
+}
+
+TEST_F(TextEditPaneTest, GoesWithItsWindowAlthoughItLeavesIt) {
+    PaneWatch const watch(pane);
+    DisposeGlog(glog);
+    EXPECT_FALSE(watch.PaneExists());
+}
+
+TEST_F(TextEditPaneTest, AListenerMayDeleteIt) {
+    class Deleting : public TextEditPane_Listener {
+    public:
+        void TextEditPane_TextChanged(TextEditPane &pane) override { delete &pane; }
+    };
+    Deleting deleting;
+    deleting.DependUpon(pane);
+    PaneWatch const watch(pane);
+    pane->BeginEditing();
+    desktop.Play("type \"ab\"");
+    EXPECT_FALSE(watch.PaneExists());
+}
+
+} // namespace
