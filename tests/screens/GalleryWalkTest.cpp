@@ -57,6 +57,10 @@ double const kLeastThumb = 16;     // pixels
 // Classes of panes that nobody clicks, or that are clicked as the list that they are parts of.
 std::set<std::string> const kStill = {"GroupPane",
                                       "LabelPane",
+                                      "MultiStringPane",
+                                      "StringGroupPane",
+                                      "StyledStringPane",
+                                      "TextPane",
                                       "SpacerPane",
                                       "BackdropPane",
                                       "WellPane",
