@@ -32,8 +32,8 @@ public:
     // An empty layout, the caller's, with the font: grayscale, glyphs on whole logical pixels.
     PangoLayout *NewLayout(FontSpec const &);
     FontMetrics const &Metrics(FontSpec const &);
-    // How Pango is told of the font; stays the library's, and valid until the generation changes. A first call
-    // may open files, after which layouts of other fonts are to be made anew.
+    // How Pango is told of the font; stays the library's, and valid until the generation changes. A first
+    // call may open files, after which layouts of other fonts are to be made anew.
     PangoFontDescription const *Description(FontSpec const &);
 
     // Adds the system's fonts; false when they had been added before.
