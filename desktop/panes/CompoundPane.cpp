@@ -333,8 +333,20 @@ void CompoundPane::DrawGuts(OSRgn *region) {
 int CompoundPane::HandleClick(EventRecordAdapter *event) {
     EventRecordAdapter inside = *event;
     inside.where = ToContent(*this, event->where);
-    GlogPane *pane = TopmostAt(compoundRep->Subpanes(), inside.where);
-    return pane ? PaneEvents::Click(*pane, inside) : 0;
+    PaneWatch const watch(this);
+    auto const snapshot = compoundRep->Snapshot();
+    unsigned long const changes = compoundRep->changes;
+    // What a subpane does not take goes on to those below it.
+    for (auto i = snapshot->rbegin(); i != snapshot->rend(); ++i) {
+        if (!compoundRep->Has(*i, changes) || !PaneAccess::OwnVisibility(**i) ||
+            !(*i)->Contains(inside.where))
+            continue;
+        EventRecordAdapter record = inside;
+        int const value = PaneEvents::Click(**i, record);
+        if (value != 0 || !watch.PaneExists())
+            return value;
+    }
+    return 0;
 }
 
 int CompoundPane::HandleSecondaryButtonClick(EventRecordAdapter *event) {

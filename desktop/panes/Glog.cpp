@@ -424,7 +424,7 @@ void Glog::Click(InputEvent const &event) {
         int item;
         bool noted;
     } const ownHit(*this);
-    int const value = event.button == 1   ? PaneEvents::Click(*pane, record)
+    int const value = event.button == 1   ? ClickFrom(*pane, record)
                       : event.button == 2 ? PaneEvents::SecondaryClick(*pane, record)
                                           : 0;
     if (disposed)
@@ -435,6 +435,20 @@ void Glog::Click(InputEvent const &event) {
         GrowByDragging(record.where);
     if (value > 0)
         ReportHit(value);
+}
+
+// What a pane does not take goes on to those below it.
+int Glog::ClickFrom(GlogPane &topmost, EventRecordAdapter const &record) {
+    std::vector<GlogPane *> const snapshot = items;
+    auto at = std::find(snapshot.rbegin(), snapshot.rend(), &topmost);
+    for (; at != snapshot.rend() && !disposed; ++at) {
+        if (!HasItem(*at) || !PaneAccess::OwnVisibility(**at) || !(*at)->Contains(record.where))
+            continue;
+        EventRecordAdapter copy = record;
+        if (int const value = PaneEvents::Click(**at, copy))
+            return value;
+    }
+    return 0;
 }
 
 // A pane in the corner that has taken the press and has not followed the mouse is a grow box.

@@ -317,6 +317,31 @@ TEST_F(PictPaneTest, ClicksMayGoThrough) {
     EXPECT_TRUE(ear.where.empty());
 }
 
+TEST_F(PictPaneTest, AClickThatGoesThroughReachesWhatIsBelow) {
+    for (bool inContainer : {false, true}) {
+        gpicResRec record = Record(kBox);
+        PictPane *const below = new PictPane(glog, 1, &record);
+        TestItem item;
+        PictPane *const above = From(item.Box("BoundsRect", kBox).Integer("PicAllowClickThrough", 1));
+        if (inContainer) {
+            CompoundPane *const group = new CompoundPane;
+            group->CompoundPaneInit(glog, 9);
+            Rect all{0, 0, 200, 320};
+            group->SetBox(&all);
+            group->Add(below, -1);
+            group->Add(above, -1);
+        }
+        Show();
+        ClickEar const ear(below);
+        desktop.Play("click 30 40");
+        EXPECT_EQ(ear.where, std::vector<Point>{(Point{40, 30})}) << (inContainer ? "in a container" : "");
+        if (!inContainer) {
+            delete above;
+            delete below;
+        }
+    }
+}
+
 TEST_F(PictPaneTest, MayBeDeletedByWhoHearsOfAClick) {
     PictPane *const pane = Empty();
     Show();

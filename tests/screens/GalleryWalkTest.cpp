@@ -72,7 +72,11 @@ std::set<std::string> const kStill = {"GroupPane",
                                       "TrackListPane::Numbers",
                                       "TakeListPane::List",
                                       "ListHeaderPane",
-                                      "TrackRowPane"};
+                                      "TrackRowPane",
+                                      "GLinePane",
+                                      "ProgressBarPane",
+                                      "WaveViewPane",
+                                      "WaveViewPane::Wave"};
 
 // Where a step is taken: "ITEM" or "ITEM.PART".
 struct Place {

@@ -9,6 +9,7 @@
 #include "desktop/resources/Resources.h"
 #include "dialogs/LoadGlog.h"
 #include "dialogs/Utf8.h"
+#include "graphics/PictPane.h"
 #include "host/CompoundPane.h"
 #include "host/GlogLayout.h"
 #include "host/glogRec.h"
@@ -65,6 +66,8 @@ char const *KindOf(GlogPane *pane) {
         return "Icon button";
     if (dynamic_cast<PopMPane *>(pane))
         return "Pop-up menu";
+    if (dynamic_cast<PictPane *>(pane))
+        return "Picture";
     return dynamic_cast<GIconPane *>(pane) ? "Icon" : "Button";
 }
 

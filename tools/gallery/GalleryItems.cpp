@@ -9,11 +9,14 @@
 #include "tools/gallery/BackdropPane.h"
 #include "tools/gallery/ChoiceButtonPane.h"
 #include "tools/gallery/ColorMenuPane.h"
+#include "tools/gallery/EnvelopePane.h"
 #include "tools/gallery/FittedTabsPane.h"
 #include "tools/gallery/HoldButtonPane.h"
+#include "tools/gallery/PannerPane.h"
 #include "tools/gallery/StepperPane.h"
 #include "tools/gallery/TakeListPane.h"
 #include "tools/gallery/TrackListPane.h"
+#include "tools/gallery/WaveViewPane.h"
 #include "tools/gallery/WellPane.h"
 
 namespace {
@@ -151,6 +154,18 @@ void GalleryItems::Add() {
                          return AskButtonPane::NewAskButtonPane(glog, sheet);
                      }));
     registry.Add(BadgeButtonType());
+    registry.Add(PannerPane::Type());
+    registry.Add(ItemType("Envelope")
+                     .Keys(KeyList().Rect("BoundsRect").Required().Integer("TextID").Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return EnvelopePane::NewEnvelopePane(glog, sheet);
+                     }));
+    registry.Add(
+        ItemType("WaveView")
+            .Keys(KeyList().Rect("BoundsRect").Required().Integer("TextID").Required().Integer("CmdID"))
+            .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                return WaveViewPane::NewWaveViewPane(glog, sheet);
+            }));
     registry.Add(
         ItemType("BarMenu")
             .Keys(KeyList().Rect("BoundsRect").Required().Integer("Num", 1, kMostMenuItems).Required())

@@ -12,6 +12,9 @@ namespace GalleryItems {
 // HoldButton  counts while it is held down (HoldButtonPane.h)
 // TrackList   rows of live panes in a scrolled grid (TrackListPane.h)
 // Well        the frame round a view and its two scroll bars (WellPane.h)
+// Panner      a point in a cube with its coordinates (PannerPane.h)
+// Envelope    a graph whose points are dragged (EnvelopePane.h)
+// WaveView    a recording that is zoomed and scrolled (WaveViewPane.h)
 // BadgeButton an icon button, with all keys of one, that draws a badge over its upper right corner
 void Add();
 

@@ -12,12 +12,6 @@ namespace fs = std::filesystem;
 char const kOwnProgram[] = "/proc/self/exe";
 char const kPlaceInPrefix[] = "share/glogpanes/gallery";
 
-fs::path OwnDirectory() {
-    std::error_code failed;
-    fs::path const program = fs::read_symlink(kOwnProgram, failed);
-    return program.parent_path().parent_path() / kPlaceInPrefix;
-}
-
 // "10-grid" comes after "9-scroll-pane".
 bool ComesBefore(fs::path const &a, fs::path const &b) {
     auto const number = [](fs::path const &page) { return std::atoi(page.stem().c_str()); };
@@ -31,6 +25,12 @@ std::string NameOf(fs::path const &page) {
 }
 
 } // namespace
+
+std::string PageFiles::OwnDirectory() {
+    std::error_code failed;
+    fs::path const program = fs::read_symlink(kOwnProgram, failed);
+    return (program.parent_path().parent_path() / kPlaceInPrefix).string();
+}
 
 PageFiles::PageFiles(std::string const &given) {
     fs::path const place = given.empty() ? OwnDirectory() : fs::path(given);

@@ -15,6 +15,9 @@ public:
     // Throws std::runtime_error, naming the directory, when they are not there.
     explicit PageFiles(std::string const &directory);
 
+    // share/glogpanes/gallery beside the program's own directory, where sounds/ is too.
+    static std::string OwnDirectory();
+
     std::string const &Directory() const { return directory; } // also of the windows that pages open
     std::string const &Frame() const { return frame; }         // the dialog round the pages
     std::vector<PageFile> const &Pages() const { return pages; }
