@@ -76,7 +76,8 @@ std::set<std::string> const kStill = {"GroupPane",
                                       "GLinePane",
                                       "ProgressBarPane",
                                       "WaveViewPane",
-                                      "WaveViewPane::Wave"};
+                                      "WaveViewPane::Wave",
+                                      "ZoomControlPane::ButtonPane"};
 
 // Where a step is taken: "ITEM" or "ITEM.PART".
 struct Place {

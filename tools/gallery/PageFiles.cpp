@@ -33,7 +33,7 @@ std::string PageFiles::OwnDirectory() {
 }
 
 PageFiles::PageFiles(std::string const &given) {
-    fs::path const place = given.empty() ? OwnDirectory() : fs::path(given);
+    fs::path const place = given.empty() ? OwnDirectory() : given;
     directory = place.string();
     frame = (place / "gallery.xml").string();
     std::error_code failed;
