@@ -86,6 +86,10 @@ AMOUNTS = (
     Amount("deselect all, a row", "List/deselect all/manual_time", "ns", 1, 10, "perRow"),
     Amount("memory of several rows, each", "List/bytes of several/iterations:3", "B", 1, 4, "perRow"),
     Amount("memory of one row among them, each", "List/bytes of one/iterations:3", "B", 1, 0.01, "perRow"),
+    Amount("drag step in a cube, at 2x", "Panner/drag step", "us", 1e3, 1000, "cpu_time"),
+    Amount("graph of 1,000 points, at 2x", "Graph/repaint/1000", "us", 1e3, None, "cpu_time"),
+    Amount("graph of 100,000 points, at 2x", "Graph/repaint/100000", "us", 1e3, 20000, "cpu_time"),
+    Amount("unseen step of progress", "Progress/unseen step", "us", 1e3, 1, "cpu_time"),
     Amount("resident memory", "Idle/resident", "MB", 1024 * 1024, 24),
     Amount("wake-ups of an idle window", "Idle/wake-ups", "", 1, 1),
 )

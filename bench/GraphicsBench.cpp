@@ -1,0 +1,106 @@
+// A point that is dragged through its cube, a graph of very many points, and a progress bar.
+#include "desktop/SimulatedDesktop.h"
+#include "desktop/panes/Glog.h"
+#include "graphics/GraphPane.h"
+#include "graphics/ProgressBarPane.h"
+#include "graphics/ThreeDPane.h"
+#include "host/glogRec.h"
+#include <benchmark/benchmark.h>
+#include <cmath>
+
+namespace {
+
+int const kScale = 2;
+int const kManyPoints = 100000, kFewPoints = 1000;
+long long const kGreatest = 1000000000; // of the progress bar: a step is far less than a pixel
+
+// A window at twice the scale.
+class Page {
+public:
+    Page()
+        : desktop(DesktopOptions().Scale(kScale))
+        , glog(desktop.NewGlog(GlogOptions().Size(640, 400))) {}
+
+    void Show() {
+        desktop.FinishGlog(glog);
+        ShowGlog(glog, kShowGlog);
+        UpdateGlog(glog);
+        desktop.TakePresented(glog);
+        desktop.Play("wait 1"); // for the activation
+    }
+    // Draws what is damaged; whether anything was.
+    bool Shown() {
+        UpdateGlog(glog);
+        return !desktop.TakePresented(glog).empty();
+    }
+
+    SimulatedDesktop desktop;
+    glogRec *glog;
+};
+
+// What a step of a drag comes to: another coordinate, and the picture of it.
+void DragStep(benchmark::State &state) {
+    short const kNumber = 1;
+    Page page;
+    Glog::From(page.glog).DescribeItem(kNumber, {0, 0, 238, 224});
+    ThreeDPane *const cube =
+        ThreeDPane::NewThreeDPane(page.glog, kNumber, -20.0, {1.2, 1.8, -5.5}, 0.16, {7, 7, 7, 7});
+    page.Show();
+    double along = -1.0;
+    for (auto _ : state) {
+        along = along >= 1.0 ? -1.0 : along + 0.125;
+        cube->SetOneCoordinate(kAxisX, along);
+        if (!page.Shown())
+            state.SkipWithError("nothing has been shown");
+    }
+}
+BENCHMARK(DragStep)->Name("Panner/drag step");
+
+class Waves : public GraphData {
+public:
+    explicit Waves(int count_)
+        : count(count_) {}
+    int CountPoints() override { return count; }
+    GraphDataPoint GetPoint(int index) override {
+        return {index, static_cast<int>(1000.0 * std::sin(index * 0.37) * std::cos(index * 0.0011))};
+    }
+
+private:
+    int count;
+};
+
+void RepaintGraph(benchmark::State &state) {
+    int const points = static_cast<int>(state.range(0));
+    Page page;
+    GraphPaneResRec record = {GraphPaneResRec::kKind, {0, 0, 300, 600}};
+    GraphPane *const graph = new GraphPane(page.glog, 1, &record);
+    graph->SetGraphData(new Waves(points));
+    graph->SetupHorizontalAxis({0, points, points / 8, 0, 0});
+    graph->SetupVerticalAxis({-1100, 1100, 500, 0, 0});
+    page.Show();
+    for (auto _ : state) {
+        graph->Inval();
+        if (!page.Shown())
+            state.SkipWithError("nothing has been shown");
+    }
+}
+BENCHMARK(RepaintGraph)->Name("Graph/repaint")->Arg(kFewPoints)->Arg(kManyPoints);
+
+void UnseenProgress(benchmark::State &state) {
+    Page page;
+    ProgressBarPane *const bar = new ProgressBarPane(page.glog, 1);
+    Rect box = {10, 10, 22, 610};
+    bar->SetBox(&box);
+    bar->SetProgress(kGreatest / 2, kGreatest);
+    page.Show();
+    long long step = 0;
+    for (auto _ : state) {
+        step = (step + 1) % 1000;
+        bar->SetProgress(kGreatest / 2 + step, kGreatest);
+        if (page.Shown())
+            state.SkipWithError("something has been redrawn");
+    }
+}
+BENCHMARK(UnseenProgress)->Name("Progress/unseen step");
+
+} // namespace
