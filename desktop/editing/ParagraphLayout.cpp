@@ -125,13 +125,16 @@ void ParagraphLayout::MeasureLines(StyleRuns::List const &runs, Room const &room
             ascent = std::max(ascent, metrics.ascent);
             descent = std::max(descent, metrics.descent);
         }
-        PangoRectangle logical;
-        pango_layout_line_get_extents(pangoLine, nullptr, &logical);
+        PangoRectangle ink, logical;
+        pango_layout_line_get_extents(pangoLine, &ink, &logical);
         line.width = std::max(Pixels(logical.width), 0);
         line.left = ShapedText::LineStart(line.width, room.width, room.alignment, line.rightToLeft);
         line.top = top;
         line.height = std::max(ascent + descent, 1);
         line.baseline = top + ascent;
+        // Finer pixels may round outward once more, and a line below the text is no ink.
+        line.inkTop = std::min(line.baseline + Pixels(ink.y) - 1, line.top);
+        line.inkBottom = std::max(line.baseline + Pixels(ink.y + ink.height) + 1, line.top + line.height);
         top += line.height;
         lines.push_back(line);
     }
@@ -311,16 +314,8 @@ std::size_t ParagraphLayout::DeletionStart(std::size_t unit) const {
 
 // Drawing
 
-void ParagraphLayout::Draw(cairo_t *context, int h, int v, int top, int bottom) const {
-    // Accents and tails may reach into the neighbouring lines.
-    for (std::size_t i = 0; i < lines.size(); ++i) {
-        Line const &line = lines[i];
-        if (v + line.top - line.height >= bottom)
-            return;
-        if (v + line.top + 2 * line.height <= top)
-            continue;
-        cairo_move_to(context, h + line.left, v + line.baseline);
-        pango_cairo_show_layout_line(context, PangoLine(i));
-    }
+void ParagraphLayout::DrawLine(cairo_t *context, std::size_t line, int h, int v) const {
+    cairo_move_to(context, h + lines[line].left, v + lines[line].baseline);
+    pango_cairo_show_layout_line(context, PangoLine(line));
     cairo_new_path(context);
 }

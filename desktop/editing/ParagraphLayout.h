@@ -27,6 +27,7 @@ public:
         std::size_t start, end; // units; a space where the line was broken is in it
         int top, height, baseline;
         int left, width;
+        int inkTop, inkBottom; // as far as accents and tails reach
         bool rightToLeft;
     };
     typedef std::pair<int, int> Range; // from, to
@@ -68,9 +69,9 @@ public:
     // Whether the paragraph is written from right to left.
     bool IsRightToLeft() const { return lines.front().rightToLeft; }
 
-    // Draws the lines that meet the pixels from `top` to `bottom`; text without a colour of its own takes the
+    // Draws the line, in a box that begins at the place; text without a colour of its own takes the
     // context's.
-    void Draw(cairo_t *, int h, int v, int top, int bottom) const;
+    void DrawLine(cairo_t *, std::size_t line, int h, int v) const;
 
 private:
     void Make(StyleRuns::List const &, Room const &);

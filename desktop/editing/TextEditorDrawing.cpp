@@ -129,15 +129,16 @@ void TextEditor::DrawText(DrawingPort &port) {
         return;
     ParagraphIndex const &paragraphs = document.Paragraphs();
     std::size_t const last = LastVisible();
-    int const down = port.OriginV(), left = TextLeft() - port.OriginH();
+    int const left = TextLeft() - port.OriginH();
     for (std::size_t p = topParagraph; p <= last; ++p) {
         ParagraphLayout const &layout = flow.LayoutOf(p);
-        int const top = Coordinate(TextTop() + paragraphs.TopOf(p)) - down;
-        Rect const reach{Coordinate(top - flow.LineHeight()), shown.left,
-                         Coordinate(static_cast<long long>(top) + layout.Height() + flow.LineHeight()),
-                         shown.right};
-        if (port.Visible(reach))
-            layout.Draw(scope.Context(), left, top, shown.top, shown.bottom);
+        int const top = Coordinate(TextTop() + paragraphs.TopOf(p)) - port.OriginV();
+        for (std::size_t i = 0; i < layout.Lines().size(); ++i) {
+            ParagraphLayout::Line const &line = layout.Lines()[i];
+            if (port.Visible({Coordinate(top + line.inkTop), shown.left, Coordinate(top + line.inkBottom),
+                              shown.right}))
+                layout.DrawLine(scope.Context(), i, left, top);
+        }
     }
 }
 
