@@ -79,6 +79,8 @@ AMOUNTS = (
     Amount("click on the lowest of 1,000 panes", "Click/panes/1000/manual_time", "us", 1e3),
     Amount("shown beyond 1 of 10,000 buttons", "Toggle/group/10000", "px", 1, 0, "beyond"),
     Amount("shown beyond 1 of 10,000 panes", "Toggle/panes/10000", "px", 1, 0, "beyond"),
+    Amount("40 tabs fitted into a width", "Tabs/fit", "us", 1e3, None, "cpu_time"),
+    Amount("40 tabs fitted and repainted", "Tabs/fit and repaint", "us", 1e3, None, "cpu_time"),
     Amount("repaint of a list of 600 x 400", "List/repaint/1000000", "us", 1e3, None, "cpu_time"),
     Amount("click to listener of a list", "List/click/1000000/manual_time", "us", 1e3),
     Amount("set count, a row", "List/set count/manual_time", "ns", 1, 10, "perRow"),

@@ -5,6 +5,7 @@
 //     peer_NAME memory BOXES      the resident memory with so many check boxes
 //     peer_NAME list SERVER       steps through a list of labels
 //     peer_NAME table SERVER      shows, scrolls and clicks a list of 1,000,000 rows
+//     peer_NAME tabs SERVER       gives a row of 40 tabs other widths
 //
 // Times are nanoseconds of the processor, of the program and the server together: so neither what else runs
 // on the machine counts, nor a wait for the next frame or for a press that is shown for a while, and work
@@ -13,6 +14,7 @@
 #include "bench/peers/PeerForm.h"
 #include "bench/peers/PeerList.h"
 #include "bench/peers/PeerTable.h"
+#include "bench/peers/PeerTabs.h"
 #include <X11/Xlib.h>
 #include <X11/extensions/XTest.h>
 #include <cstdio>
@@ -28,6 +30,7 @@ namespace {
 
 int const kBuilds = 5, kRepaints = 15, kToggles = 40, kClicks = 8;
 int const kScrollSteps = 200, kScrollStep = 10; // pixels
+int const kTabWidths = 100;
 int const kTableSteps = 200, kTableJumps = 100;
 int const kStep = 37;                // from box to box; has no factor in common with their number
 int const kPressH = 6, kPressV = 11; // within a check box: on its mark in each of the toolkits
@@ -175,6 +178,19 @@ void MeasureList(PeerList &list) {
         Time("scroll-step", [&] { list.ScrollTo(i * kScrollStep); });
 }
 
+// Wide and narrow in turn, so that each width asks for other tabs than the one before.
+int TabWidth(int i) {
+    int const range = PeerTabs::kWidest - PeerTabs::kNarrowest;
+    return PeerTabs::kNarrowest + i * 617 % range;
+}
+
+void MeasureTabs(PeerTabs &tabs) {
+    tabs.Show();
+    Settle(tabs);
+    for (int i = 1; i <= kTabWidths; ++i)
+        Time("tabs-width", [&] { tabs.SetWidth(TabWidth(i)); });
+}
+
 // Rows far apart, and none twice.
 int RandomRow(int i) { return static_cast<int>(i * 382467LL % (PeerTable::kRows - PeerTable::kHeight)); }
 
@@ -218,6 +234,10 @@ int main(int argc, char **argv) {
     argv[1] = nullptr;
     if (what == "list") {
         MeasureList(*std::unique_ptr<PeerList>(NewPeerList(argc, argv)));
+        return EXIT_SUCCESS;
+    }
+    if (what == "tabs") {
+        MeasureTabs(*std::unique_ptr<PeerTabs>(NewPeerTabs(argc, argv)));
         return EXIT_SUCCESS;
     }
     if (what == "table") {

@@ -38,6 +38,7 @@ ROWS = (
     Row("million rows: to another", "table-jump", "us", 1e3, AHEAD),
     Row("million rows: click", "table-click", "us", 1e3, AHEAD_OR_NEAR),
     Row("million rows: first frame", "table-first-frame", "us", 1e3, AHEAD),
+    Row("40 tabs in another width", "tabs-width", "us", 1e3, AHEAD),
     Row("first build of the program", "first-build", "us", 1e3),
     Row("first build and frame", "first-frame", "us", 1e3),
 )
@@ -58,7 +59,7 @@ def measure(program, *arguments):
 
 def run_round(directory, peer, server, values):
     program = os.path.join(directory, f"peer_{peer}")
-    for what in ("window", "offscreen", "list", "table"):
+    for what in ("window", "offscreen", "list", "table", "tabs"):
         for name, measured in measure(program, what, server).items():
             # The median of a run counts once, so that no run counts for more than another.
             values.setdefault((peer, name), []).append(statistics.median(measured))
