@@ -40,7 +40,7 @@ bool DescribeTabs(GlogPane &pane, JsonLine &line) {
     int hidden = 0;
     for (int i = 0; i < count; ++i)
         hidden += tabs->TabIsVisible(i) ? 0 : 1;
-    line.Integer("selected", selected).Integer("items", count).Integer("hidden", hidden);
+    line.Integer("selectedItem", selected).Integer("items", count).Integer("hidden", hidden);
     if (selected >= 0 && selected < count)
         line.Text("name", tabs->GetItemName(selected));
     return true;

@@ -106,5 +106,5 @@ TEST_F(TabItemsTest, TheDumpTellsTheSelectedTab) {
     TabPane *const tabs = LoadTabs(kNames + "<Selected>1</Selected><FitToRect>1</FitToRect>");
     tabs->FitIntoRect({10, 20, 27, 60});
     std::string const dump = Dump(tabs->GetGlog());
-    EXPECT_TRUE(Holds(dump, "\"selected\":1,\"items\":3,\"hidden\":3,\"name\":\"Chords\"")) << dump;
+    EXPECT_TRUE(Holds(dump, "\"selectedItem\":1,\"items\":3,\"hidden\":3,\"name\":\"Chords\"")) << dump;
 }
