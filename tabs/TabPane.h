@@ -162,6 +162,7 @@ private:
     bool TryToFit(Rect const &target, bool alignRight, int &overflow, bool force);
     bool FitsNarrower(Rect const &target, bool alignRight);
     bool FitsWithSmallerText(Rect const &target, bool alignRight);
+    int CountToHide(Rect const &target);
     void HideUntilItFits(Rect const &target, bool alignRight);
 
     // Drawing

@@ -195,15 +195,29 @@ bool TabPane::FitsWithSmallerText(Rect const &target, bool alignRight) {
         int overflow = 0;
         if (TryToFit(target, alignRight, overflow, false))
             return true;
-        SetTextDrawingFlags(flags);
+        textDrawingFlags = flags; // laid out where it is tried
     }
     return false;
 }
 
+// How many items have to be hidden, by the layout that hides the fewest: each step only takes the last tab
+// off the row.
+int TabPane::CountToHide(Rect const &target) {
+    DemandItemRects();
+    int const room = target.right - target.left - TabMeasures::kOverflowWidth;
+    int hidden = 1;
+    while (hidden < CountItems() &&
+           itemRects[Index(CountItems() - hidden - 1)].right - itemRects[0].left > room)
+        ++hidden;
+    return hidden;
+}
+
 // Names are full and of plain size again. The box is taken even if nothing could be hidden any more.
 void TabPane::HideUntilItFits(Rect const &target, bool alignRight) {
-    SetTextDrawingFlags(kOverflow);
+    textDrawingFlags = kOverflow;
     hiddenCount = 1;
+    itemRects.clear();
+    hiddenCount = CountToHide(target);
     int overflow = 0;
     while (!TryToFit(target, alignRight, overflow, hiddenCount >= CountItems()) && hiddenCount < CountItems())
         ++hiddenCount;

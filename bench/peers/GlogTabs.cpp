@@ -7,6 +7,8 @@
 
 namespace {
 
+short const kRowHeight = 17; // which is what tabs have
+
 class GlogTabs : public PeerTabs {
 public:
     GlogTabs()
@@ -17,7 +19,7 @@ public:
         std::vector<TabPane::Item> items;
         for (int i = 0; i < kTabs; ++i)
             items.push_back(TabPane::Item(UString(NameOf(i).c_str(), UString::kByteEncoding1)));
-        tabs = new TabPane(glog, Rect{0, 0, kHeight, kWidest}, items, 0);
+        tabs = new TabPane(glog, Rect{0, 0, kRowHeight, kWidest}, items, 0);
         Rect place = {0, 0, kHeight, kWidest};
         PositionGlog(glog, &place, false);
         desktop.FinishGlog(glog);

@@ -218,7 +218,7 @@ TEST_F(TabPaneFittingTest, TriesEachWayOnce) {
     ScriptedTabs *const pane = MakeScripted();
     pane->FitIntoRect(Target(100));
     EXPECT_EQ(pane->tried, (std::vector<int>{kPlain, kCondensed, kSize10, kCondensed | kSize10, kSize9,
-                                             kCondensed | kSize9, kShort, kShort | kCondensed, kPlain}));
+                                             kCondensed | kSize9, kShort, kPlain}));
 }
 
 TEST_F(TabPaneFittingTest, ShortAndCondensedTogetherAreNeverTaken) {
