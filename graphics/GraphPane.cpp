@@ -3,7 +3,6 @@
 #include "graphics/PixelLine.h"
 #include "graphics/WholeNumber.h"
 #include "host/NamedColors.h"
-#include "host/OSPath.h"
 #include "host/OSPort.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
@@ -199,16 +198,14 @@ void GraphPane::DrawLineThroughPoints() {
     OSPort *const port = OSPort::GetCurrent();
     port->SetLineWidth(kLineWidth);
     port->SetForeColor(kLineColor);
-    OSPath path;
-    PixelLine line(path);
+    PixelLine line;
     int const count = graphData->CountPoints();
     for (int i = 0; i < count; ++i) {
         int h = 0, v = 0;
         GraphDataPointToCoords(graphData->GetPoint(i), h, v);
         line.Add(h, v);
     }
-    line.Finish();
-    port->StrokePath(path);
+    line.Stroke(*port);
 }
 
 void GraphPane::DrawDataPoint(int, int, int) {}

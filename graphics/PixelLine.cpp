@@ -1,10 +1,15 @@
 #include "graphics/PixelLine.h"
 #include "host/OSPath.h"
+#include "host/OSPort.h"
 #include <algorithm>
 #include <array>
 
-PixelLine::PixelLine(OSPath &target)
-    : path(target) {}
+namespace {
+
+std::size_t const kWhole = 256; // points that are stroked in one piece
+std::size_t const kPiece = 12;  // points of a piece of a longer line
+
+} // namespace
 
 void PixelLine::Add(int newH, int v) {
     if (count > 0 && newH == h && v == last.v)
@@ -12,7 +17,7 @@ void PixelLine::Add(int newH, int v) {
     if (count > 0 && newH != h)
         EndColumn();
     h = newH;
-    Kept const point = {count, v};
+    InColumn const point = {count, v};
     if (count == 0)
         first = second = top = bottom = last = point;
     if (count == 1)
@@ -27,23 +32,39 @@ void PixelLine::Add(int newH, int v) {
 }
 
 void PixelLine::EndColumn() {
-    std::array<Kept, 6> kept = {first, second, top, bottom, beforeLast, last};
-    std::sort(kept.begin(), kept.end(), [](Kept const &a, Kept const &b) { return a.index < b.index; });
+    std::array<InColumn, 6> points = {first, second, top, bottom, beforeLast, last};
+    std::sort(points.begin(), points.end(),
+              [](InColumn const &a, InColumn const &b) { return a.index < b.index; });
+    std::size_t const start = kept.size();
     int former = -1;
-    for (Kept const &point : kept) {
+    for (InColumn const &point : points) {
         if (point.index == former)
             continue;
         former = point.index;
-        if (begun)
-            path.AddLine(h, point.v);
-        else
-            path.CreateSubpath(h, point.v);
-        begun = true;
+        kept.push_back({h, point.v, false, start});
     }
+    kept.back().endsColumn = true;
     count = 0;
 }
 
-void PixelLine::Finish() {
+void PixelLine::Stroke(OSPort &port) {
     if (count > 0)
         EndColumn();
+    std::size_t start = 0;
+    for (std::size_t i = 0; i < kept.size() && kept.size() > kWhole; ++i) {
+        if (!kept[i].endsColumn || i - start < kPiece)
+            continue;
+        StrokePiece(port, start, i);
+        start = kept[i].columnStart;
+    }
+    if (!kept.empty())
+        StrokePiece(port, start, kept.size() - 1);
+}
+
+void PixelLine::StrokePiece(OSPort &port, std::size_t from, std::size_t to) const {
+    OSPath path;
+    path.CreateSubpath(kept[from].h, kept[from].v);
+    for (std::size_t i = from + 1; i <= to; ++i)
+        path.AddLine(kept[i].h, kept[i].v);
+    port.StrokePath(path);
 }

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cairo.h>
 #include <cmath>
+#include <cstddef>
+#include <cstring>
 #include <utility>
 #include <vector>
 
@@ -38,7 +40,8 @@ public:
             unsigned char const *const end = row + area.Width();
             unsigned char const *x = row;
             while ((x = std::find_if(x, end, [](unsigned char pixel) { return pixel != 0; })) != end) {
-                unsigned char const *runEnd = std::find(x, end, static_cast<unsigned char>(0));
+                void const *const gap = std::memchr(x, 0, static_cast<std::size_t>(end - x));
+                unsigned char const *const runEnd = gap ? static_cast<unsigned char const *>(gap) : end;
                 runs.push_back({area.left + static_cast<int>(x - row), y,
                                 area.left + static_cast<int>(runEnd - row), y + 1});
                 x = runEnd;

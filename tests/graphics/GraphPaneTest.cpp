@@ -364,17 +364,29 @@ class PixelLineTest : public GraphPaneTest {
 protected:
     typedef std::vector<std::uint32_t> Pixels;
 
-    // What the window shows when the path is stroked as graphs do.
-    Pixels Stroked(OSPath const &path) {
+    // What the window shows when the action draws as graphs do.
+    template <class Action> Pixels Drawn(Action const &stroke) {
         Surface &surface = *Glog::From(glog).Pixels();
         Glog::From(glog).DamageAll();
         UpdateGlog(glog);
         SetPortToGlog(glog);
         OSPort::Current().SetLineWidth(2.0);
         OSPort::Current().SetForeColor(OS::RGBAColor(0.5, 0.5, 0.9, 1.0));
-        OSPort::Current().StrokePath(path);
+        stroke();
         return Pixels(surface.Pixels(), surface.Pixels() + surface.Width() * surface.Height());
     }
+    Pixels DrawnWhole(std::vector<Point> const &points) {
+        return Drawn([&] {
+            OSPath path;
+            AddAll(path, points);
+            OSPort::Current().StrokePath(path);
+        });
+    }
+    Pixels DrawnReduced(std::vector<Point> const &points) {
+        return Drawn([&] { Stroke(points); });
+    }
+    // Where two pieces meet, a pixel that both cover in part may be a little denser.
+    static constexpr int kUnseen = 16; // of 255
     // The largest one of any component of any pixel, of 255.
     static int Difference(Pixels const &a, Pixels const &b) {
         int largest = 0;
@@ -389,11 +401,11 @@ protected:
         for (std::size_t i = 1; i < points.size(); ++i)
             path.AddLine(points[i].h, points[i].v);
     }
-    static void Reduce(OSPath &path, std::vector<Point> const &points) {
-        PixelLine line(path);
+    static void Stroke(std::vector<Point> const &points) {
+        PixelLine line;
         for (Point p : points)
             line.Add(p.h, p.v);
-        line.Finish();
+        line.Stroke(OSPort::Current());
     }
 };
 
@@ -407,15 +419,29 @@ TEST_F(PixelLineTest, LooksAsIfItWentThroughAllPoints) {
         for (int trial = 0; trial < 20; ++trial) {
             std::vector<Point> points;
             int const perColumn = 1 + trial;
-            for (int i = 0; i < 60 * perColumn; ++i)
+            for (int i = 0; i < 40 * perColumn; ++i)
                 points.push_back({static_cast<short>(20 + random() % (trial % 2 ? 150 : 12)),
                                   static_cast<short>(10 + 5 * (i / perColumn))});
-            OSPath all, reduced;
-            AddAll(all, points);
-            Reduce(reduced, points);
-            ASSERT_LE(Difference(Stroked(all), Stroked(reduced)), 1)
+            ASSERT_LE(Difference(DrawnWhole(points), DrawnReduced(points)), 1)
                 << "scale " << scale << ", trial " << trial;
         }
+    }
+}
+
+TEST_F(PixelLineTest, InPiecesLooksAsItDoesWhole) {
+    for (double scale : {1.0, 2.0}) {
+        desktop.SetScale(scale);
+        Show();
+        std::vector<Point> points;
+        for (int i = 0; i < 6000; ++i)
+            points.push_back({static_cast<short>(100 + 80 * std::sin(i * 0.37) * std::cos(i * 0.011)),
+                              static_cast<short>(10 + i / 20)});
+        Pixels const whole = DrawnWhole(points), pieces = DrawnReduced(points);
+        int different = 0;
+        for (std::size_t i = 0; i < whole.size(); ++i)
+            different += Difference({whole[i]}, {pieces[i]}) > 1;
+        EXPECT_LE(Difference(whole, pieces), kUnseen) << scale;
+        EXPECT_LE(different, 20) << "of " << whole.size() << " pixels, where pieces meet";
     }
 }
 
@@ -430,7 +456,7 @@ TEST_F(PixelLineTest, KeepsSixPointsOfAColumn) {
     Show();
     graph->marks.clear();
     Lines const drawn = Only("StrokePath", Traced(*graph, [&] { graph->DrawData(nullptr); }));
-    EXPECT_LE(PointsIn(drawn), 1200u);
+    EXPECT_LE(PointsIn(drawn), 2000u) << "with those in which pieces overlap";
     EXPECT_GE(PointsIn(drawn), 400u);
     EXPECT_EQ(graph->marks.size(), 100000u) << "every point may have a mark";
 }
@@ -439,9 +465,7 @@ TEST_F(PixelLineTest, LeavesOutPointsThatFollowEachOtherOnOnePixel) {
     Show();
     EXPECT_EQ(Traced(*Made(),
                      [] {
-                         OSPath path;
-                         Reduce(path, {{5, 5}, {5, 5}, {6, 5}, {6, 5}, {6, 7}});
-                         OSPort::Current().StrokePath(path);
+                         Stroke({{5, 5}, {5, 5}, {6, 5}, {6, 5}, {6, 7}});
                      }),
               Traced(*Made(), [] {
                   OSPath path;
