@@ -104,7 +104,8 @@ public:
     virtual void SetBaselineOffset(int) = 0; // pixels by which text stands lower
 
     // Style of the selection. The mask says which fields count: 7 family, face and size; 15 those and the
-    // colour.
+    // colour. Without a selection, of what is typed next; in an engine that was not created as styled, and in
+    // an empty text, of all text.
     virtual void GetStyle(unsigned int mask, OS::TextStyle &) const = 0;
     virtual void SetStyle(unsigned int mask, OS::TextStyle const &) = 0;
     // Runs of equal style, from 0; each goes up to its end, exclusive.

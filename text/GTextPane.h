@@ -230,7 +230,7 @@ private:
 // that an input method composes, straight to the engine.
 class GTextPane::Client : public OS::TextEditClient {
 public:
-    explicit Client(GTextPane *);
+    explicit Client(GTextPane *); // of the field, which outlives what it is asked
     // OS::TextEditClient
     DispatchPath TextEditClient_HandleTextEntry(OSTextEdit &, EventRecordAdapter *, UString const &) override;
     DispatchPath TextEditClient_HandleTextAction(OSTextEdit &, EventRecordAdapter *,

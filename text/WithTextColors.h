@@ -7,7 +7,7 @@
 // field may be gone by then.
 class GTextPane::WithTextColors {
 public:
-    explicit WithTextColors(GTextPane &pane) {
+    explicit WithTextColors(GTextPane &pane) { // the pane that is about to work
         if (pane.ColorsApply())
             pane.SetupColors();
     }
