@@ -7,7 +7,8 @@
 // field may be gone by then.
 class GTextPane::WithTextColors {
 public:
-    explicit WithTextColors(GTextPane &pane) { // the pane that is about to work
+    // For the pane that is about to work.
+    explicit WithTextColors(GTextPane &pane) {
         if (pane.ColorsApply())
             pane.SetupColors();
     }
