@@ -32,9 +32,9 @@ protected:
     // and is disposed of otherwise.
     bool ModalGlogInit(short resourceID);
 
-    short GetOKItemNum() { return okItem; }
-    short GetCancelItemNum() { return cancelItem; }
-    glogRec *GlogP() { return glog; } // null before ModalGlogInit; stays the object's
+    short GetOKItemNum() { return okItem; }         // the item that confirms
+    short GetCancelItemNum() { return cancelItem; } // the item that cancels
+    glogRec *GlogP() { return glog; }               // null before ModalGlogInit; stays the object's
     void DisableIdleChores() { idleChores = kDontRunIdleChores; } // while the dialog runs
 
     // Whether the item that was hit ends the dialog. By default the confirming one does if Read says so, the

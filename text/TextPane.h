@@ -24,7 +24,7 @@ public:
     TextPane(glogRec *, boost::shared_ptr<XMLLib::ContainerItem>, bool forPrinting);
     ~TextPane() override;
 
-    UString GetText() const { return text; }
+    UString GetText() const { return text; } // a copy
     // Invalidates the pane; where it is sized to its text, the layout item gets the new width. Without effect
     // for the text that it has.
     void SetText(const UString &);
@@ -32,8 +32,9 @@ public:
     // line breaks.
     int GetTextWidth() const;
 
+    // Where lines stand in the box. Setting it repaints nothing.
     TextSettings::Alignment GetAlignment() const { return alignment; }
-    void SetAlignment(TextSettings::Alignment newAlignment) { alignment = newAlignment; } // repaints nothing
+    void SetAlignment(TextSettings::Alignment newAlignment) { alignment = newAlignment; }
     // Which of the two colours the text has. Invalidates the pane if it changes.
     bool GetEnable() const { return enable; }
     void SetEnable(bool);
