@@ -107,7 +107,8 @@ private:
     void Present(std::vector<DeviceRect> const &);
     void MakeSurface();
     void ReportHit(int value);
-    int ClickFrom(GlogPane &topmost, EventRecordAdapter const &); // what the first that took it answered, or 0
+    int ClickFrom(GlogPane &topmost,
+                  EventRecordAdapter const &); // what the first that took it answered, or 0
     bool IsGrowCorner(Point) const;
     void GrowByDragging(Point start);
     void GrowTo(int newWidth, int newHeight);
