@@ -101,7 +101,8 @@ TEST_F(GalleryProgram, EndsWithOneForAnUnknownPage) {
         result.errors,
         "gallery: there is no page \"lay\"; there are push-buttons, labels, layout, help-tags, "
         "check-boxes, box-select, icon-buttons, small-buttons, scroll-bars, "
-        "scroll-pane, grid, lists, select-panes, text-fields, pop-up-menus, durations, tabs, modal-dialog\n");
+        "scroll-pane, grid, lists, select-panes, text-fields, static-text, pop-up-menus, durations, tabs, "
+        "modal-dialog, panner, envelope, pictures, zoom-and-progress\n");
 }
 
 TEST_F(GalleryProgram, EndsWithOneWhereThereAreNoPages) {
