@@ -5,6 +5,8 @@
 #include "host/TextLayout.h"
 #include "host/VelaDrawing.h"
 #include "tests/PaneTest.h"
+#include <algorithm>
+#include <memory>
 
 namespace {
 
@@ -196,7 +198,7 @@ TEST_F(StyledStringTest, DeletesTheTextThatItHadAndItsLast) {
 
 TEST_F(StyledStringTest, KeepsTheTextThatItIsGivenOnceMoreAndRedraws) {
     bool alive = false;
-    CountingPane *const pane = new CountingPane(glog, 3, false);
+    std::unique_ptr<CountingPane> const pane(new CountingPane(glog, 3, false)); // gone before `alive`
     StyledString *const text = new StyledString;
     text->Add(AutoPtr<StyledStringItem>(new WatchedPart(alive)));
     pane->AdoptStyledString(AutoPtr<StyledString>(text));
