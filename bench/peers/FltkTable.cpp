@@ -6,6 +6,7 @@
 #include <FL/Fl_Table.H>
 #include <FL/Fl_Window.H>
 #include <FL/fl_draw.H>
+#include <algorithm>
 #include <memory>
 
 namespace {
@@ -55,7 +56,10 @@ private:
         void Select(int row) {
             int const before = selected;
             selected = row;
-            redraw_range(before < row ? before : row, before < row ? row : before, 0, kColumns - 1);
+            // Fl_Table draws every cell of a range, also those that do not show.
+            bool const showed = before >= toprow && before <= botrow;
+            int const other = showed ? before : row;
+            redraw_range(std::min(other, row), std::max(other, row), 0, kColumns - 1);
         }
 
     protected:
