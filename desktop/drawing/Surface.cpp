@@ -1,12 +1,11 @@
 #include "desktop/drawing/Surface.h"
+#include "desktop/drawing/FreshMemory.h"
 #include <algorithm>
 #include <array>
 #include <cairo.h>
 #include <cstring>
 #include <fstream>
 #include <pixman.h>
-#include <sys/mman.h>
-#include <unistd.h>
 
 namespace {
 
@@ -19,23 +18,6 @@ constexpr std::array<unsigned char, 16> kPngStart = {0x89, 'P', 'N', 'G', '\r', 
                                                      0,    0,   0,   13,  'I',  'H',  'D',  'R'};
 constexpr std::size_t kPngSizeBytes = 8;
 
-// The system gives fresh memory page by page, at the first touch of each, which for a window's pixels takes
-// several times as long as getting them all at once. Where it cannot do that, nothing is lost.
-void GetPages(void *start, std::size_t bytes) {
-#ifdef MADV_POPULATE_WRITE
-    constexpr std::size_t kWorthwhile = std::size_t(256) << 10;
-    if (bytes < kWorthwhile)
-        return;
-    std::uintptr_t const page = static_cast<std::uintptr_t>(sysconf(_SC_PAGESIZE));
-    std::uintptr_t const address = reinterpret_cast<std::uintptr_t>(start);
-    std::uintptr_t const first = (address + page - 1) / page * page, end = (address + bytes) / page * page;
-    madvise(static_cast<char *>(start) + (first - address), end - first, MADV_POPULATE_WRITE);
-#else
-    static_cast<void>(start);
-    static_cast<void>(bytes);
-#endif
-}
-
 std::size_t PixelCount(int width, int height) {
     return static_cast<std::size_t>(width) * static_cast<std::size_t>(height);
 }
@@ -44,7 +26,7 @@ std::vector<std::uint32_t> NewPixels(int width, int height) {
     std::size_t const count = PixelCount(width, height);
     std::vector<std::uint32_t> pixels;
     pixels.reserve(count);
-    GetPages(pixels.data(), count * sizeof(std::uint32_t));
+    FreshMemory::GetPages(pixels.data(), count * sizeof(std::uint32_t));
     pixels.assign(count, kOpaqueBlack);
     return pixels;
 }
@@ -95,21 +77,9 @@ bool PngSizeIsSane(std::string const &path, std::string &error) {
 Surface::Surface(int width_, int height_)
     : width(std::max(width_, 1))
     , height(std::max(height_, 1))
-    , own(NewPixels(width, height))
-    , pixels(own.data())
-    , image(NewImage(pixels, width, height))
+    , pixels(NewPixels(width, height))
+    , image(NewImage(pixels.data(), width, height))
     , cairo(nullptr) {}
-
-Surface::Surface(std::uint32_t *memory, int width_, int height_)
-    : width(width_)
-    , height(height_)
-    , pixels(memory)
-    , image(NewImage(pixels, width, height))
-    , cairo(nullptr) {
-    std::size_t const count = PixelCount(width, height);
-    GetPages(pixels, count * sizeof(std::uint32_t));
-    std::fill_n(pixels, count, kOpaqueBlack);
-}
 
 Surface::~Surface() {
     if (cairo) {
@@ -121,20 +91,20 @@ Surface::~Surface() {
 
 cairo_surface_t *Surface::CairoSurface() {
     if (!cairo)
-        cairo = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(pixels),
+        cairo = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(pixels.data()),
                                                     CAIRO_FORMAT_ARGB32, width, height,
                                                     width * static_cast<int>(sizeof(std::uint32_t)));
     return cairo;
 }
 
 bool Surface::IsOpaque() const {
-    return std::all_of(pixels, pixels + PixelCount(width, height),
+    return std::all_of(pixels.begin(), pixels.end(),
                        [](std::uint32_t pixel) { return (pixel & kAlphaMask) == kAlphaMask; });
 }
 
 bool Surface::WritePng(std::string const &path, std::string &error) const {
     // Cairo only reads from the surface while it writes the file.
-    unsigned char *data = reinterpret_cast<unsigned char *>(pixels);
+    unsigned char *data = reinterpret_cast<unsigned char *>(const_cast<std::uint32_t *>(Pixels()));
     CairoSurfaceHolder view(
         cairo_image_surface_create_for_data(data, IsOpaque() ? CAIRO_FORMAT_RGB24 : CAIRO_FORMAT_ARGB32,
                                             width, height, width * static_cast<int>(sizeof(std::uint32_t))));

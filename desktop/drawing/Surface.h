@@ -16,21 +16,19 @@ class Surface {
 public:
     // Sizes below 1 are taken as 1. The pixels start opaque black.
     Surface(int width, int height);
-    // In memory of the caller's, which keeps it until the surface has gone; at least 1 x 1.
-    Surface(std::uint32_t *memory, int width, int height);
     ~Surface();
     Surface(Surface const &) = delete;
     Surface &operator=(Surface const &) = delete;
 
     int Width() const { return width; }
     int Height() const { return height; }
-    std::uint32_t *Pixels() { return pixels; }
-    std::uint32_t const *Pixels() const { return pixels; }
+    std::uint32_t *Pixels() { return pixels.data(); }
+    std::uint32_t const *Pixels() const { return pixels.data(); }
     std::uint32_t *Row(int y) {
-        return pixels + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
+        return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
     }
     std::uint32_t const *Row(int y) const {
-        return pixels + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
+        return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
     }
 
     pixman_image_t *PixmanImage() const { return image; }
@@ -48,8 +46,7 @@ public:
 
 private:
     int width, height;
-    std::vector<std::uint32_t> own; // empty in memory of the caller's
-    std::uint32_t *pixels;
+    std::vector<std::uint32_t> pixels;
     pixman_image_t *image;
     cairo_surface_t *cairo;
 };

@@ -77,8 +77,7 @@ void MenuPanel::PlaceBeside(MenuPanel const &parent, int item, ScreenRect const 
 
 void MenuPanel::MakeSurface(DeviceScale scale_) {
     scale = scale_;
-    int const width = std::max(scale.Edge(box.Width()), 1), height = std::max(scale.Edge(box.Height()), 1);
-    surface = window ? window->NewSurface(width, height) : std::make_unique<Surface>(width, height);
+    surface = std::make_unique<Surface>(scale.Edge(box.Width()), scale.Edge(box.Height()));
     port.SetSurface(surface.get(), scale);
     port.SetExtent(box.Width(), box.Height());
     DrawAll();

@@ -191,8 +191,7 @@ void Glog::SetMaxSize(int w, int h) {
 
 void Glog::MakeSurface() {
     port.SetSurface(nullptr, scale);
-    surface.reset(); // before the window gives another
-    surface = window->NewSurface(scale.Edge(width), scale.Edge(height));
+    surface.reset(new Surface(scale.Edge(width), scale.Edge(height)));
     port.SetSurface(surface.get(), scale);
     port.SetExtent(width, height);
     DamageAll();
@@ -345,8 +344,6 @@ void Glog::Present(std::vector<DeviceRect> const &rects) {
     WithOutline const outlined(*surface, scale, outline);
     WithOverlays const covered(*surface, menus);
     window->Present(*surface, rects.data(), rects.size());
-    if (outline.Shown() || !menus.empty())
-        window->Finish(); // before they are taken off again
 }
 
 void Glog::PresentAll() {

@@ -35,14 +35,10 @@ public:
     virtual int Height() const = 0;
     virtual Point ScreenPlace() const = 0; // of the content's top left
     virtual double Scale() const = 0;
-    // A surface that Present shows faster than others where the window system can give its own memory. Only
-    // one may be there at a time: let go of it before the next call, and before the window.
-    virtual std::unique_ptr<Surface> NewSurface(int deviceWidth, int deviceHeight);
     // Copies the rectangles of the surface to the screen. They may reach beyond the surface; what does is not
-    // copied. The surface that NewSurface gave may still be read from when the call returns: what is drawn on
-    // it then may be seen, until the next call shows all of it.
+    // copied. The screen may change only after the call has returned, but the surface is not read any more.
     virtual void Present(Surface const &, DeviceRect const *, std::size_t count) = 0;
-    // Returns when nothing is read from a presented surface any more.
+    // Returns when the screen shows all that was presented.
     virtual void Finish() {}
     // Lets an input method work at the place (content coordinates), or stops it.
     virtual void StartTextInput(Rect const &caret) = 0;

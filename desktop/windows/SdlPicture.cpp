@@ -1,10 +1,14 @@
 #include "desktop/windows/SdlPicture.h"
+#include "desktop/drawing/FreshMemory.h"
+#include "desktop/drawing/Surface.h"
+#include "desktop/windows/ShownPixels.h"
 #include <SDL.h>
 #include <SDL_syswm.h>
 #include <X11/Xutil.h>
 #include <X11/extensions/XShm.h>
 #include <sys/ipc.h>
 #include <sys/shm.h>
+#include <vector>
 
 static unsigned long const kRedMask = 0xFF0000, kGreenMask = 0xFF00, kBlueMask = 0xFF;
 static int const kPixelBits = 32, kPixelBytes = 4;
@@ -17,13 +21,16 @@ struct SdlPicture::Shared {
     XImage *image = nullptr;
     XShmSegmentInfo segment = {};
     bool attached = false;
-    unsigned long shown = 0; // number of the last request to the server that shows pixels
+    std::unique_ptr<ShownPixels> pixels;
+    std::vector<DeviceRect> changed; // of one call; kept for its memory
+    unsigned long shown = 0;         // number of the last request to the server that shows pixels
 
     ~Shared();
     bool FindWindow(SDL_Window *);
     bool MakeImage(int width, int height);
     bool MakeMemory();
     bool Attach();
+    void Put(DeviceRect const &);
 };
 
 SdlPicture::Shared::~Shared() {
@@ -78,8 +85,10 @@ bool SdlPicture::Shared::MakeMemory() {
         return false;
     void *const place = shmat(segment.shmid, nullptr, 0);
     bool const mapped = place != reinterpret_cast<void *>(-1);
-    if (mapped)
+    if (mapped) {
         segment.shmaddr = image->data = static_cast<char *>(place);
+        FreshMemory::GetPages(place, bytes);
+    }
     return mapped;
 }
 
@@ -112,6 +121,8 @@ std::unique_ptr<SdlPicture> SdlPicture::New(SDL_Window *window, int width, int h
     if (!usable)
         return nullptr;
     shared->context = XCreateGC(shared->display, shared->window, 0, nullptr);
+    shared->pixels.reset(
+        new ShownPixels(reinterpret_cast<std::uint32_t *>(shared->segment.shmaddr), width, height));
     return std::unique_ptr<SdlPicture>(new SdlPicture(std::move(shared)));
 }
 
@@ -119,10 +130,6 @@ SdlPicture::SdlPicture(std::unique_ptr<Shared> shared_)
     : shared(std::move(shared_)) {}
 
 SdlPicture::~SdlPicture() {}
-
-std::uint32_t *SdlPicture::Pixels() const {
-    return reinterpret_cast<std::uint32_t *>(shared->segment.shmaddr);
-}
 
 int SdlPicture::Width() const { return shared->image->width; }
 
@@ -133,18 +140,39 @@ static bool IsBehind(Display *display, unsigned long request) {
     return LastKnownRequestProcessed(display) < request;
 }
 
-void SdlPicture::Show(SDL_Rect const *rects, std::size_t count) {
+void SdlPicture::Shared::Put(DeviceRect const &rect) {
+    XShmPutImage(display, window, context, image, rect.left, rect.top, rect.left, rect.top,
+                 static_cast<unsigned int>(rect.Width()), static_cast<unsigned int>(rect.Height()), False);
+}
+
+void SdlPicture::Keep(Surface const &surface, DeviceRect const *rects, std::size_t count) {
+    shared->changed.clear();
+    for (DeviceRect const *rect = rects; rect != rects + count; ++rect)
+        shared->pixels->Take(surface, *rect, shared->changed);
+}
+
+void SdlPicture::Show(Surface const &surface, DeviceRect const *rects, std::size_t count) {
+    Keep(surface, rects, count);
+    if (shared->changed.empty())
+        return;
     Display *const display = shared->display;
     bool const behind = IsBehind(display, shared->shown);
-    for (SDL_Rect const *rect = rects; rect != rects + count; ++rect)
-        XShmPutImage(display, shared->window, shared->context, shared->image, rect->x, rect->y, rect->x,
-                     rect->y, static_cast<unsigned int>(rect->w), static_cast<unsigned int>(rect->h), False);
+    for (DeviceRect const &rect : shared->changed)
+        shared->Put(rect);
     shared->shown = NextRequest(display) - 1;
     if (behind)
         XSync(display, False);
     else
         XFlush(display);
 }
+
+void SdlPicture::ShowAll() {
+    shared->Put({0, 0, Width(), Height()});
+    shared->shown = NextRequest(shared->display) - 1;
+    XFlush(shared->display);
+}
+
+void SdlPicture::Forget() { shared->pixels->ForgetAll(); }
 
 void SdlPicture::Finish() {
     if (IsBehind(shared->display, shared->shown))

@@ -1,11 +1,11 @@
 // The pixels of a window on an X server, in memory that the server reads as well.
 #pragma once
+#include "desktop/drawing/DeviceScale.h"
 #include <cstddef>
-#include <cstdint>
 #include <memory>
 
-struct SDL_Rect;
 struct SDL_Window;
+class Surface;
 
 // SDL has such memory too, but waits for the server's answer each time some of it is shown. Here a program
 // goes on while the server copies: at a click that wait would cost as much as all the rest.
@@ -18,13 +18,19 @@ public:
     SdlPicture(SdlPicture const &) = delete;
     SdlPicture &operator=(SdlPicture const &) = delete;
 
-    std::uint32_t *Pixels() const;
     int Width() const;
     int Height() const;
 
-    // Has the server copy the rectangles, which lie within the picture, to the window. What is drawn before
-    // it has done so may be seen already. It is never behind by more than one call.
-    void Show(SDL_Rect const *, std::size_t count);
+    // Takes over what has changed within the rectangles from the surface, which must be as large as the
+    // picture, as the rectangles must lie within it, and has the server copy that to the window. The surface
+    // is not read any more when the call returns. The server is never behind by more than one call.
+    void Show(Surface const &, DeviceRect const *, std::size_t count);
+    // The same for a window that is not on the screen yet; ShowAll is to follow.
+    void Keep(Surface const &, DeviceRect const *, std::size_t count);
+    // Has the server copy all that was taken over.
+    void ShowAll();
+    // The server has lost what it showed.
+    void Forget();
     // Returns when the server has copied all that is to be shown.
     void Finish();
 

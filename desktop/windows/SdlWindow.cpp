@@ -115,12 +115,10 @@ void SdlWindow::Show() {
     if (!keptHidden)
         return;
     keptHidden = false;
-    if (!picture) {
+    if (picture)
+        picture->ShowAll();
+    else
         SDL_UpdateWindowSurface(window);
-        return;
-    }
-    SDL_Rect const all = {0, 0, picture->Width(), picture->Height()};
-    picture->Show(&all, 1);
 }
 
 void SdlWindow::Hide() { SDL_HideWindow(window); }
@@ -169,36 +167,34 @@ static void CopyPixels(Surface const &from, DeviceRect const &rect, SDL_Surface 
                       from.Width() * kSurfacePixelBytes, to.format->format, target, to.pitch);
 }
 
-std::unique_ptr<Surface> SdlWindow::NewSurface(int deviceWidth, int deviceHeight) {
-    picture = SdlPicture::New(window, deviceWidth, deviceHeight);
-    if (!picture)
-        return PlatformWindow::NewSurface(deviceWidth, deviceHeight);
-    return std::make_unique<Surface>(picture->Pixels(), deviceWidth, deviceHeight);
-}
-
-bool SdlWindow::IsInPicture(Surface const &surface) const {
-    return picture && surface.Pixels() == picture->Pixels();
+// Another one for a surface of another size. A server that refused once is not asked again.
+bool SdlWindow::HasPictureFor(Surface const &surface) {
+    if (picture && (picture->Width() != surface.Width() || picture->Height() != surface.Height()))
+        picture.reset();
+    if (!picture && sharesMemory) {
+        picture = SdlPicture::New(window, surface.Width(), surface.Height());
+        sharesMemory = picture != nullptr;
+    }
+    return picture != nullptr;
 }
 
 // A rectangle that lies wholly outside the window would be refused by the X server, which ends the program:
 // nothing but what both have goes there. They differ between a resize and the surface that answers it.
-void SdlWindow::CopyToSdl(Surface const &surface) {
+void SdlWindow::PresentBySdl(Surface const &surface) {
     SDL_Surface *const screen = SDL_GetWindowSurface(window);
-    if (screen == nullptr) {
-        updated.clear(); // the server is out of memory for pictures: the next exposure tries again
-        return;
-    }
-    DeviceRect const common = DeviceRect{0, 0, screen->w, screen->h};
-    std::size_t kept = 0;
-    for (SDL_Rect const &wanted : updated) {
-        DeviceRect const rect =
-            common.Intersected({wanted.x, wanted.y, wanted.x + wanted.w, wanted.y + wanted.h});
+    if (screen == nullptr)
+        return; // the server is out of memory for pictures: the next exposure tries again
+    DeviceRect const common = {0, 0, screen->w, screen->h};
+    std::vector<SDL_Rect> copied;
+    for (DeviceRect const &wanted : updated) {
+        DeviceRect const rect = common.Intersected(wanted);
         if (rect.Empty())
             continue;
         CopyPixels(surface, rect, *screen);
-        updated[kept++] = {rect.left, rect.top, rect.Width(), rect.Height()};
+        copied.push_back({rect.left, rect.top, rect.Width(), rect.Height()});
     }
-    updated.resize(kept);
+    if (!copied.empty() && !keptHidden)
+        SDL_UpdateWindowSurfaceRects(window, copied.data(), static_cast<int>(copied.size()));
 }
 
 void SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::size_t count) {
@@ -207,18 +203,22 @@ void SdlWindow::Present(Surface const &surface, DeviceRect const *rects, std::si
     for (DeviceRect const *rect = rects; rect != rects + count; ++rect) {
         DeviceRect const part = rect->Intersected(all);
         if (!part.Empty())
-            updated.push_back({part.left, part.top, part.Width(), part.Height()});
+            updated.push_back(part);
     }
-    bool const inPicture = IsInPicture(surface);
-    if (!inPicture)
-        CopyToSdl(surface);
     keptHidden = (SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) != 0;
-    if (updated.empty() || keptHidden)
+    if (updated.empty())
         return;
-    if (inPicture)
-        picture->Show(updated.data(), updated.size());
+    if (!HasPictureFor(surface))
+        PresentBySdl(surface);
+    else if (keptHidden)
+        picture->Keep(surface, updated.data(), updated.size());
     else
-        SDL_UpdateWindowSurfaceRects(window, updated.data(), static_cast<int>(updated.size()));
+        picture->Show(surface, updated.data(), updated.size());
+}
+
+void SdlWindow::Lost() {
+    if (picture)
+        picture->Forget();
 }
 
 void SdlWindow::Finish() {

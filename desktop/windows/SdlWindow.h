@@ -5,7 +5,6 @@
 #include <memory>
 #include <vector>
 
-struct SDL_Rect;
 struct SDL_Window;
 class SdlPicture;
 class SdlWindowSystem;
@@ -37,6 +36,8 @@ public:
     void CorrectPlace();
     // Looks at the size that the window has come to; whether it is another one in logical pixels.
     bool TakeSize();
+    // The server has lost pixels of the window.
+    void Lost();
     // Keeps the logical size, and so asks for another one in device pixels.
     void SetScale(DeviceScale);
 
@@ -52,7 +53,6 @@ public:
     int Height() const override { return height; }
     Point ScreenPlace() const override;
     double Scale() const override { return scale.Factor(); }
-    std::unique_ptr<Surface> NewSurface(int deviceWidth, int deviceHeight) override;
     void Present(Surface const &, DeviceRect const *, std::size_t count) override;
     void Finish() override;
     void StartTextInput(Rect const &caret) override;
@@ -67,8 +67,8 @@ private:
         }
     };
     void ApplySizeLimits();
-    bool IsInPicture(Surface const &) const;
-    void CopyToSdl(Surface const &);
+    bool HasPictureFor(Surface const &);
+    void PresentBySdl(Surface const &);
     static int WholeLogicalPixels(DeviceScale, int device, int current);
 
     SdlWindowSystem &system;
@@ -79,7 +79,8 @@ private:
     SizeLimits limits;
     bool placePending; // `placeH` and `placeV` wait for the frame
     int placeH, placeV;
-    std::unique_ptr<SdlPicture> picture; // of the surface that was given; null: SDL's is shown
+    std::unique_ptr<SdlPicture> picture; // null: not yet, or SDL's is shown
+    bool sharesMemory = true;            // as far as is known
     bool keptHidden = false;             // there are pixels of ours that could not be shown yet
-    std::vector<SDL_Rect> updated;       // of one Present; kept for its memory
+    std::vector<DeviceRect> updated;     // of one Present; kept for its memory
 };

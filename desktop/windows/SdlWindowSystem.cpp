@@ -229,6 +229,7 @@ void SdlWindowSystem::TranslateWindowEvent(SDL_WindowEvent const &event) {
         return; // events of destroyed windows still arrive
     switch (event.event) {
     case SDL_WINDOWEVENT_EXPOSED:
+        window->Lost();
         window->CorrectPlace();
         Send(InputEvent::kExposed, window);
         break;

@@ -246,67 +246,66 @@ TEST_F(Picture, ASurfaceOfAnotherSizeThanTheWindowIsCut) {
     ExpectPixel(*window, 99, 79, 0x00A000);
 }
 
-TEST_F(Picture, TheWindowsOwnSurfaceIsShownWhereItIsPresented) {
+TEST_F(Picture, OnlyWhatIsPresentedIsShown) {
     Window window = Open(At(200, 150, 100, 80));
     Fill(*window, 0x102030);
-    std::unique_ptr<Surface> surface = window->NewSurface(100, 80);
-    std::fill(surface->Pixels(), surface->Row(80), 0xFFF0E0D0U);
+    Surface surface(100, 80);
+    std::fill(surface.Pixels(), surface.Row(80), 0xFFF0E0D0U);
     ExpectPixel(*window, 15, 15, 0x102030);
     DeviceRect rect = {10, 10, 20, 20};
-    window->Present(*surface, &rect, 1);
+    window->Present(surface, &rect, 1);
     ExpectPixel(*window, 19, 19, 0xF0E0D0);
     ExpectPixel(*window, 20, 19, 0x102030);
 }
 
-TEST_F(Picture, TheWindowsOwnSurfaceMayChangeWhenItIsFinished) {
+TEST_F(Picture, TheSurfaceMayChangeAsSoonAsItIsPresented) {
     Window window = Open(At(200, 150, 100, 80));
-    std::unique_ptr<Surface> surface = window->NewSurface(100, 80);
+    Surface surface(100, 80);
     DeviceRect all = {0, 0, 100, 80};
     for (std::uint32_t shade = 0; shade < 0x40; ++shade) {
-        std::fill(surface->Pixels(), surface->Row(80), 0xFF000000U | (shade << 16));
-        window->Present(*surface, &all, 1);
-        window->Finish();
-        std::fill(surface->Pixels(), surface->Row(80), 0xFF0000FFU);
+        std::fill(surface.Pixels(), surface.Row(80), 0xFF000000U | (shade << 16));
+        window->Present(surface, &all, 1);
+        std::fill(surface.Pixels(), surface.Row(80), 0xFF0000FFU);
         ASSERT_EQ(Screen().PixelAt(299, 229) >> 19, shade >> 3);
         ASSERT_EQ(Screen().PixelAt(299, 229) & 0xFFU, 0U);
     }
 }
 
-TEST_F(Picture, TheWindowsOwnSurfaceIsStillShownAfterAResize) {
+TEST_F(Picture, WhatIsPresentedAgainAfterItWasLostIsShownAgain) {
+    Window below = Open(At(200, 150, 200, 150));
+    Surface surface(200, 150);
+    std::fill(surface.Pixels(), surface.Row(150), 0xFF336699U);
+    DeviceRect all = {0, 0, 200, 150};
+    below->Present(surface, &all, 1);
+    Window above = Open(At(250, 180, 200, 150));
+    Fill(*above, 0xC00000);
+    above.reset();
+    ASSERT_EQ(Await(InputEvent::kExposed).window, below.get());
+    below->Present(surface, &all, 1);
+    ExpectPixel(*below, 199, 149, 0x336699);
+}
+
+TEST_F(Picture, ASurfaceOfTheOldSizeIsStillShownAfterAResize) {
     Window window = Open(At(200, 150, 100, 80));
-    std::unique_ptr<Surface> surface = window->NewSurface(100, 80);
+    Surface surface(100, 80), larger(120, 90);
     DeviceRect all = {0, 0, 120, 90};
     window->SetContentSize(120, 90);
     Await(InputEvent::kResized);
-    std::fill(surface->Pixels(), surface->Row(80), 0xFF00A000U);
-    window->Present(*surface, &all, 1);
+    std::fill(surface.Pixels(), surface.Row(80), 0xFF00A000U);
+    window->Present(surface, &all, 1);
     ExpectPixel(*window, 99, 79, 0x00A000);
-    surface.reset();
-    surface = window->NewSurface(120, 90);
-    std::fill(surface->Pixels(), surface->Row(90), 0xFF336699U);
-    window->Present(*surface, &all, 1);
+    std::fill(larger.Pixels(), larger.Row(90), 0xFF336699U);
+    window->Present(larger, &all, 1);
     ExpectPixel(*window, 119, 89, 0x336699);
 }
 
 TEST_F(Picture, ASurfaceLargerThanTheWindowIsShownWhereTheWindowIs) {
     Window window = Open(At(200, 150, 100, 80));
-    std::unique_ptr<Surface> surface = window->NewSurface(300, 200);
-    std::fill(surface->Pixels(), surface->Row(200), 0xFF336699U);
+    Surface surface(300, 200);
+    std::fill(surface.Pixels(), surface.Row(200), 0xFF336699U);
     DeviceRect const rects[] = {{0, 0, 300, 200}, {150, 100, 300, 200}};
-    window->Present(*surface, rects, 2);
+    window->Present(surface, rects, 2);
     ExpectPixel(*window, 99, 79, 0x336699);
-}
-
-TEST_F(Picture, AnotherSizeThanTheWindowsGetsASurfaceOfItsOwn) {
-    Window window = Open(At(200, 150, 100, 80));
-    Fill(*window, 0x101010);
-    std::unique_ptr<Surface> surface = window->NewSurface(40, 30);
-    ASSERT_EQ(surface->Width(), 40);
-    std::fill(surface->Pixels(), surface->Row(30), 0xFFC00000U);
-    DeviceRect all = {0, 0, 100, 80};
-    window->Present(*surface, &all, 1);
-    ExpectPixel(*window, 39, 29, 0xC00000);
-    ExpectPixel(*window, 40, 30, 0x101010);
 }
 
 TEST_F(Picture, NothingToPresentIsNothing) {
