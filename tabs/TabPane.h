@@ -160,9 +160,9 @@ private:
     int Measure(Rect const &target, bool alignRight, Rect &candidate);
     void Finish(Rect const &candidate);
     bool TryToFit(Rect const &target, bool alignRight, int &overflow, bool force);
+    void NarrowTabs(Rect const &target, bool alignRight);
     bool FitsNarrower(Rect const &target, bool alignRight);
     bool FitsWithSmallerText(Rect const &target, bool alignRight);
-    int CountToHide(Rect const &target);
     void HideUntilItFits(Rect const &target, bool alignRight);
 
     // Drawing

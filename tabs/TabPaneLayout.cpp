@@ -117,7 +117,9 @@ void TabPane::UpdateLayout() {
 
 void TabPane::SetTextDrawingFlags(int flags) {
     textDrawingFlags = static_cast<unsigned short>(flags);
-    InvalItemRects();
+    itemRects.clear();
+    DemandItemRects();
+    UpdateLayout();
 }
 
 // Fitting
@@ -163,25 +165,30 @@ void TabPane::FitIntoRect(Rect const &target) {
         HideUntilItFits(target, alignRight);
 }
 
+// Takes from the least width as long as that is not too little and the row not yet narrow enough.
+void TabPane::NarrowTabs(Rect const &target, bool alignRight) {
+    Rect candidate;
+    while (Measure(target, alignRight, candidate) >= 1 && minTabWidth > kNarrowestTab)
+        --minTabWidth;
+}
+
 // As it is; with less and less of a least width; with less padding.
 bool TabPane::FitsNarrower(Rect const &target, bool alignRight) {
     int overflow = 0;
-    while (!TryToFit(target, alignRight, overflow, false)) {
-        if (minTabWidth > kNarrowestTab) {
-            --minTabWidth;
-            continue;
-        }
-        int const count = CountItems();
-        if (count * kMostSaving <= overflow)
-            return false;
-        float const saving = std::ceil(static_cast<float>(overflow) / static_cast<float>(2 * count));
-        tabPadding = static_cast<int>(static_cast<float>(TabMeasures::kPlainPadding) - saving);
-        return TryToFit(target, alignRight, overflow, false);
-    }
-    return true;
+    if (TryToFit(target, alignRight, overflow, false))
+        return true;
+    NarrowTabs(target, alignRight);
+    if (TryToFit(target, alignRight, overflow, false))
+        return true;
+    int const count = CountItems();
+    if (count * kMostSaving <= overflow)
+        return false;
+    float const saving = std::ceil(static_cast<float>(overflow) / static_cast<float>(2 * count));
+    tabPadding = static_cast<int>(static_cast<float>(TabMeasures::kPlainPadding) - saving);
+    return TryToFit(target, alignRight, overflow, false);
 }
 
-// The last flags of the list are set and not tried any more: what follows begins with others.
+// The last flags of the list are set and laid out, but never tried: what follows begins with others.
 bool TabPane::FitsWithSmallerText(Rect const &target, bool alignRight) {
     static unsigned short const kSteps[] = {kUseCondensedText,
                                             kTextSize10,
@@ -195,30 +202,18 @@ bool TabPane::FitsWithSmallerText(Rect const &target, bool alignRight) {
         int overflow = 0;
         if (TryToFit(target, alignRight, overflow, false))
             return true;
-        textDrawingFlags = flags; // laid out where it is tried
+        SetTextDrawingFlags(flags);
     }
     return false;
 }
 
-// How many items have to be hidden, by the layout that hides the fewest: each step only takes the last tab
-// off the row.
-int TabPane::CountToHide(Rect const &target) {
-    DemandItemRects();
-    int const room = target.right - target.left - TabMeasures::kOverflowWidth;
-    int hidden = 1;
-    while (hidden < CountItems() &&
-           itemRects[Index(CountItems() - hidden - 1)].right - itemRects[0].left > room)
-        ++hidden;
-    return hidden;
-}
-
-// Names are full and of plain size again. The box is taken even if nothing could be hidden any more.
+// Names are full and of plain size again. Each step lays the row out, since a subclass may give its tabs
+// other widths when fewer of them show. The box is taken even if nothing could be hidden any more.
 void TabPane::HideUntilItFits(Rect const &target, bool alignRight) {
-    textDrawingFlags = kOverflow;
+    SetTextDrawingFlags(kOverflow); // while nothing is hidden yet
     hiddenCount = 1;
-    itemRects.clear();
-    hiddenCount = CountToHide(target);
     int overflow = 0;
-    while (!TryToFit(target, alignRight, overflow, hiddenCount >= CountItems()) && hiddenCount < CountItems())
+    while (!TryToFit(target, alignRight, overflow, false) && hiddenCount < CountItems())
         ++hiddenCount;
+    TryToFit(target, alignRight, overflow, true);
 }

@@ -13,26 +13,31 @@ public:
     ScriptedTabs(glogRec *owner, Rect const &box, int count)
         : OpenTabs(owner, box, std::vector<Item>(static_cast<std::size_t>(count), Item(UString(), Ruler())),
                    0) {
-        for (Item *item : {&GetItem(0)})
-            item->textLayout.reset(new OS::TextLayout);
+        GetItem(0).textLayout.reset(new OS::TextLayout);
         for (int flags : {kPlain, kCondensed, kSize10, kCondensed | kSize10, kSize9, kCondensed | kSize9}) {
             SetTextDrawingFlags(flags);
             flagsByRuler[RulerWidth()] = flags;
         }
         SetTextDrawingFlags(0);
-        tried.clear();
         isScripted = true;
     }
 
+    void SetupFont() override {
+        OpenTabs::SetupFont();
+        if (isScripted)
+            Note(NameOfFlags() + (Hidden() ? '-' + std::to_string(Hidden()) : ""));
+    }
+    void SetBox(Rect *box) override {
+        OpenTabs::SetBox(box);
+        if (isScripted)
+            Note("box " + std::to_string(box->left) + " to " + std::to_string(box->right));
+    }
     int GetMinTabWidth() const override { return leastWidth; }
     int GetNameExtraWidth(int item) const override {
         if (!isScripted)
             return 0;
         ScriptedTabs &self = const_cast<ScriptedTabs &>(*this);
-        int const flags = self.Flags();
-        if (item == 0 && (tried.empty() || tried.back() != flags))
-            self.tried.push_back(flags);
-        auto const width = widths.find(flags);
+        auto const width = widths.find(self.Flags());
         return (width == widths.end() ? plainWidth : width->second) - self.GetItemNameWidth(item);
     }
 
@@ -57,13 +62,30 @@ public:
     int plainWidth = 60;       // of a tab without padding
     std::map<int, int> widths; // the same by flags, where it differs
     int leastWidth = 0;
-    std::vector<int> tried; // the flags that rows were laid out with, one after the other
+
+    // What was done since the last call, one word or two for each step: the look that a row was laid out with
+    // and how many items were hidden then; the box that the pane took.
+    std::string Steps() {
+        std::string taken;
+        taken.swap(steps);
+        return taken;
+    }
 
 private:
     static UString Ruler() {
         return UString("Wide enough to tell styles and sizes apart", UString::kByteEncoding1);
     }
     int RulerWidth() { return CachedStringWidth(Ruler(), layout); }
+    void Note(std::string const &step) { steps += (steps.empty() ? "" : ", ") + step; }
+    std::string NameOfFlags() {
+        int const flags = Flags();
+        std::string name = flags & kShort ? "short" : "";
+        name += flags & kCondensed ? "condensed" : "";
+        name += flags & kSize10 ? "10" : flags & kSize9 ? "9" : "";
+        return name.empty() ? "plain" : name;
+    }
+
+    std::string steps;
 
     std::map<int, int> flagsByRuler;
     OS::TextLayout layout;
@@ -97,7 +119,6 @@ TEST_F(TabPaneFittingTest, ARowThatFitsIsPlainAndThePaneIsAsWideAsIt) {
     EXPECT_EQ(pane->Flags(), kPlain);
     EXPECT_EQ(pane->Hidden(), 0);
     EXPECT_EQ(BoxOf(*pane), (Rect{20, 10, 37, 10 + 3 * (60 + 22)}));
-    EXPECT_EQ(pane->tried, std::vector<int>{kPlain});
 }
 
 TEST_F(TabPaneFittingTest, ARowThatFitsExactlyFits) {
@@ -148,7 +169,7 @@ TEST_F(TabPaneFittingTest, TheLeastWidthIsWhatGivesFirst) {
     pane->leastWidth = 100;
     pane->FitIntoRect(Target(3 * 93 + 2));
     EXPECT_EQ(Width(pane->GetItemBox(0)), 93);
-    EXPECT_EQ(pane->tried, std::vector<int>{kPlain});
+    EXPECT_EQ(pane->Flags(), kPlain);
 }
 
 TEST_F(TabPaneFittingTest, TheLeastWidthDoesNotGiveBelow30) {
@@ -212,13 +233,6 @@ TEST_F(TabPaneFittingTest, TextGivesInItsOrder) {
         EXPECT_EQ(pane->Hidden(), 0);
         EXPECT_EQ(BoxOf(*pane), (Rect{20, 10, 37, 10 + 3 * 26}));
     }
-}
-
-TEST_F(TabPaneFittingTest, TriesEachWayOnce) {
-    ScriptedTabs *const pane = MakeScripted();
-    pane->FitIntoRect(Target(100));
-    EXPECT_EQ(pane->tried, (std::vector<int>{kPlain, kCondensed, kSize10, kCondensed | kSize10, kSize9,
-                                             kCondensed | kSize9, kShort, kPlain}));
 }
 
 TEST_F(TabPaneFittingTest, ShortAndCondensedTogetherAreNeverTaken) {
@@ -292,6 +306,115 @@ TEST_F(TabPaneFittingTest, DeletionsLeaveTheNumberOfHiddenItems) {
     pane->DeleteAllItems();
     EXPECT_EQ(pane->GetOptimalRect(), (Rect{0, 0, 0, 0}));
     EXPECT_TRUE(Only("Draw1Icon", DrawingOf(*pane)).empty());
+}
+
+// Step by step
+
+TEST_F(TabPaneFittingTest, TheRowIsMeasuredAsItIsFirst) {
+    ScriptedTabs *const pane = MakeScripted();
+    pane->FitIntoRect(Target(3 * 82));
+    EXPECT_EQ(pane->Steps(), "plain, box 10 to 256");
+}
+
+TEST_F(TabPaneFittingTest, WithoutALeastWidthThereIsNothingToNarrow) {
+    ScriptedTabs *const pane = MakeScripted();
+    pane->FitIntoRect(Target(3 * 82 - 6));
+    EXPECT_EQ(pane->Steps(), "plain, plain, plain, plain, box 10 to 250")
+        << "as it is, to be narrowed, once more, and with less padding";
+}
+
+TEST_F(TabPaneFittingTest, TheLeastWidthGivesPixelByPixelAndTheRowIsMeasuredOnceMore) {
+    ScriptedTabs *const pane = MakeScripted();
+    pane->leastWidth = 90;
+    pane->FitIntoRect(Target(3 * 87));
+    EXPECT_EQ(pane->Steps(), "plain, plain, plain, plain, plain, plain, box 10 to 271")
+        << "as it is; 90, 89, 88 and 87 wide; once more";
+}
+
+TEST_F(TabPaneFittingTest, TheLeastWidthIsGivenUpAt30) {
+    ScriptedTabs *const pane = MakeScripted(1);
+    pane->plainWidth = 2;
+    pane->leastWidth = 32;
+    pane->FitIntoRect(Target(29));
+    // as it is; 32, 31 and 30 wide; once more; with less padding; with the least
+    EXPECT_EQ(pane->Steps().find("plain, plain, plain, plain, plain, plain, plain, condensed"), 0u);
+}
+
+TEST_F(TabPaneFittingTest, PaddingThatCannotSufficeIsNotTried) {
+    ScriptedTabs *const pane = MakeScripted();
+    pane->FitIntoRect(Target(3 * 82 - 48));
+    EXPECT_EQ(pane->Steps(), "plain, plain, plain, plain, box 10 to 208")
+        << "as it is, to be narrowed, once more, and with the least padding";
+}
+
+TEST_F(TabPaneFittingTest, PaddingThatShouldSufficeIsTriedBeforeTheLeastOne) {
+    // Wider tabs when the padding gives: it does not suffice then.
+    class Stubborn : public ScriptedTabs {
+    public:
+        using ScriptedTabs::ScriptedTabs;
+        int GetNameExtraWidth(int item) const override {
+            bool const gives = ++asked > 3; // rows
+            return ScriptedTabs::GetNameExtraWidth(item) + (gives ? 10 : 0);
+        }
+        mutable int asked = 0;
+    };
+    Stubborn *const pane = new Stubborn(glog, {20, 10, 37, 310}, 1);
+    pane->Steps();
+    pane->asked = 0;
+    pane->FitIntoRect(Target(80));
+    EXPECT_EQ(pane->Steps(), "plain, plain, plain, plain, plain, box 10 to 86");
+}
+
+TEST_F(TabPaneFittingTest, EachWayOfDrawingIsLaidOutWhenItIsSetAndMeasuredWhenItIsTried) {
+    ScriptedTabs *const pane = MakeScripted();
+    pane->widths[kShort] = 20;
+    pane->FitIntoRect(Target(3 * 26));
+    EXPECT_EQ(pane->Steps(), "plain, plain, plain, plain, "
+                             "condensed, condensed, 10, 10, condensed10, condensed10, 9, 9, "
+                             "condensed9, condensed9, short, short, box 10 to 88");
+}
+
+TEST_F(TabPaneFittingTest, ShortAndCondensedIsLaidOutAndNotTried) {
+    ScriptedTabs *const pane = MakeScripted();
+    pane->FitIntoRect(Target(100));
+    std::string const steps = pane->Steps();
+    EXPECT_NE(steps.find("short, short, shortcondensed, plain, "), std::string::npos) << steps;
+}
+
+TEST_F(TabPaneFittingTest, OneItemAfterTheOtherIsHidden) {
+    ScriptedTabs *const pane = MakeScripted(5);
+    pane->FitIntoRect(Target(2 * 66 + 24));
+    std::string const steps = pane->Steps(), end = "shortcondensed, ";
+    EXPECT_EQ(steps.substr(steps.find(end) + end.size()),
+              "plain, plain-1, plain-2, plain-3, box 10 to 166, plain-3, box 10 to 166")
+        << "the first is laid out before anything is hidden; the box is taken twice";
+}
+
+TEST_F(TabPaneFittingTest, WhatDoesNotFitWithEverythingHiddenIsMeasuredOnceMoreAndTaken) {
+    ScriptedTabs *const pane = MakeScripted(2);
+    pane->FitIntoRect(Target(5));
+    std::string const steps = pane->Steps(), end = "shortcondensed, ";
+    EXPECT_EQ(steps.substr(steps.find(end) + end.size()), "plain, plain-1, plain-2, plain-2, box 10 to 34");
+}
+
+TEST_F(TabPaneFittingTest, TheLastBoxKeepsToTheEdgeThatTheFirstStepHasChosen) {
+    ScriptedTabs *const pane = MakeScripted(5);
+    pane->FitIntoRect({20, 154, 37, 310});
+    EXPECT_EQ(BoxOf(*pane), (Rect{20, 310 - 2 * 66 - 24, 37, 310}));
+}
+
+TEST_F(TabPaneFittingTest, HidesMoreWhenTabsAreWiderInShortRows) {
+    // Each hidden item makes the tabs that still show 40 pixels wider.
+    class Growing : public ScriptedTabs {
+    public:
+        using ScriptedTabs::ScriptedTabs;
+        int GetNameExtraWidth(int item) const override {
+            return ScriptedTabs::GetNameExtraWidth(item) + 40 * Hidden();
+        }
+    };
+    Growing *const pane = new Growing(glog, {20, 10, 37, 310}, 4);
+    pane->FitIntoRect(Target(3 * 66 + 24));
+    EXPECT_EQ(pane->Hidden(), 3) << "106 + 106 + 106, 146 + 146, 186";
 }
 
 // Repaints
