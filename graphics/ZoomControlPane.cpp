@@ -55,7 +55,13 @@ public:
 
     Client *GetClient() const { return client; }
     void ForgetClient() { client = nullptr; }
-    void Update() { SetEnable(client && client->CanZoom(ZoomsIn())); }
+    // The client may delete the pane.
+    void Update() {
+        PaneWatch const watch(this);
+        bool const canZoom = client && client->CanZoom(ZoomsIn());
+        if (watch.PaneExists())
+            SetEnable(canZoom);
+    }
 
     short ClickAction(int pressModifiers) override {
         repeating = zoomStateSaved = false;
@@ -171,9 +177,10 @@ ZoomControlPane::ButtonPane *ZoomControlPane::NewButton(Client *client, bool zoo
 }
 
 void ZoomControlPane::UpdateControls() {
-    for (ButtonPane *button : {zoomInButton.Get(), zoomOutButton.Get()}) {
-        if (button)
-            button->Update();
+    PaneWatch const watch(this);
+    for (PanePtr<ButtonPane> *button : {&zoomInButton, &zoomOutButton}) {
+        if (watch.PaneExists() && *button)
+            (*button)->Update();
     }
 }
 

@@ -26,19 +26,25 @@ short const kAboveButton = 17; // pixels from the slider's top to the button's
 } // namespace
 
 struct ZoomPopUpPaneMouseWheelHandler : CustomEventHandler {
-    explicit ZoomPopUpPaneMouseWheelHandler(ZoomPopUpPaneClient *zoomed)
-        : client(zoomed) {}
+    ZoomPopUpPaneMouseWheelHandler(GlogPane *ownerPane, ZoomPopUpPaneClient *zoomed)
+        : owner(ownerPane)
+        , client(zoomed) {}
 
-    // Less than a whole notch is a step down, whichever way it goes.
+    // Less than a whole notch is a step down, whichever way it goes. The client may delete its owner.
     bool HandleEvent(UIEvent *event) override {
+        PaneWatch const watch(owner);
         client->PrepareToZoom();
-        client->ZoomStep(WholeNumber(static_cast<double>(event->GetMouseWheelParams()->delta)) > 0);
+        if (watch.PaneExists())
+            client->ZoomStep(WholeNumber(static_cast<double>(event->GetMouseWheelParams()->delta)) > 0);
         return true;
     }
 
-    CustomEventHandler *Clone() override { return new (std::nothrow) ZoomPopUpPaneMouseWheelHandler(client); }
+    CustomEventHandler *Clone() override {
+        return new (std::nothrow) ZoomPopUpPaneMouseWheelHandler(owner, client);
+    }
 
 private:
+    GlogPane *owner; // the client lives as long
     ZoomPopUpPaneClient *client;
 };
 
@@ -54,7 +60,8 @@ ZoomPopUpPane::ZoomPopUpPane(glogRec *owner, ZoomPopUpPaneClient *zoomed)
 ZoomPopUpPane::~ZoomPopUpPane() { delete client; }
 
 CustomEventHandler *ZoomPopUpPane::CanHandleCustomEvent(UIEvent *event) {
-    return IsMouseWheelEvent(*event) ? new (std::nothrow) ZoomPopUpPaneMouseWheelHandler(client) : nullptr;
+    return IsMouseWheelEvent(*event) ? new (std::nothrow) ZoomPopUpPaneMouseWheelHandler(this, client)
+                                     : nullptr;
 }
 
 void ZoomPopUpPane::DrawGuts(OSRgn *) {
@@ -84,8 +91,10 @@ void ZoomPopUpPane::PopZoomControl(EventRecordAdapter *event) {
         return;
     SetPortToGlog(popup);
     PaneWatch const self(this);
-    // The level that the client has comes up under the mouse.
-    int const level = WholeNumber(client->GetZoomFraction() * ZoomPopUpControl::kTrackLength);
+    // The level that the client has comes up under the mouse. The fraction's own error counts, so that one
+    // which the slider has set may come up a pixel beside it.
+    int const level =
+        WholeNumber(static_cast<double>(client->GetZoomFraction()) * ZoomPopUpControl::kTrackLength);
     Rect place = {0, 0, ZoomPopUpControl::kHeight, ZoomPopUpControl::kWidth};
     VelaDrawing::OffsetRect(&place,
                             Pixel16(mouse.h - static_cast<long long>(level) - ZoomPopUpControl::kTrackLeft),

@@ -1,8 +1,8 @@
 // A button of 12 pixels that pops up a zoom slider under the mouse.
 //
 // The slider stays up while the mouse button is held; its thumb follows the mouse. The wheel over the button
-// steps through the levels. Clicks give -1. The slider's window is the stored one of the number 3510: a
-// program that cannot open it, since it has no dialogs, has no slider.
+// steps through the levels. Clicks give -1. The slider's window is the stored one of the number 3510; without
+// it nothing comes up.
 #pragma once
 #include "graphics/ZoomPopUpPaneClient.h"
 #include "host/GlogPane.h"

@@ -20,13 +20,17 @@ public:
         if (then)
             then();
     }
-    bool CanZoom(bool zoomIn) override { return zoomIn ? canZoomIn : canZoomOut; }
+    bool CanZoom(bool zoomIn) override {
+        if (onAsked)
+            onAsked();
+        return zoomIn ? canZoomIn : canZoomOut;
+    }
     void SaveZoomStateHook() override { calls.push_back("save"); }
 
     Calls calls;
     std::vector<double> times;
     bool canZoomIn = true, canZoomOut = true;
-    std::function<void()> then;
+    std::function<void()> then, onAsked;
 };
 
 class ZoomControlPaneTest : public PaneTest {
@@ -219,6 +223,22 @@ TEST_F(ZoomControlPaneTest, ThePaneMayBeDeletedWhileItsButtonIsHeld) {
     client.then = [&] { delete pane; };
     EXPECT_EQ(Played("press " + kIn + "\nwait 2\nrelease"), (Calls{"save", "in"}));
     EXPECT_FALSE(watch.PaneExists());
+}
+
+TEST_F(ZoomControlPaneTest, ThePaneMayBeDeletedWhenTheClientIsAsked) {
+    Made();
+    Show();
+    PaneWatch const watch(pane);
+    int asked = 0;
+    client.onAsked = [&] {
+        ++asked;
+        delete pane;
+    };
+    client.UpdateControlPane();
+    EXPECT_FALSE(watch.PaneExists());
+    EXPECT_EQ(asked, 1) << "not about the button that has gone";
+    client.onAsked = nullptr;
+    client.UpdateControlPane();
 }
 
 TEST_F(ZoomControlPaneTest, AClientThatHasGoneIsNotAsked) {

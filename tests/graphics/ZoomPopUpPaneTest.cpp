@@ -10,6 +10,7 @@
 #include "tests/VirtualPlace.h"
 #include <algorithm>
 #include <cmath>
+#include <limits>
 
 namespace {
 
@@ -18,7 +19,7 @@ struct ZoomLog {
     std::vector<std::string> calls;
     std::vector<float> fractions;
     int deleted = 0;
-    std::function<void()> onSet, onIdle;
+    std::function<void()> onPrepare, onStep, onSet, onIdle;
 };
 
 class TestClient : public ZoomPopUpPaneClient {
@@ -26,7 +27,11 @@ public:
     explicit TestClient(ZoomLog &log_)
         : log(log_) {}
     ~TestClient() override { ++log.deleted; }
-    void PrepareToZoom() override { log.calls.push_back("prepare"); }
+    void PrepareToZoom() override {
+        log.calls.push_back("prepare");
+        if (log.onPrepare)
+            log.onPrepare();
+    }
     float GetZoomFraction() override { return fraction; }
     void SetZoomFraction(float wanted) override {
         log.calls.push_back("set");
@@ -35,7 +40,11 @@ public:
         if (log.onSet)
             log.onSet();
     }
-    void ZoomStep(bool up) override { log.calls.push_back(up ? "up" : "down"); }
+    void ZoomStep(bool up) override {
+        log.calls.push_back(up ? "up" : "down");
+        if (log.onStep)
+            log.onStep();
+    }
     void ZoomIdle() override {
         log.calls.push_back("idle");
         if (log.onIdle)
@@ -122,6 +131,23 @@ TEST_F(ZoomPopUpPaneTest, LessThanANotchIsAStepDown) {
     EXPECT_EQ(Count("up"), 1);
 }
 
+TEST_F(ZoomPopUpPaneTest, ThePaneMayBeDeletedByTheWheel) {
+    Show();
+    PaneWatch const watch(pane);
+    log.onStep = [&] { delete pane; };
+    desktop.Play("wheel 155 105 0 1");
+    EXPECT_FALSE(watch.PaneExists());
+    EXPECT_EQ(log.deleted, 1);
+}
+
+TEST_F(ZoomPopUpPaneTest, ThePaneMayBeDeletedBeforeAStep) {
+    Show();
+    log.onPrepare = [&] { delete pane; };
+    desktop.Play("wheel 155 105 0 1");
+    EXPECT_EQ(log.deleted, 1);
+    EXPECT_EQ(log.calls, std::vector<std::string>{"prepare"}) << "the client went with it";
+}
+
 // The slider
 
 TEST_F(ZoomPopUpPaneTest, TheSliderComesUpWithItsLevelUnderTheMouse) {
@@ -141,6 +167,27 @@ TEST_F(ZoomPopUpPaneTest, TheSliderComesUpWithItsLevelUnderTheMouse) {
     ASSERT_EQ(log.fractions.size(), 1u);
     EXPECT_FLOAT_EQ(log.fractions[0], 23.0f / 47.0f) << "the pixel under the mouse";
     EXPECT_EQ(log.calls.front(), "prepare");
+}
+
+TEST_F(ZoomPopUpPaneTest, TheLevelUnderTheMouseIsCalculatedInDoublePrecision) {
+    Show();
+    client->fraction = 24.0f / 47.0f; // a little less than that: single precision would make it 24 again
+    desktop.Play("press 155 105\nwait 0.01\nrelease");
+    ASSERT_EQ(log.fractions.size(), 1u);
+    EXPECT_FLOAT_EQ(log.fractions[0], 23.0f / 47.0f);
+}
+
+TEST_F(ZoomPopUpPaneTest, LevelsThatAreNoneBringTheSliderUpAllTheSame) {
+    Show();
+    for (float level :
+         {std::numeric_limits<float>::quiet_NaN(), std::numeric_limits<float>::infinity(), -1e30f}) {
+        log.fractions.clear();
+        client->fraction = level;
+        EXPECT_EQ(ResultOfClick("press 155 105\nmove 156 105"), -1);
+        ASSERT_EQ(log.fractions.size(), 2u) << level;
+        for (float given : log.fractions)
+            EXPECT_TRUE(given >= 0.0f && given <= 1.0f) << given;
+    }
 }
 
 TEST_F(ZoomPopUpPaneTest, TheSliderFollowsTheMouse) {
@@ -225,6 +272,19 @@ TEST_F(ZoomPopUpPaneTest, LevelsBeyondTheEndsShowTheLastThumbs) {
 }
 
 // What may happen meanwhile
+
+TEST_F(ZoomPopUpPaneTest, ThePaneMayBeDeletedAsItsSliderComesUp) {
+    Show();
+    PaneWatch const watch(pane);
+    log.onPrepare = [&] {
+        log.onPrepare = nullptr;
+        delete pane;
+    };
+    EXPECT_EQ(ResultOfClick("press 155 105\nmove 165 105"), -1);
+    EXPECT_FALSE(watch.PaneExists());
+    EXPECT_EQ(log.calls, std::vector<std::string>{"prepare"});
+    EXPECT_EQ(Popup(), nullptr);
+}
 
 TEST_F(ZoomPopUpPaneTest, ThePaneMayBeDeletedWhileItsSliderIsUp) {
     Show();
