@@ -3,6 +3,8 @@
 
 struct GraphAxisSetting {
     int dataMinimum, dataMaximum; // values at the ends of the axis
-    int gridInterval; // from one grid line to the next, in the data's units; below 1 there are none
+    // From one grid line to the next, in the data's units. Below 1, and where that would be more lines than
+    // 65536, there are none.
+    int gridInterval;
     int pixelMinimum, pixelMaximum; // where the ends are, in the graph's coordinates
 };

@@ -61,7 +61,8 @@ GraphPane::GraphPane(glogRec *owner, short id, boost::shared_ptr<XMLLib::Contain
         return;
     Rect box = OptionalRect(item, "BoundsRect");
     GlogPane::SetBox(&box);
-    TakePixels();
+    TakeColumns();
+    TakeRows();
 }
 
 GraphPane::~GraphPane() { delete graphData; }
@@ -77,25 +78,30 @@ void GraphPane::SetGraphData(GraphData *data) {
 
 void GraphPane::SetBox(Rect *box) {
     GlogPane::SetBox(box);
-    TakePixels();
+    TakeColumns();
+    TakeRows();
 }
 
-void GraphPane::TakePixels() {
+void GraphPane::TakeColumns() {
     Rect const r = GraphBounds();
     horizontalAxis.pixelMinimum = r.left;
     horizontalAxis.pixelMaximum = r.right - 1;
+}
+
+void GraphPane::TakeRows() {
+    Rect const r = GraphBounds();
     verticalAxis.pixelMinimum = r.bottom - 1;
     verticalAxis.pixelMaximum = r.top;
 }
 
 void GraphPane::SetupHorizontalAxis(GraphAxisSetting const &setting) {
     horizontalAxis = setting;
-    TakePixels();
+    TakeColumns();
 }
 
 void GraphPane::SetupVerticalAxis(GraphAxisSetting const &setting) {
     verticalAxis = setting;
-    TakePixels();
+    TakeRows();
 }
 
 Rect GraphPane::GraphBounds() {

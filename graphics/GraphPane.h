@@ -58,7 +58,8 @@ protected:
     void DrawData(OSRgn *); // the line and the marks
 
 private:
-    void TakePixels();
+    void TakeColumns();
+    void TakeRows();
     void DrawLineThroughPoints();
 
     GraphAxisSetting horizontalAxis, verticalAxis;

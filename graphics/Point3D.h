@@ -2,7 +2,7 @@
 #pragma once
 
 // y is the vertical axis.
-enum Axis3D { kAxisX = 0, kAxisY = 1, kAxisZ = 2 };
+enum Axis3D : int { kAxisX = 0, kAxisY = 1, kAxisZ = 2 };
 
 // A place, or anything else with a number for each axis.
 struct Point3D {

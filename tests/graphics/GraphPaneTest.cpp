@@ -171,6 +171,42 @@ TEST_F(GraphPaneTest, AnAxisOfItsOwnKeepsThePixelsOfTheBox) {
     EXPECT_EQ(v, 11);
 }
 
+TEST_F(GraphPaneTest, AnAxisTakesItsOwnPixelsOnly) {
+    // As a container does that moves what is in it.
+    class Moved : public MarkedGraph {
+    public:
+        using MarkedGraph::MarkedGraph;
+        void MoveTo(Rect box) { GlogPane::SetBox(&box); }
+    };
+    GraphPaneResRec record = {GraphPaneResRec::kKind, kBox};
+    Moved *const graph = new Moved(glog, 5, &record);
+    graph->MoveTo({10, 120, 112, 322});
+    graph->SetupHorizontalAxis({0, 127, 32, 0, 0});
+    int h = 0, v = 0;
+    graph->GraphDataPointToCoords({0, 127}, h, v);
+    EXPECT_EQ(h, 121);
+    graph->MoveTo({60, 20, 162, 222});
+    graph->SetupVerticalAxis({0, 127, 32, 0, 0});
+    graph->GraphDataPointToCoords({0, 127}, h, v);
+    EXPECT_EQ(h, 121) << "of the box before";
+    EXPECT_EQ(v, 61);
+}
+
+TEST_F(GraphPaneTest, BeforeThereIsABoxAxesHaveThePixelsOfTheEmptyOne) {
+    GraphPane *const graph = new GraphPane(glog, 5, static_cast<GraphPaneResRec *>(nullptr));
+    int h = 0, v = 0;
+    graph->GraphDataPointToCoords({127, 127}, h, v);
+    EXPECT_EQ(h, 0) << "not set up, they have none";
+    EXPECT_EQ(v, 0);
+    graph->SetupHorizontalAxis({0, 100, 10, 0, 0});
+    graph->SetupVerticalAxis({0, 100, 10, 0, 0});
+    for (int value : {0, 100}) {
+        graph->GraphDataPointToCoords({value, value}, h, v);
+        EXPECT_EQ(h, value == 0 ? 1 : -2); // from 1 to -1, without the last
+        EXPECT_EQ(v, value == 0 ? -2 : 1);
+    }
+}
+
 TEST_F(GraphPaneTest, AnotherBoxMovesTheAxes) {
     MarkedGraph *const graph = Made();
     Rect box{0, 0, 52, 102};

@@ -70,6 +70,13 @@ TEST_F(ThreeDPaneTest, MarginsAreKeptFree) {
     EXPECT_EQ(cube->Project({0.5, -0.25, 0.0}), (Point{136, 163}));
 }
 
+TEST_F(ThreeDPaneTest, MarginsAtTheRightAndBelowMakeItSmaller) {
+    Cube *const right = Made({0, 0, 400, 230}, 0.0, {0.0, 0.0, -3.0}, 0.0, {0, 0, 0, 30});
+    EXPECT_EQ(right->Project({0.5, -0.25, 0.0}), (Point{116, 133})) << "as in 200 pixels";
+    Cube *const below = Made({0, 0, 240, 400}, 0.0, {0.0, 0.0, -3.0}, 0.0, {0, 0, 40, 0});
+    EXPECT_EQ(below->Project({0.5, -0.25, 0.0}), (Point{116, 133})) << "what is left over is at the right";
+}
+
 TEST_F(ThreeDPaneTest, TheBallHasRoomAtTheCorners) {
     Cube *const cube = FromTheFront(0.5);
     // The cube is seen as if it went from -1.5 to 1.5: 200 pixels for 1.5 / 1.5 to either side, from z -1.5.

@@ -27,7 +27,7 @@ double const kHandleCorner = 8; // diameter
 
 } // namespace
 
-// Four points: where the note starts, is loudest, goes on, and ends.
+// Five points: where the note starts, is loudest, goes on, fades, and ends.
 class EnvelopePane::Envelope : public GraphData {
 public:
     int CountPoints() override { return static_cast<int>(points.size()); }
