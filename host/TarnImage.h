@@ -40,7 +40,8 @@ public:
     virtual ~PngImage();
     virtual void Draw(Rect const &);
     virtual Rect GetFrameRect() const;
-    virtual void ThemeChanged(); // drops what was read; the next use reads anew
+    // The next use looks for the theme's picture. A file that was read once is not read again.
+    virtual void ThemeChanged();
 
 private:
     PngImage(PngImage const &);

@@ -7,6 +7,7 @@
 #include "desktop/observe/DrawingTrace.h"
 #include "desktop/resources/Resources.h"
 #include <algorithm>
+#include <map>
 #include <memory>
 #include <string>
 
@@ -28,23 +29,38 @@ std::string PathIn(char const *theme, short id, char const *suffix) {
     return Resources::Instance().Find("pictures/" + std::string(theme) + '/' + std::to_string(id) + suffix);
 }
 
-// pictures/THEME/42.png, or that of the light theme; with the suffix, pictures/THEME/42@2x.png. Empty when
-// there is neither.
+// pictures/THEME/42.png, or that of the light theme; with the suffix, pictures/THEME/42@2x.png of the same
+// theme. Empty when there is none.
 std::string PicturePath(short id, char const *suffix) {
-    std::string const path = PathIn(Resources::Instance().Theme().c_str(), id, suffix);
-    return path.empty() ? PathIn(kPlainTheme, id, suffix) : path;
+    std::string const theme = Resources::Instance().Theme();
+    bool const hasOwn = !PathIn(theme.c_str(), id, kPlainSuffix).empty();
+    return PathIn(hasOwn ? theme.c_str() : kPlainTheme, id, suffix);
 }
 
-// Null when there is no such picture, or it is broken.
-std::unique_ptr<Surface> ReadPicture(short id, char const *suffix) {
-    try {
-        std::string const path = PicturePath(id, suffix);
-        std::string reason; // a broken picture is as good as none
-        return path.empty() ? nullptr : Surface::ReadPng(path, reason);
-    } catch (ResourceError const &) {
-        return nullptr; // there is no artwork at all
+// Pictures from files, each of which is decoded once.
+class PictureFiles {
+public:
+    // Null when there is no such picture, or it is broken.
+    Surface *Read(short id, char const *suffix) {
+        try {
+            std::string const path = PicturePath(id, suffix);
+            return path.empty() ? nullptr : Decoded(path);
+        } catch (ResourceError const &) {
+            return nullptr; // there is no artwork at all
+        }
     }
-}
+
+private:
+    Surface *Decoded(std::string const &path) {
+        auto const known = pictures.find(path);
+        if (known != pictures.end())
+            return known->second.get();
+        std::string reason; // a broken picture is as good as none
+        return (pictures[path] = Surface::ReadPng(path, reason)).get();
+    }
+
+    std::map<std::string, std::unique_ptr<Surface>> pictures; // by path; null for a broken one
+};
 
 } // namespace
 
@@ -66,27 +82,27 @@ struct PngImage::Rep {
     Surface const *Picture() {
         if (!known) {
             known = true;
-            picture = ReadPicture(id, kPlainSuffix);
+            picture = files.Read(id, kPlainSuffix);
             opaque = picture && picture->IsOpaque();
         }
-        return picture.get();
+        return picture;
     }
 
     // The one with more pixels, which most windows do not need; null when there is none.
     Surface *Detailed() {
         if (!detailedKnown) {
             detailedKnown = true;
-            detailed = ReadPicture(id, kDetailedSuffix);
+            detailed = files.Read(id, kDetailedSuffix);
             opaque = opaque && (!detailed || detailed->IsOpaque());
         }
-        return detailed.get();
+        return detailed;
     }
 
     // The picture in that many device pixels. Kept, since a picture is nearly always drawn in the same size.
     PixelImage Sized(int width, int height) {
         width = std::min(width, kLongestScaledSide);
         height = std::min(height, kLongestScaledSide);
-        Surface *shown = width > picture->Width() && Detailed() ? detailed.get() : picture.get();
+        Surface *shown = width > picture->Width() && Detailed() ? detailed : picture;
         if (shown->Width() != width || shown->Height() != height) {
             if (!scaled || scaled->Width() != width || scaled->Height() != height) {
                 scaled.reset(new Surface(width, height));
@@ -98,19 +114,20 @@ struct PngImage::Rep {
         return {shown->PixmanImage(), width, height, opaque, false};
     }
 
+    // Which pictures are shown has to be found out again; what was decoded stays, for when they come back.
     void Forget() {
         known = detailedKnown = false;
-        picture.reset();
-        detailed.reset();
+        picture = detailed = nullptr;
         scaled.reset();
     }
 
     short const id;
     bool known = false, detailedKnown = false; // whether the files have been looked for
     bool opaque = false;
-    std::unique_ptr<Surface> picture;  // in its own size
-    std::unique_ptr<Surface> detailed; // with twice as many pixels each way, for larger sizes; or null
-    std::unique_ptr<Surface> scaled;   // as it was drawn last, if that was in another size
+    Surface *picture = nullptr;      // in its own size
+    Surface *detailed = nullptr;     // with twice as many pixels each way, for larger sizes; or null
+    std::unique_ptr<Surface> scaled; // as it was drawn last, if that was in another size
+    PictureFiles files;
 };
 
 PngImage::PngImage(short id)

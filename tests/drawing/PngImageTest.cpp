@@ -3,6 +3,7 @@
 #include "host/TarnImage.h"
 #include "tests/resources/TemporaryDirectory.h"
 #include <filesystem>
+#include <functional>
 
 namespace {
 
@@ -24,6 +25,16 @@ protected:
                 surface.Row(y)[x] = pixel;
         std::string error;
         ASSERT_TRUE(surface.WritePng(directory.Path() + "/pictures/" + name, error)) << error;
+    }
+    // Makes a file of the seeds for fuzzing the picture 42.
+    void UseSeed(std::string const &name) {
+        std::filesystem::copy_file(std::string(GLOG_TEST_SOURCE_DIR) + "/../fuzz/corpus/FuzzPng/" + name,
+                                   directory.Path() + "/pictures/light/42.png",
+                                   std::filesystem::copy_options::overwrite_existing);
+    }
+    static void ChangeTheme(std::string const &theme) {
+        Resources::Instance().SetTheme(theme);
+        ThemeChangeNotificationProvider::Instance().NotifyThemeChanged();
     }
     TemporaryDirectory directory;
 };
@@ -98,8 +109,7 @@ TEST_F(Pictures, FollowTheThemeByThemselves) {
     Write("light/43.png", 3, 2, kBlue);
     PngImage picture(42), plain(43);
     EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 2, 3}));
-    Resources::Instance().SetTheme("dark");
-    ThemeChangeNotificationProvider::Instance().NotifyThemeChanged();
+    ChangeTheme("dark");
     EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 4, 4}));
     EXPECT_EQ(plain.GetFrameRect(), (Rect{0, 0, 2, 3})); // has no picture of its own for the theme
     Canvas canvas(4, 4);
@@ -128,6 +138,44 @@ TEST_F(Pictures, AreReadOnce) {
     EXPECT_EQ(sharp.Count(Canvas::kRed), 48);
 }
 
+TEST_F(Pictures, AreReadOnceForEachThemeAndScale) {
+    std::uint32_t const kGreen = 0xFF00FF00u, kPink = 0xFFFF80FFu;
+    struct Case {
+        std::string theme;
+        int scale;
+        std::uint32_t pixel;
+    };
+    std::vector<Case> const cases = {
+        {"light", 1, kBlue}, {"light", 2, kGreen}, {"dark", 1, Canvas::kRed}, {"dark", 2, kPink}};
+    auto const writeAll = [&](std::function<std::uint32_t(Case const &)> const &pixelOf) {
+        for (Case const &c : cases)
+            Write(c.theme + (c.scale == 2 ? "/42@2x.png" : "/42.png"), 3 * c.scale, 2 * c.scale, pixelOf(c));
+    };
+    writeAll([](Case const &c) { return c.pixel; });
+    PngImage picture(42);
+    for (int round = 0; round < 3; ++round) {
+        for (Case const &c : cases) {
+            ChangeTheme(c.theme);
+            Canvas canvas(3, 2, c.scale);
+            picture.Draw({0, 0, 2, 3});
+            EXPECT_EQ(canvas.Count(c.pixel), 6 * c.scale * c.scale)
+                << "round " << round << ", " << c.theme << " at " << c.scale;
+        }
+        writeAll([](Case const &) { return Canvas::kBlack; });
+    }
+}
+
+TEST_F(Pictures, TheDetailedOneIsOfTheSameTheme) {
+    Write("light/42.png", 3, 2, kBlue);
+    Write("light/42@2x.png", 6, 4, kBlue);
+    Write("dark/42.png", 3, 2, Canvas::kRed);
+    PngImage picture(42);
+    ChangeTheme("dark");
+    Canvas sharp(3, 2, 2);
+    picture.Draw({0, 0, 2, 3});
+    EXPECT_EQ(sharp.Count(Canvas::kRed), 24) << "the dark one, made larger";
+}
+
 TEST_F(Pictures, TheDetailedOneIsReadWhereItIsWanted) {
     Write("light/42.png", 3, 2, kBlue);
     PngImage picture(42);
@@ -151,13 +199,23 @@ TEST_F(Pictures, ATranslucentDetailedOneLetsTheGroundShow) {
 }
 
 TEST_F(Pictures, AreReadHoweverTheyAreStored) {
-    for (char const *name : {"gray.png", "gray-1-bit.png", "palette.png", "rgb.png", "rgb-16-bit.png",
-                             "interlaced-whole.png", "rgba.png", "rgba-16-bit.png", "gray-alpha.png"}) {
-        std::filesystem::copy_file(std::string(GLOG_TEST_SOURCE_DIR) + "/../fuzz/corpus/FuzzPng/" + name,
-                                   directory.Path() + "/pictures/light/42.png",
-                                   std::filesystem::copy_options::overwrite_existing);
+    struct Case {
+        char const *name;
+        int x, y;
+        std::uint32_t pixel; // there, on white
+    };
+    for (Case const &c :
+         {Case{"gray.png", 1, 0, 0xFF404040u}, Case{"gray-1-bit.png", 1, 0, 0xFF000000u},
+          Case{"palette.png", 1, 0, 0xFF040506u}, Case{"rgb.png", 1, 1, 0xFF00FF00u},
+          Case{"rgb-16-bit.png", 0, 0, 0xFF000000u}, Case{"interlaced-whole.png", 2, 1, 0xFF3C1E80u},
+          Case{"rgba.png", 0, 0, 0xFFE3B198u}, Case{"rgba-16-bit.png", 0, 0, 0xFF88AACCu},
+          Case{"gray-alpha.png", 0, 0, 0xFFDFDFDFu}}) {
+        UseSeed(c.name);
         PngImage picture(42);
-        EXPECT_GT(picture.GetFrameRect().right, 0) << name;
+        Canvas canvas(8, 8);
+        picture.Draw(picture.GetFrameRect());
+        for (int shift : {0, 8, 16})
+            EXPECT_NEAR(canvas.At(c.x, c.y) >> shift & 0xFF, c.pixel >> shift & 0xFF, 1) << c.name;
     }
 }
 
@@ -165,9 +223,7 @@ TEST_F(Pictures, FilesThatAreNoPicturesDrawNothing) {
     for (char const *name :
          {"bad-depth", "bad-filter", "claim-65535", "cut-in-data", "cut-in-header", "empty", "jpeg",
           "no-width", "one-too-wide", "signature-only", "wide-claim", "wrong-checksum"}) {
-        std::filesystem::copy_file(std::string(GLOG_TEST_SOURCE_DIR) + "/../fuzz/corpus/FuzzPng/" + name,
-                                   directory.Path() + "/pictures/light/42.png",
-                                   std::filesystem::copy_options::overwrite_existing);
+        UseSeed(name);
         PngImage picture(42);
         EXPECT_EQ(picture.GetFrameRect(), (Rect{0, 0, 0, 0})) << name;
         Canvas canvas(5, 5);
