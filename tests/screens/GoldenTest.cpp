@@ -126,6 +126,11 @@ Press const kPresses[] = {
     {"text", "composed", "click 60 88\ntype \"ab\"\ncompose \"\u00E9\u00E8\u00EA\" 2\nwait 0.6\n"},
     {"text", "large-selected", "doubleclick 170 124\n"},
     {"text", "bare-edited", "doubleclick 30 160\n"},
+    {"row", "rest", ""},
+    {"row", "scrolled", "wheel 400 60 -3 -2\nwait 0.5\n"},
+    {"graphic", "rest", ""},
+    {"graphic", "ball-dragged", "press 139 72\nmove 190 80\n"},
+    {"graphic", "zoom-pressed", "press 286 242\n"},
 };
 
 void PrintTo(Press const &press, std::ostream *out) { *out << press.Name(); }
