@@ -4,8 +4,8 @@
 
 struct glogRec;
 
-// windows/NUMBER.xml in the resources' directories is a dialog. Whoever reads dialogs says so here; those without
-// panes are opened without him too.
+// windows/NUMBER.xml in the resources' directories is a dialog. Whoever reads dialogs says so here; those
+// without panes are opened without him too.
 namespace StoredWindows {
 
 // Makes an invisible glog with its panes from a file; throws std::exception for one that is broken.

@@ -25,7 +25,7 @@ std::string const kTypeInfo = "_ZTI", kPane = typeid(GlogPane).name();
 
 // Classes that no dialog shows.
 Names const kNotInDialogs = {"ZoomPopUpControl", // only while its button is held
-                             // Programs derive from these, which draw nothing themselves.
+                                                 // Programs derive from these, which draw nothing themselves.
                              "GutterPane", "ListPane", "ListPane::HelperPane"};
 
 std::string Readable(std::string const &className) {
