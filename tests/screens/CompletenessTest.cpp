@@ -24,9 +24,7 @@ typedef std::set<std::string> Names;
 std::string const kTypeInfo = "_ZTI", kPane = typeid(GlogPane).name();
 
 // Classes that no dialog shows.
-Names const kNotInDialogs = {"ZoomPopUpControl", // only while its button is held
-                                                 // Programs derive from these, which draw nothing themselves.
-                             "GutterPane", "ListPane", "ListPane::HelperPane"};
+Names const kNotInDialogs = {"ZoomPopUpControl"}; // comes up while its button is held
 
 std::string Readable(std::string const &className) {
     int status = 0;

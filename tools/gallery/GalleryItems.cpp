@@ -12,6 +12,7 @@
 #include "tools/gallery/EnvelopePane.h"
 #include "tools/gallery/FittedTabsPane.h"
 #include "tools/gallery/HoldButtonPane.h"
+#include "tools/gallery/LinesPane.h"
 #include "tools/gallery/PannerPane.h"
 #include "tools/gallery/StepperPane.h"
 #include "tools/gallery/TakeListPane.h"
@@ -152,6 +153,11 @@ void GalleryItems::Add() {
                                .Required())
                      .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
                          return AskButtonPane::NewAskButtonPane(glog, sheet);
+                     }));
+    registry.Add(ItemType("Lines")
+                     .Keys(KeyList().Rect("BoundsRect").Required().Integer("Num", 0, kMostRows).Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return LinesPane::NewLinesPane(glog, sheet);
                      }));
     registry.Add(BadgeButtonType());
     registry.Add(PannerPane::Type());
