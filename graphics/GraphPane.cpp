@@ -182,6 +182,15 @@ void GraphPane::DrawGridLines() {
     });
 }
 
+// Whoever is asked for a point, and a mark, may change the data.
+template <class Action> void GraphPane::ForEachPoint(Action const &action) {
+    for (int i = 0; graphData && i < graphData->CountPoints(); ++i) {
+        int h = 0, v = 0;
+        GraphDataPointToCoords(graphData->GetPoint(i), h, v);
+        action(i, h, v);
+    }
+}
+
 void GraphPane::DrawData(OSRgn *) {
     if (!graphData)
         return;
@@ -192,12 +201,7 @@ void GraphPane::DrawData(OSRgn *) {
         return;
     DrawLineThroughPoints();
     VelaDrawing::RGBForeColor(kDialogListTextColor);
-    // A mark may change the data.
-    for (int i = 0; graphData && i < graphData->CountPoints(); ++i) {
-        int h = 0, v = 0;
-        GraphDataPointToCoords(graphData->GetPoint(i), h, v);
-        DrawDataPoint(i, h, v);
-    }
+    ForEachPoint([this](int index, int h, int v) { DrawDataPoint(index, h, v); });
 }
 
 void GraphPane::DrawLineThroughPoints() {
@@ -205,12 +209,7 @@ void GraphPane::DrawLineThroughPoints() {
     port->SetLineWidth(kLineWidth);
     port->SetForeColor(kLineColor);
     PixelLine line;
-    int const count = graphData->CountPoints();
-    for (int i = 0; i < count; ++i) {
-        int h = 0, v = 0;
-        GraphDataPointToCoords(graphData->GetPoint(i), h, v);
-        line.Add(h, v);
-    }
+    ForEachPoint([&line](int, int h, int v) { line.Add(h, v); });
     line.Stroke(*port);
 }
 

@@ -61,6 +61,8 @@ private:
     void TakeColumns();
     void TakeRows();
     void DrawLineThroughPoints();
+    // Calls the action with the index of each point and where it lies.
+    template <class Action> void ForEachPoint(Action const &);
 
     GraphAxisSetting horizontalAxis, verticalAxis;
     GraphData *graphData; // owned, or null

@@ -27,8 +27,14 @@ public:
             ++*deleted;
     }
     int CountPoints() override { return static_cast<int>(points.size()); }
-    GraphDataPoint GetPoint(int index) override { return points.at(static_cast<std::size_t>(index)); }
+    GraphDataPoint GetPoint(int index) override {
+        GraphDataPoint const point = points.at(static_cast<std::size_t>(index));
+        if (onAsked)
+            onAsked();
+        return point;
+    }
     std::vector<GraphDataPoint> points;
+    std::function<void()> onAsked;
     int *deleted;
 };
 
@@ -352,6 +358,15 @@ TEST_F(GraphPaneTest, AMarkMayTakeTheDataAway) {
     graph->then = [&] { graph->SetGraphData(nullptr); };
     Show();
     EXPECT_EQ(graph->marks.size(), 1u);
+}
+
+TEST_F(GraphPaneTest, PointsMayBecomeFewerWhileTheyAreAskedFor) {
+    MarkedGraph *const graph = Made();
+    Points *const points = new Points({{0, 0}, {64, 64}, {127, 127}});
+    graph->SetGraphData(points);
+    points->onAsked = [&] { points->points.resize(1); };
+    Show();
+    EXPECT_EQ(graph->marks, (std::vector<std::vector<int>>{{0, 21, 110}}));
 }
 
 TEST_F(GraphPaneTest, PointsThatCannotBeShownHarmNothing) {

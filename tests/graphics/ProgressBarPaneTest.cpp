@@ -178,3 +178,28 @@ TEST_F(ProgressBarPaneTest, DrawsNothingHarmfulForFractionsThatAreNone) {
                   2u)
             << fraction;
 }
+
+TEST_F(ProgressBarPaneTest, DrawsNothingHarmfulInRectanglesThatAreNone) {
+    Show();
+    double const none = std::numeric_limits<double>::quiet_NaN(),
+                 endless = std::numeric_limits<double>::infinity();
+    for (double width : {0.0, -5.0, 1.0, 1e300, -1e300, endless, none})
+        for (double place : {0.0, 1e300, -endless, none})
+            for (bool active : {false, true})
+                EXPECT_EQ(Traced(*bar,
+                                 [&] {
+                                     DrawProgressBarInRect({place, place, width, width}, 0.5, active);
+                                 })
+                              .size(),
+                          active ? 4u : 2u)
+                    << width << " at " << place;
+}
+
+TEST_F(ProgressBarPaneTest, OfAnyBoxKeepsItsProgress) {
+    for (Rect box : {Rect{0, 0, 0, 0}, Rect{10, 10, 5, 5}, Rect{-32768, -32768, 32767, 32767}}) {
+        bar->SetBox(&box);
+        bar->SetProgress(1, 4);
+        Show();
+        EXPECT_EQ(bar->GetFraction(), 0.25);
+    }
+}
