@@ -4,8 +4,8 @@
 #include <cstdint>
 #include <vector>
 
-// The paragraphs of a text, from 0; there is always one. Finding one by place or height, and changing one,
-// takes a time that hardly grows with their number.
+// The paragraphs of a text, from 0; there is always one. Finding one by place or height, changing one, and
+// adding or removing a few, takes a time that hardly grows with their number.
 class ParagraphIndex {
 public:
     struct Paragraph {
@@ -16,10 +16,10 @@ public:
 
     ParagraphIndex();
 
-    std::size_t Count() const { return entries.size(); }
+    std::size_t Count() const { return static_cast<std::size_t>(all.count); }
     Paragraph At(std::size_t index) const;
-    std::size_t Units() const { return unitSums.back(); }
-    long long Height() const { return static_cast<long long>(heightSums.back()); }
+    std::size_t Units() const { return static_cast<std::size_t>(all.units); }
+    long long Height() const { return static_cast<long long>(all.height); }
     // The first unit of a paragraph, and the pixels above it; the number of paragraphs stands for the end.
     std::size_t StartOf(std::size_t index) const;
     long long TopOf(std::size_t index) const;
@@ -32,8 +32,11 @@ public:
     void Replace(std::size_t first, std::size_t count, std::vector<Paragraph> const &);
     // Takes all heights as guesses; `guess` tells each from the units.
     template <class Guess> void ForgetHeights(Guess const &guess) {
-        for (Entry &entry : entries)
-            entry = Packed({entry.units, guess(entry.units), false});
+        for (Block &block : blocks) {
+            for (Entry &entry : block.entries)
+                entry = Packed({entry.units, guess(entry.units), false});
+            block.sum = SumOf(block.entries);
+        }
         Rebuild();
     }
 
@@ -42,16 +45,36 @@ private:
         std::uint32_t units;
         std::uint32_t heightAndMark; // the top bit: measured
     };
+    typedef std::vector<Entry> Entries;
+    struct Sum { // of some neighbours
+        std::uint64_t count = 0, units = 0, height = 0;
+        Sum &operator+=(Sum const &);
+        Sum &operator-=(Sum const &);
+    };
+    struct Block { // of neighbours, few enough to be walked through
+        Entries entries;
+        Sum sum;
+    };
+    struct Place { // of an entry: what comes before it, too
+        std::size_t block, within;
+        Sum before;
+    };
+
     static Entry Packed(Paragraph const &);
     static std::uint32_t HeightOf(Entry const &);
+    static Sum SumOf(Entry const &);
+    static Sum SumOf(Entries const &);
+    Place Find(std::uint64_t Sum::*what, std::uint64_t target) const;
+    Entry &EntryAt(Place const &place) { return blocks[place.block].entries[place.within]; }
+    void SetEntry(Place const &, Entry);
+    void AddToTree(std::size_t block, Sum const &added, Sum const &removed);
+    void Remove(Place const &, std::size_t count);
+    void Insert(Place const &, Entries const &);
+    void Divide(std::size_t block);
     void Rebuild();
-    template <class Sum> void Add(std::vector<Sum> &sums, std::size_t index, std::int64_t difference);
-    template <class Sum> static std::uint64_t SumBefore(std::vector<Sum> const &, std::size_t index);
-    template <class Sum> std::size_t Find(std::vector<Sum> const &, std::uint64_t place) const;
 
-    std::vector<Entry> entries;
-    // Element n holds the sum of as many entries before place n as the lowest bit of n says; an element more
-    // at the end holds the sum of all.
-    std::vector<std::uint32_t> unitSums;
-    std::vector<std::uint64_t> heightSums;
+    std::vector<Block> blocks; // none is empty
+    Sum all;
+    // Element n holds the sum of as many blocks before place n as the lowest bit of n says.
+    std::vector<Sum> tree;
 };

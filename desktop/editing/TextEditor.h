@@ -104,6 +104,7 @@ private:
     TextFragment LookingAs(std::u16string_view, EditStyle const &) const;
     void Record(std::size_t start, std::size_t end, std::u16string_view, EditHistory::Kind);
     EditStep TakeBack(EditStep const &);
+    void ShowStep(EditSelection const &);
     void EndComposing();
     void RestoreComposed();
     void BroadcastTextChanged();

@@ -63,7 +63,7 @@ void TextEditor::ReplaceText(std::size_t start, std::size_t end, TextFragment co
         return;
     }
     ParagraphIndex const &paragraphs = document.Paragraphs();
-    Rect changed = BoundsBox();
+    Rect changed = ShownBox();
     long long const top = TextTop() + paragraphs.TopOf(change.first);
     changed.top = Coordinate(top);
     if (sameCount && heightBefore == flow.Height())
@@ -162,15 +162,9 @@ bool TextEditor::Undo() {
     EndComposing();
     if (IsReadOnly() || !history.CanUndo())
         return false;
-    Alive const self = alive;
     EditStep const step = history.TakeDone();
     history.AddUndone(TakeBack(step));
-    selection = step.selectionBefore;
-    DamageAll();
-    CaretChanged();
-    FollowCaret();
-    if (!self.expired())
-        BroadcastTextChanged();
+    ShowStep(step.selectionBefore);
     return true;
 }
 
@@ -178,16 +172,21 @@ bool TextEditor::Redo() {
     EndComposing();
     if (IsReadOnly() || !history.CanRedo())
         return false;
-    Alive const self = alive;
     EditStep const step = history.TakeUndone();
     history.AddRedone(TakeBack(step));
-    selection = step.selectionAfter;
+    ShowStep(step.selectionAfter);
+    return true;
+}
+
+// After a step of the history. Whoever is told may delete this.
+void TextEditor::ShowStep(EditSelection const &selected) {
+    Alive const self = alive;
+    selection = selected;
     DamageAll();
     CaretChanged();
     FollowCaret();
     if (!self.expired())
         BroadcastTextChanged();
-    return true;
 }
 
 // Input methods

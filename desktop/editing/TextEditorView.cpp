@@ -193,10 +193,14 @@ Rect TextEditor::CaretBox() const {
 
 // Damage
 
-// A text that stands higher than its bounds may show above them.
+// A text that stands higher than its bounds may show above them, and a line's tails below them by as much: then
+// its place is a frame's, and bounds are what the frame leaves.
 Rect TextEditor::ShownBox() const {
     Rect box = BoundsBox();
-    box.top = Coordinate(box.top + std::min(baselineOffset, 0));
+    int const higher = -std::min(baselineOffset, 0);
+    box.top = Coordinate(box.top - higher);
+    if (!HasSeveralLines())
+        box.bottom = Coordinate(box.bottom + higher);
     return box;
 }
 
