@@ -21,4 +21,4 @@ void AddGraphicItems(ItemRegistry &);  // ProgressBar, Line, Picture
 void AddThreeDItems(ItemRegistry &);   // ThreeD
 void AddGraphItems(ItemRegistry &);    // Graph
 void AddZoomItems(ItemRegistry &);     // ZoomSlider, ZoomButtons
-void AddTextItems(ItemRegistry &);     // TextField, TextEdit
+void AddTextItems(ItemRegistry &);     // TextField, TextEdit, SearchField

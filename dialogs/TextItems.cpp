@@ -16,6 +16,7 @@
 #include "host/glogRec.h"
 #include "text/FontIndex.h"
 #include "text/GTextPane.h"
+#include "text/SearchFieldPane.h"
 #include "text/TextEditPane.h"
 #include "text/TextFieldFlags.h"
 #include <memory>
@@ -76,6 +77,37 @@ void ReportTextEdit(GlogPane *pane) {
         new TextEditReporter(edit);
 }
 
+class SearchReporter : public MessageReporter<SearchFieldPane_Listener> {
+public:
+    explicit SearchReporter(SearchFieldPane &pane_)
+        : MessageReporter(&pane_)
+        , pane(pane_) {}
+    void TextChanged(UString const &text) override {
+        if (MessageTrace::On())
+            MessageTrace::Write(Begin("TextChanged").Text("text", text));
+    }
+    void SearchIsCanceled() override {
+        if (MessageTrace::On())
+            MessageTrace::Write(Begin("SearchIsCanceled"));
+    }
+    void HandleSpecialKey(EventRecordAdapter *event) override {
+        if (MessageTrace::On())
+            MessageTrace::Write(
+                Begin("HandleSpecialKey").Text("key", std::string(UpArrowKey(event) ? "Up" : "Down")));
+    }
+
+private:
+    JsonLine Begin(char const *message) {
+        return MessageTrace::Begin(pane).Text("message", std::string(message));
+    }
+    SearchFieldPane &pane; // which it goes with
+};
+
+void ReportSearch(GlogPane *pane) {
+    if (SearchFieldPane *const field = dynamic_cast<SearchFieldPane *>(pane))
+        new SearchReporter(*field);
+}
+
 void DescribeSelection(JsonLine &line, unsigned int start, unsigned int end) {
     line.Integer("selectionStart", start).Integer("selectionEnd", end);
 }
@@ -88,6 +120,9 @@ bool DescribeText(GlogPane &pane, JsonLine &line) {
     } else if (TextEditPane *const edit = dynamic_cast<TextEditPane *>(&pane)) {
         edit->GetTextEdit().GetSelection(start, end);
         line.Text("text", edit->GetTextEdit().GetText());
+    } else if (SearchFieldPane *const search = dynamic_cast<SearchFieldPane *>(&pane)) {
+        line.Text("text", search->GetText());
+        return true;
     } else {
         return false;
     }
@@ -283,6 +318,21 @@ KeyList TextEditKeys() {
         .String("Text");
 }
 
+// Search fields
+
+GlogPane *MakeSearchField(glogRec *glog, GlogStyleSheet *sheet) {
+    std::unique_ptr<SearchFieldPane> pane(new (std::nothrow) SearchFieldPane);
+    if (!pane)
+        return nullptr;
+    Rect box = XMLLib::GetRect(sheet->GetItemRes(), ResourceKey("BoundsRect"));
+    pane->Init(glog);
+    if (!pane->GetGlog())
+        return nullptr;
+    SetNaturalSize(*pane, box.right - box.left, box.bottom - box.top);
+    pane->SetBox(&box);
+    return pane.release();
+}
+
 } // namespace
 
 void AddTextItems(ItemRegistry &registry) {
@@ -293,5 +343,9 @@ void AddTextItems(ItemRegistry &registry) {
                      .ReportedBy(ReportText)
                      .LayoutType(gtextResRec::kKind)
                      .FromRecord(gtextResRec::kKind, ItemType::kWholeKind, MakeTextFieldFromRecord));
+    registry.Add(ItemType("SearchField")
+                     .Keys(KeyList().Rect("BoundsRect").Required())
+                     .MadeBy(MakeSearchField)
+                     .ReportedBy(ReportSearch));
     registry.Add(ItemType("TextEdit").Keys(TextEditKeys()).MadeBy(MakeTextEdit).ReportedBy(ReportTextEdit));
 }
