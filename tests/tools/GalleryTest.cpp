@@ -23,9 +23,9 @@ protected:
 TEST_F(GalleryProgram, WritesEveryPageInBothThemesAndTwoScales) {
     ProgramResult const result = Run("--png-dir pictures");
     EXPECT_EQ(result.status, 0) << result.errors;
-    for (char const *page :
-         {"push-buttons", "labels", "layout", "help-tags", "check-boxes", "box-select", "icon-buttons",
-          "small-buttons", "scroll-bars", "scroll-pane", "grid", "lists", "select-panes", "text-fields"}) {
+    for (char const *page : {"push-buttons", "labels", "layout", "help-tags", "check-boxes", "box-select",
+                             "icon-buttons", "small-buttons", "scroll-bars", "scroll-pane", "grid", "lists",
+                             "select-panes", "text-fields", "search"}) {
         for (char const *theme : {"light", "dark"}) {
             std::string const start = std::string("pictures/") + page + '-' + theme;
             EXPECT_TRUE(Holds(result.output, start + "-1x.png\n"));
@@ -97,12 +97,12 @@ TEST_F(GalleryProgram, EndsWithOneForAnUnknownPage) {
     directory.Write("script", "");
     ProgramResult const result = Run("--page lay --script script");
     EXPECT_EQ(result.status, 1);
-    EXPECT_EQ(
-        result.errors,
-        "gallery: there is no page \"lay\"; there are push-buttons, labels, layout, help-tags, "
-        "check-boxes, box-select, icon-buttons, small-buttons, scroll-bars, "
-        "scroll-pane, grid, lists, select-panes, text-fields, static-text, pop-up-menus, durations, tabs, "
-        "modal-dialog, panner, envelope, pictures, zoom-and-progress\n");
+    EXPECT_EQ(result.errors,
+              "gallery: there is no page \"lay\"; there are push-buttons, labels, layout, help-tags, "
+              "check-boxes, box-select, icon-buttons, small-buttons, scroll-bars, "
+              "scroll-pane, grid, lists, select-panes, text-fields, static-text, search, pop-up-menus, "
+              "durations, tabs, "
+              "modal-dialog, panner, envelope, pictures, zoom-and-progress\n");
 }
 
 TEST_F(GalleryProgram, EndsWithOneWhereThereAreNoPages) {

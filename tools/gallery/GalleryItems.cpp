@@ -14,6 +14,7 @@
 #include "tools/gallery/HoldButtonPane.h"
 #include "tools/gallery/LinesPane.h"
 #include "tools/gallery/PannerPane.h"
+#include "tools/gallery/SoundListPane.h"
 #include "tools/gallery/StepperPane.h"
 #include "tools/gallery/TakeListPane.h"
 #include "tools/gallery/TrackListPane.h"
@@ -124,6 +125,19 @@ void GalleryItems::Add() {
                                .Integer("CmdClassID"))
                      .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
                          return TakeListPane::NewTakeListPane(glog, sheet);
+                     }));
+    registry.Add(ItemType("SoundList")
+                     .Keys(KeyList()
+                               .Rect("BoundsRect")
+                               .Required()
+                               .Integer("CmdID")
+                               .Required()
+                               .Integer("TextID")
+                               .Required()
+                               .Integer("CmdClassID")
+                               .Required())
+                     .MadeBy([](glogRec *glog, GlogStyleSheet *sheet) -> GlogPane * {
+                         return SoundListPane::NewSoundListPane(glog, sheet);
                      }));
     registry.Add(ItemType("Well")
                      .Keys(KeyList().Rect("BoundsRect").Required())
