@@ -8,9 +8,10 @@
 // text itself.
 namespace SearchedForm {
 
+// The form of a text that is searched.
 UString OfText(UString const &);
-// In English a letter beyond ASCII becomes a blank even where its capital is ASCII, which in a text it does
-// not.
+// The form of what is searched for. In English a letter beyond ASCII becomes a blank even where its capital
+// is ASCII, which in a text it does not.
 UString OfSearch(UString const &);
 
 } // namespace SearchedForm
