@@ -13,6 +13,9 @@ constexpr std::size_t kMaxTextUnits = 1 << 17;
 // As many as a window that is being made measures before it draws them.
 constexpr std::size_t kMaxMeasured = 256;
 constexpr std::size_t kMaxMeasuredUnits = 1 << 15;
+// A long row of tabs in every look that it can have.
+constexpr std::size_t kMaxAside = 512;
+constexpr std::size_t kMaxAsideUnits = 1 << 15;
 // Widths are small, and a list measures more strings than it shows.
 constexpr std::size_t kMaxWidths = 8192;
 constexpr std::size_t kMaxWidthUnits = 1 << 19;
@@ -22,6 +25,7 @@ struct Caches {
     // Shaped for their widths alone. Those that are drawn soon after, as labels are, move to the texts; the
     // thousands that a list measures do not drive those out.
     TextLru<std::unique_ptr<ShapedText>> measured{kMaxMeasured, kMaxMeasuredUnits};
+    TextLru<std::unique_ptr<ShapedText>> aside{kMaxAside, kMaxAsideUnits};
     TextWidths widths{kMaxWidths, kMaxWidthUnits};
     unsigned int generation = 0;
 };
@@ -33,6 +37,7 @@ Caches &CurrentCaches() {
     if (caches.generation != generation) {
         caches.texts.Clear();
         caches.measured.Clear();
+        caches.aside.Clear();
         caches.widths.Clear();
         caches.generation = generation;
     }
@@ -77,4 +82,18 @@ int ShapedTextCache::Width(std::u16string_view text, TextShape const &shape) {
     present.measured.Add(text, shape, std::move(shaped));
     present.widths.Add(text, shape, width);
     return width;
+}
+
+void ShapedTextCache::SetAside(std::u16string_view text, TextShape const &shape,
+                               std::unique_ptr<ShapedText> shaped) {
+    Caches &caches = CurrentCaches();
+    if (!shaped->IsCurrent())
+        return;
+    caches.aside.Take(text, shape); // another layout's
+    caches.aside.Add(text, shape, std::move(shaped));
+}
+
+std::unique_ptr<ShapedText> ShapedTextCache::TakeAside(std::u16string_view text, TextShape const &shape) {
+    std::unique_ptr<ShapedText> shaped = CurrentCaches().aside.Take(text, shape);
+    return shaped ? std::move(shaped) : std::make_unique<ShapedText>(text, shape);
 }

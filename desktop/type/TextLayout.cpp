@@ -3,6 +3,7 @@
 #include "desktop/resources/Utf.h"
 #include "desktop/type/PlacedText.h"
 #include "desktop/type/ShapedText.h"
+#include "desktop/type/ShapedTextCache.h"
 #include "desktop/type/TextTrace.h"
 #include <algorithm>
 #include <memory>
@@ -14,10 +15,14 @@ struct OS::TextLayout::Rep {
         std::unique_ptr<ShapedText> shaped;
     };
 
-    // The shaped text, made only when the text or the shape is another than last time.
+    // The shaped text, made only when the text or the shape is another than last time. What it was is set
+    // aside: a row of tabs, for one, goes to and fro between a few looks.
     ShapedText const &Get(Slot &slot, TextShape const &shape) {
         if (!slot.shaped || !(slot.shape == shape) || !slot.shaped->IsCurrent()) {
-            slot.shaped = std::make_unique<ShapedText>(Utf::View(text), shape);
+            std::unique_ptr<ShapedText> next = ShapedTextCache::TakeAside(Utf::View(text), shape);
+            if (slot.shaped)
+                ShapedTextCache::SetAside(Utf::View(text), slot.shape, std::move(slot.shaped));
+            slot.shaped = std::move(next);
             slot.shape = shape;
         }
         return *slot.shaped;

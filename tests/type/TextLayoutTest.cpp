@@ -3,6 +3,7 @@
 #include "desktop/resources/Resources.h"
 #include "desktop/type/FontFamilies.h"
 #include "desktop/type/FontLibrary.h"
+#include "desktop/type/ShapedTextCache.h"
 #include "desktop/type/TextLru.h"
 #include "host/VelaDrawing.h"
 #include "tests/resources/Text.h"
@@ -82,6 +83,39 @@ TEST(TextLayout, HasTheBrokenWidthAfterItWasDrawnInLines) {
     Draw(layout, "several words that need several lines", Rect{0, 0, 90, 60}, kTruncateNone, 1);
     EXPECT_GT(layout.GetWidth(), 20);
     EXPECT_LE(layout.GetWidth(), 60);
+}
+
+TEST(TextLayout, GoingBackToALookShapesNothingAnew) {
+    Canvas canvas(10, 10);
+    OS::TextLayout layout;
+    auto const update = [&](short style) {
+        UpdateTextLayout(layout, U("To and fro"), OS::Font::FamilyID(), style, 11, kAlignLeft, kTruncateNone,
+                         0, 0, 0, 0, 0, 1, 1);
+        return layout.GetWidth();
+    };
+    TextShape plain;
+    plain.font = FontSpec::Make(OS::Font::FamilyID().GetOrderedFontID(), 0, 11);
+    double const width = update(0);
+    update(1);
+    std::unique_ptr<ShapedText> first = ShapedTextCache::TakeAside(u"To and fro", plain);
+    ShapedText const *const kept = first.get();
+    ShapedTextCache::SetAside(u"To and fro", plain, std::move(first));
+    EXPECT_EQ(update(0), width);
+    update(1);
+    EXPECT_EQ(ShapedTextCache::TakeAside(u"To and fro", plain).get(), kept);
+}
+
+TEST(TextLayout, WhatIsSetAsideGoesWithTheFonts) {
+    Canvas canvas(10, 10);
+    TextShape plain;
+    plain.font = FontSpec::Make(OS::Font::FamilyID().GetOrderedFontID(), 0, 11);
+    ShapedTextCache::SetAside(u"aside", plain, ShapedTextCache::TakeAside(u"aside", plain));
+    Resources::Instance().Open(Resources::FindDirectory());
+    EXPECT_TRUE(ShapedTextCache::TakeAside(u"aside", plain)->IsCurrent());
+    std::unique_ptr<ShapedText> old = ShapedTextCache::TakeAside(u"old", plain);
+    Resources::Instance().Open(Resources::FindDirectory());
+    ShapedTextCache::SetAside(u"old", plain, std::move(old));
+    EXPECT_TRUE(ShapedTextCache::TakeAside(u"old", plain)->IsCurrent());
 }
 
 TEST(DrawTextLayoutInRect, LooksLikeDrawStringInRect) {
