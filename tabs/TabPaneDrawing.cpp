@@ -62,12 +62,13 @@ void TabPane::DrawGuts(OSRgn *) {
     GrayForeColor(kNameGray);
     GrayBackColor(kGroundGray);
     SetupFont();
-    int const visible = NumVisible();
-    for (int i = 0; i < visible; ++i)
+    // What subclasses do meanwhile may change the row.
+    for (int i = 0; i < NumVisible(); ++i)
         DrawTab(i);
     // More may be hidden than there are items, after deletions: then there is no tab for them either.
-    if (visible >= 0 && visible < CountItems())
-        DrawOverflowTab(visible);
+    int const place = NumVisible();
+    if (place >= 0 && place < CountItems())
+        DrawOverflowTab(place);
 }
 
 void TabPane::DrawPieces(Rect const &tab, int item) {
@@ -88,7 +89,7 @@ void TabPane::DrawName(Item const &item, UString const &text, Rect const &box,
 }
 
 void TabPane::DrawTab(int number) {
-    Rect const tab = itemRects[Index(number)];
+    Rect const tab = GetItemBox(number);
     DrawPieces(tab, number);
     SetTextColor(number == selectedItem);
     Rect const nameBox = AdjustNameBox(tab, number);
@@ -100,7 +101,7 @@ void TabPane::DrawTab(int number) {
 
 // Looks like a last tab that is selected, whichever is.
 void TabPane::DrawOverflowTab(int place) {
-    Rect const tab = itemRects[Index(place)];
+    Rect const tab = GetItemBox(place);
     int const selected = selectedItem;
     selectedItem = CountItems() - 1;
     DrawPieces(tab, selectedItem);

@@ -66,7 +66,8 @@ void TabPaneMouseTask::MouseTaskContinue(Point const &where) {
 // leaves the selection where it is, and tells nobody.
 void TabPaneMouseTask::MouseTaskEnd() {
     int const item = pane->selectedItem;
-    if (!pane->ShouldAllowTabSwitch(startingSelection, item))
+    PaneWatch const watch(pane); // whoever is asked may ask the user, and then anything happens
+    if (!pane->ShouldAllowTabSwitch(startingSelection, item) || !watch.PaneExists())
         return;
     pane->selectedItem = startingSelection;
     pane->SetSelectedItem(item);
@@ -120,7 +121,8 @@ void TabPane::ChooseFromOverflow(int item) {
         return;
     // The low half of the choice is the item, from 1; the other names the menu.
     int const chosen = static_cast<short>(firstHidden - 1 + choice);
-    bool const stillThere = chosen < CountItems(); // whatever ran meanwhile may have deleted some
+    bool const stillThere =
+        chosen >= 0 && chosen < CountItems(); // whatever ran meanwhile may have deleted some
     if (stillThere && chosen != selectedItem)
         SetSelectedItem(chosen);
 }

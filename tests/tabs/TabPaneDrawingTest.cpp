@@ -194,6 +194,38 @@ TEST_F(TabPaneDrawingTest, TheTabOfHiddenItemsIsNotDecorated) {
     EXPECT_EQ(pane->asked, "a02 a22 a12 on ") << "it is drawn as the last tab";
 }
 
+TEST_F(TabPaneDrawingTest, TheTabOfHiddenItemsShowsNoSignOfASelectedOne) {
+    TabPane *const pane = Make({"one", "two", "three", "four"});
+    pane->FitIntoRect({20, 10, 37, 72});
+    pane->SetSelectedItem(-1);
+    Show();
+    Lines const none = DrawingOf(*pane);
+    for (int hidden : {1, 2, 3}) {
+        pane->SetSelectedItem(hidden);
+        EXPECT_EQ(DrawingOf(*pane), none) << hidden;
+    }
+}
+
+TEST_F(TabPaneDrawingTest, ASubclassMayChangeTheRowWhileItIsDrawn) {
+    // Gives the first tab another name, and takes away the last one, when it is decorated.
+    class Changing : public OpenTabs {
+    public:
+        using OpenTabs::OpenTabs;
+        void DecorateTab(Rect, Rect, int item, int) override {
+            ++decorated;
+            if (item != 0 || CountItems() == 1)
+                return;
+            SetItemName(0, UString("longer than before", UString::kByteEncoding1));
+            DeleteItem(CountItems() - 1);
+        }
+        int decorated = 0;
+    };
+    Changing *const pane = new Changing(glog, Rect{20, 10, 37, 310}, Items({"a", "b"}), 0);
+    Show();
+    EXPECT_EQ(pane->CountItems(), 1);
+    EXPECT_GE(pane->decorated, 1);
+}
+
 TEST_F(TabPaneDrawingTest, KeepsTheColors) {
     TabPane *const pane = Make();
     Show();

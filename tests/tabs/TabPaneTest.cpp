@@ -405,6 +405,37 @@ TEST_F(TabPaneTest, AnEmptyNameIsAllPadding) {
     EXPECT_EQ(Width(pane->GetItemBox(0)), 22);
 }
 
+TEST_F(TabPaneTest, EmptyNamesHaveTabsThatCanBeChosenAndHidden) {
+    TabPane *const pane = Make({"", "", ""});
+    Show();
+    EXPECT_EQ(ResultOfClick("click" + Middle(*pane, 2)), -1);
+    EXPECT_EQ(pane->GetSelectedItem(), 2);
+    pane->FitIntoRect({20, 10, 37, 30});
+    EXPECT_TRUE(pane->TabIsVisible(2)) << "they need 6 pixels each";
+    pane->FitIntoRect({20, 10, 37, 25});
+    EXPECT_FALSE(pane->TabIsVisible(0));
+    EXPECT_EQ(ResultOfClick("click" + Middle(*pane, 0) + "\nmenu 1"), -1);
+    EXPECT_EQ(pane->GetSelectedItem(), 0);
+}
+
+TEST_F(TabPaneTest, LongNamesAreFittedAndOfferedInTheMenu) {
+    std::string const name(10000, 'W');
+    TabPane *const pane = Make({name.c_str(), name.c_str()});
+    Show();
+    pane->FitIntoRect({20, 10, 37, 200});
+    EXPECT_EQ(BoxOf(*pane), (Rect{20, 10, 37, 34}));
+    EXPECT_EQ(ResultOfClick("click" + Middle(*pane, 0) + "\nmenu 2"), -1);
+    EXPECT_EQ(pane->GetSelectedItem(), 1);
+}
+
+TEST_F(TabPaneTest, ManyItemsAreFittedAndDrawn) {
+    std::vector<TabPane::Item> const items(10000, TabPane::Item(Text("Track")));
+    TabPane *const pane = new TabPane(glog, Rect{20, 10, 37, 310}, items, 0);
+    Show();
+    EXPECT_EQ(pane->GetOptimalRect().right, 32767);
+    EXPECT_FALSE(DrawingOf(*pane).empty());
+}
+
 TEST_F(TabPaneTest, ALongNameEndsWhereCoordinatesDo) {
     std::string const name(10000, 'W');
     TabPane *const pane = Make({name.c_str(), name.c_str(), "a"});
