@@ -92,7 +92,7 @@ bool DescribeMenu(GlogPane &pane, JsonLine &line) {
         return false;
     UString name;
     menu->GetCurItemName(name);
-    line.Integer("selected", menu->GetSelectedItem())
+    line.Integer("selectedItem", menu->GetSelectedItem())
         .Integer("items", menu->CountItems())
         .Text("name", name)
         .Flag("enabled", menu->GetMenuHandle().IsEnabled());

@@ -106,6 +106,13 @@ void MenuPanel::ShowIn(DeviceScale scale_, Changed changed_) {
 
 void MenuPanel::PresentAll() { Present(Local(0, 0, box.Width(), box.Height())); }
 
+void MenuPanel::Repaint() {
+    if (!surface)
+        return;
+    DrawAll();
+    PresentAll();
+}
+
 void MenuPanel::Present(Rect const &local) {
     port.TakeTouched();
     if (!window) {
@@ -180,8 +187,7 @@ bool MenuPanel::ScrollBy(int pixels) {
     if (target == scroll)
         return false;
     scroll = target;
-    DrawAll();
-    PresentAll();
+    Repaint();
     return true;
 }
 

@@ -33,6 +33,7 @@ public:
     void ShowIn(DeviceScale, Changed);
     bool IsWindow(PlatformWindow const *asked) const { return asked && asked == window.get(); }
     void PresentAll();
+    void Repaint(); // all of it, in the colours that hold now
     bool IsShown() const { return surface != nullptr; }
     Surface const &Pixels() const { return *surface; } // while it is shown
 

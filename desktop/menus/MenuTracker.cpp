@@ -114,6 +114,11 @@ std::vector<PixelOverlay> MenuTracker::DrawnOver(Glog const &glog) {
     return any ? OpenOver(glog) : std::vector<PixelOverlay>();
 }
 
+void MenuTracker::Repaint() {
+    for (std::unique_ptr<MenuPanel> const &panel : panels)
+        panel->Repaint();
+}
+
 bool MenuTracker::OpenSubmenu(int level, int item) {
     if (Panel(level).Opened() == item && Last() > level)
         return true;

@@ -35,6 +35,7 @@ public:
     static std::vector<PixelOverlay> OpenOver(Glog const &);
     static std::vector<PixelOverlay> DrawnOver(Glog const &);
     std::vector<std::unique_ptr<MenuPanel>> const &Panels() const { return panels; }
+    void Repaint(); // all menus that are open, when colours have changed
 
 private:
     typedef MenuPanel::Part Part;

@@ -1,4 +1,5 @@
 #include "desktop/Desktop.h"
+#include "desktop/menus/MenuTracker.h"
 #include "desktop/observe/DrawingTrace.h"
 #include "desktop/observe/MessageTrace.h"
 #include "desktop/observe/TreeDump.h"
@@ -100,6 +101,8 @@ void Desktop::SetTheme(std::string const &name) {
     rep->options.theme = name;
     ThemeChangeNotificationProvider::Instance().NotifyThemeChanged();
     rep->DamageAll();
+    if (MenuTracker *const menu = MenuTracker::Open())
+        menu->Repaint();
 }
 
 std::string const &Desktop::Theme() const { return rep->options.theme; }

@@ -128,7 +128,8 @@ TEST_F(MenuItemsTest, WatchersHearOfChangesAndChoices) {
 
 TEST_F(MenuItemsTest, TheDumpTellsTheCurrentItem) {
     PopMPane *const menu = LoadMenu(MenuItems(MenuItem("a") + MenuItem("b")) + "<Selected>2</Selected>");
-    EXPECT_TRUE(Holds(Dump(menu->GetGlog()), "\"selected\":2,\"items\":2,\"name\":\"b\",\"enabled\":true"))
+    EXPECT_TRUE(
+        Holds(Dump(menu->GetGlog()), "\"selectedItem\":2,\"items\":2,\"name\":\"b\",\"enabled\":true"))
         << Dump(menu->GetGlog());
 }
 

@@ -619,6 +619,27 @@ TEST_F(PopupTracking, OtherWindowsStayDrawn) {
     EXPECT_EQ(presented[0], (Rect{1, 2, 3, 4}));
 }
 
+TEST_F(PopupTracking, AChangeOfTheThemeRecoloursWhatIsOpen) {
+    Fill(menu, {"a", "b"});
+    Below(menu, 1, {"x", "y"});
+    for (bool places : {true, false}) {
+        System().SetPlacesPopups(places);
+        desktop.SetTheme("light");
+        auto const ground = [](std::size_t level) { return Panels()[level]->Pixels().Row(3)[3]; };
+        std::vector<std::uint32_t> light, dark;
+        auto const change = After(0.2, [&] {
+            light = {ground(0), ground(1)};
+            desktop.SetTheme("dark");
+            dark = {ground(0), ground(1)};
+        });
+        Choose("key Right\nwait 0.5\nmenu 0");
+        ASSERT_EQ(dark.size(), 2u);
+        EXPECT_EQ(light[0], light[1]);
+        EXPECT_EQ(dark[0], dark[1]);
+        EXPECT_NE(light[0], dark[0]) << places;
+    }
+}
+
 // What is drawn
 
 namespace {
@@ -693,6 +714,13 @@ TEST_F(PopupTracking, TakesDecoratorsOfAnyWidth) {
     auto const look = After(0.1, [&] { box = Panels()[0]->Box(); });
     Choose("wait 1\nmenu 0");
     EXPECT_LT(box.Width(), 400);
+}
+
+TEST_F(PopupTracking, ItemsWithoutATextAreChosenLikeOthers) {
+    Fill(menu, {"", "", ""});
+    EXPECT_EQ(Choose("key Down\nkey Return"), 2);
+    EXPECT_EQ(Choose("type \"a\"\nkey Return"), 1) << "no item begins with it";
+    EXPECT_EQ(Choose("menu 3"), 3);
 }
 
 TEST_F(PopupTracking, TextsAreShortenedToTheScreen) {
