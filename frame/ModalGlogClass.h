@@ -44,7 +44,7 @@ protected:
 
 private:
     // Sees each event before the dialog does: true ends the event with the item and the value that are
-    // written here. By default false.
+    // written here; without an item the dialog goes on. By default false.
     virtual char ModalFilter(EventRecordAdapter *, short *item, int *value);
     // Takes what the user has entered; false keeps the dialog open. By default true.
     virtual char Read();

@@ -8,11 +8,12 @@ struct glogRec;
 enum RunIdleChores { kDontRunIdleChores = 0, kRunIdleChores = 1 };
 
 // Sees each event before the glog does. `self` is what DoModalGlog was given. A result other than 0 ends the
-// event: the filter has written the item that was hit and its value, and the glog does not see it.
+// event: the glog does not see it, and the item that the filter has written, with its value, counts as hit;
+// as long as the filter writes none, or -1, the glog goes on.
 typedef char (*GlogFilterHook)(glogRec *, void *self, EventRecordAdapter *, short *item, int *value);
 
 // Runs the glog, which is shown, and no other, until one of its items is hit; writes the item's number and
-// its value, and leaves the glog open. Writes -1 as the item, and perhaps no value, when there is no glog or
+// its value, and leaves the glog open. Writes -1 as the item, and 0 as the value, when there is no glog or
 // none is shown, when it goes away, and when the program is to end. The filter may be null; `self` is handed
 // to it.
 //

@@ -97,7 +97,9 @@ bool ModalRun::Filters(InputEvent const &event) {
     int value = 0;
     if (!filter(&glog, self, &record, &item, &value))
         return IsOver();
-    Hit(item, value);
+    // One that names no item has only used the event up: -1 means that the glog has gone.
+    if (item != kNothing)
+        Hit(item, value);
     return true;
 }
 
@@ -147,6 +149,7 @@ static bool IsOpen(glogRec const *record) {
 void DoModalGlog(glogRec *record, short *item, int *value, GlogFilterHook filter, void *self, bool, int,
                  int confirm, int cancel, bool, RunIdleChores chores) {
     *item = kNothing;
+    *value = 0;
     if (EventLoop::Open() && IsOpen(record))
         ModalRun(Glog::From(record), filter, self, confirm, cancel, chores).Run(item, value);
 }

@@ -135,9 +135,9 @@ TEST_F(ModalGlogTest, ForNothingAnswersNothing) {
     Answer answer = {99, 0};
     DoModalGlog(nullptr, &answer.item, &answer.value, nullptr, nullptr, false, 2, 0, 0, false,
                 kRunIdleChores);
-    EXPECT_EQ(answer.item, -1);
+    EXPECT_EQ(answer, kNone);
     ShowGlog(dialog, kHideGlog);
-    EXPECT_EQ(Run("").item, -1);
+    EXPECT_EQ(Run(""), kNone);
 }
 
 TEST_F(ModalGlogTest, AWaitThatNothingCanEndIsAnError) {
@@ -211,6 +211,14 @@ TEST_F(ModalGlogTest, TheFilterMayEndAnEvent) {
     EXPECT_EQ(Run("key Return", TakeKeys), (Answer{7, 70}));
     EXPECT_EQ(Count(calls, "other: Key 13"), 0);
     EXPECT_EQ(Run("click 50 30", TakeKeys), (Answer{2, 1}));
+}
+
+TEST_F(ModalGlogTest, AFilterThatNamesNoItemOnlyUsesTheEventUp) {
+    GlogFilterHook const takeKeys = [](glogRec *, void *, EventRecordAdapter *event, short *, int *) {
+        return char(event->what == 3 ? 1 : 0);
+    };
+    EXPECT_EQ(Run("key Return\nkey Escape\nclick 50 50", takeKeys), (Answer{3, 1}));
+    EXPECT_EQ(Count(calls, "confirm: click 50 10"), 0);
 }
 
 TEST_F(ModalGlogTest, TheFilterSeesPressesReleasesAndKeysFirst) {
