@@ -133,7 +133,8 @@ void PopMPane::ResizeToCurSel() {
     box.right = static_cast<short>(std::min<int>(box.left + width, std::numeric_limits<short>::max()));
     if (!IsInLayout())
         SetBox(&box);
-    GetLayoutRect()->SetAttribute(GlogLayoutItem::kWidth, width, GlogLayoutItem::kPixels, UString());
+    if (GetGlog())
+        GetLayoutRect()->SetAttribute(GlogLayoutItem::kWidth, width, GlogLayoutItem::kPixels, UString());
     if (pulldownLocation != kPulldown0)
         pulldownLocation = name.empty() ? kPulldownNoText : kPulldownNormal;
     InvalPane();

@@ -108,6 +108,17 @@ TEST_F(MenuItemsTest, APopUpFitsItsItem) {
     EXPECT_LT(BoxOf(narrow).right, 70);
 }
 
+TEST_F(MenuItemsTest, InAGroupAPopUpHasTheSizeOfItsLayoutProperties) {
+    glogRec *const grouped = Load(
+        Dialog("<Item type=\"Group\"><Items>" +
+               Item("PopUpMenu", kPlace + MenuItems(MenuItem("a")) + "<Layout><Width>77</Width></Layout>") +
+               "</Items></Item>"));
+    ShowGlog(grouped, kShowGlog);
+    Rect const place = GetGlogItem(grouped, 1)->GetDrawRectangle();
+    EXPECT_EQ(place.right - place.left, 77);
+    EXPECT_EQ(place.bottom - place.top, 20);
+}
+
 TEST_F(MenuItemsTest, ADisabledPopUpDoesNotOpen) {
     PopMPane *const menu = LoadMenu(MenuItems(MenuItem("a")) + "<Enabled>0</Enabled>");
     EXPECT_FALSE(menu->GetMenuHandle().IsEnabled());

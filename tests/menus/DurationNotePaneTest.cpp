@@ -206,6 +206,23 @@ TEST_F(DurationNote, DisabledIgnoresClicks) {
     EXPECT_THROW(desktop.Play("menu 1"), ScriptError) << "its menu is open";
 }
 
+TEST_F(DurationNote, DisablingItOnlyStores) {
+    pane->SetDurationValue({1, 4});
+    Show();
+    Lines const before = DrawingOf(*pane);
+    Repainted();
+    pane->SetEnable(false);
+    EXPECT_TRUE(Repainted().empty());
+    EXPECT_EQ(DrawingOf(*pane), before);
+}
+
+TEST_F(DurationNote, OffersAsManyDurationsAsAMenuHas) {
+    pane->SetMenuDurations(std::vector<DurationValue>(40000, DurationValue(1, 8)));
+    Show();
+    EXPECT_EQ(Chosen("menu 32767"), DurationValue(1, 8));
+    EXPECT_THROW(Chosen("menu 32768"), ScriptError);
+}
+
 TEST_F(DurationNote, MayBeDeletedByWhoHearsOfIt) {
     Show();
     PaneWatch const watch(pane);

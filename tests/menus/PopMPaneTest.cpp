@@ -1,5 +1,6 @@
 #include "desktop/menus/MenuRows.h"
 #include "desktop/panes/Glog.h"
+#include "host/CompoundPane.h"
 #include "menus/ScrollBarPopupMenuPane.h"
 #include "tests/VirtualPlace.h"
 #include "tests/menus/MenuTest.h"
@@ -322,6 +323,32 @@ TEST_F(PopMPaneTest, FitsNamesOfAnyLength) {
     pane->SetItemName(1, Text(std::string(20000, 'w').c_str()));
     pane->ResizeToCurSel();
     EXPECT_EQ(BoxOf(*pane).right, 32767);
+}
+
+TEST_F(PopMPaneTest, InALayoutItsWidthIsThatOfItsItem) {
+    CompoundPane *const row = new CompoundPane;
+    row->CompoundPaneInit(glog, 5);
+    row->SetUseLayout(true);
+    row->SetSizeToLayout(true);
+    PopMPane *const pane = Make();
+    row->Add(pane, -1);
+    ASSERT_TRUE(pane->IsInLayout());
+    Show();
+    SetFontData(GetIndVelaFont(0));
+    int const width = LooseStringWidth(Text("one"), 0.0f, 1.0f) + 32;
+    pane->ResizeToCurSel();
+    Rect const place = pane->GetDrawRectangle();
+    EXPECT_EQ(place.right - place.left, width);
+    EXPECT_EQ(place.bottom - place.top, 20);
+}
+
+TEST_F(PopMPaneTest, FitsItselfWithoutAGlogToo) {
+    std::unique_ptr<PopMPane> const loose(new PopMPane(nullptr, 3, 0, 137, true));
+    loose->SetMenu(OSMenuHandle::CopyPrototypeMenu(137), true);
+    Add(*loose, {"one"});
+    SetPortToGlog(glog);
+    loose->ResizeToCurSel();
+    EXPECT_GT(BoxOf(*loose).right, 32);
 }
 
 // Clicks
