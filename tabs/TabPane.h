@@ -167,6 +167,7 @@ private:
 
     // Drawing
     void DrawPieces(Rect const &tab, int item);
+    void DrawLeftEnd(Rect const &tab, int item);
     void DrawTab(int item);
     void DrawOverflowTab(int place);
     void DrawName(Item const &, UString const &, Rect const &, TextSettings::TruncateCode);

@@ -75,11 +75,28 @@ void TabPane::DrawPieces(Rect const &tab, int item) {
     short const family = static_cast<short>(GetIconSet());
     Rect body = tab;
     VelaDrawing::InsetRect(&body, kBodyInset, 0);
-    Draw1Icon(family, static_cast<short>(GetIcon(kLeftEnd, item, WindowIsActive())), tab.left, tab.top);
+    DrawLeftEnd(tab, item);
     TileIcon(&body, family, static_cast<short>(GetIcon(kBody, item, WindowIsActive())),
              static_cast<short>(GetTabBodyWidth()), static_cast<short>(GetTabHeight()));
     Draw1Icon(family, static_cast<short>(GetIcon(kRightEnd, item, WindowIsActive())),
               static_cast<short>(tab.right - GetTabEndWidth()), tab.top);
+}
+
+// All but the first have a whole body there. In a narrow tab that must not show behind a right end with round
+// corners.
+void TabPane::DrawLeftEnd(Rect const &tab, int item) {
+    auto const draw = [&] {
+        Draw1Icon(static_cast<short>(GetIconSet()),
+                  static_cast<short>(GetIcon(kLeftEnd, item, WindowIsActive())), tab.left, tab.top);
+    };
+    if (tab.right - tab.left >= GetTabBodyWidth() + GetTabEndWidth()) {
+        draw();
+        return;
+    }
+    Rect room = tab;
+    room.right = static_cast<short>(tab.right - GetTabEndWidth());
+    WithClipRect const narrowed((OS::RectBase<OS::RectTag>(room)));
+    draw();
 }
 
 void TabPane::DrawName(Item const &item, UString const &text, Rect const &box,

@@ -1,3 +1,4 @@
+#include "desktop/drawing/Surface.h"
 #include "host/Icons.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
@@ -224,6 +225,31 @@ TEST_F(TabPaneDrawingTest, ASubclassMayChangeTheRowWhileItIsDrawn) {
     Show();
     EXPECT_EQ(pane->CountItems(), 1);
     EXPECT_GE(pane->decorated, 1);
+}
+
+TEST_F(TabPaneDrawingTest, ANarrowLastTabHasRoundCornersToo) {
+    TabPane *const pane = Make({"first", "W"});
+    pane->FitIntoRect({20, 10, 37, 60});
+    ASSERT_TRUE(pane->TabIsVisible(1));
+    Rect const tab = pane->GetItemBox(1);
+    ASSERT_LT(Width(tab), 24);
+    Show();
+    Surface const &picture = *desktop.Picture(glog);
+    std::uint32_t const ground = picture.Row(tab.top - 2)[tab.right - 1];
+    EXPECT_EQ(picture.Row(tab.top)[tab.right], ground);
+    EXPECT_NE(picture.Row(tab.top)[tab.right - 8], ground);
+    // The corner's pixel is the right end's alone: over the body it would be darker.
+    TabPane *const wide = Make({"first", "as wide as it may be"});
+    Rect below{60, 10, 77, 310};
+    wide->SetBox(&below);
+    wide->Inval();
+    UpdateGlog(glog);
+    Rect const other = wide->GetItemBox(1);
+    Surface const &both = *desktop.Picture(glog);
+    for (int v = 0; v < 17; ++v)
+        for (int h = 1; h <= 2; ++h)
+            EXPECT_EQ(both.Row(tab.top + v)[tab.right - h], both.Row(other.top + v)[other.right - h])
+                << v << h;
 }
 
 TEST_F(TabPaneDrawingTest, KeepsTheColors) {
