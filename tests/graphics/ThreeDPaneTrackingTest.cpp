@@ -92,6 +92,14 @@ TEST_F(ThreeDPaneTrackingTest, ADragGoesWhereTheMouseIsFromTheBall) {
     EXPECT_EQ(axisAt(-6, 6), kAxisZ);
 }
 
+TEST_F(ThreeDPaneTrackingTest, WhereItIsUndecidedADragGoesAlongZ) {
+    Cube *const cube =
+        FromTheFront(0.2); // the ball's middle is at 100, 100; z has no direction, which counts as up
+    EXPECT_EQ(cube->GetDragAxis({90, 110}), kAxisZ) << "as far from level as from upright";
+    EXPECT_EQ(cube->GetDragAxis({92, 110}), kAxisX);
+    EXPECT_EQ(cube->GetDragAxis({90, 108}), kAxisZ) << "as far from upright as from z";
+}
+
 // Cursors
 
 TEST_F(ThreeDPaneTrackingTest, CursorsTellTheAxisAndZero) {
@@ -113,6 +121,15 @@ TEST_F(ThreeDPaneTrackingTest, CursorsTellTheAxisAndZero) {
     EXPECT_EQ(Cursor(), 653);
     falling->SetCursorForAxis(kAxisZ, true);
     EXPECT_EQ(Cursor(), 657);
+}
+
+TEST_F(ThreeDPaneTrackingTest, ALevelZCountsAsRising) {
+    Cube *const cube = FromTheFront();
+    cube->SetValue({0.9, 0.0, 0.5});
+    ASSERT_EQ(cube->ZAxisAngle(), 90);
+    Show();
+    cube->SetCursorForAxis(kAxisZ, false);
+    EXPECT_EQ(Cursor(), 652);
 }
 
 TEST_F(ThreeDPaneTrackingTest, TheCursorTellsWhatIsUnderTheMouse) {
