@@ -4,8 +4,8 @@
 //
 // exports.txt holds them all. A line without an indent is an export; under a class stand its own operations,
 // each with its table, from 0, and its place in that. A name that is lost or moved breaks programs; one that
-// is new has to be added on purpose: GLOG_UPDATE_EXPORTS=1 in the environment writes the file anew, and fails
-// that run.
+// is new has to be added on purpose: GLOG_UPDATE_EXPORTS=1 in the environment writes the file anew, in a
+// build that is not optimized, and fails that run.
 #include "tests/LibraryExports.h"
 #include "tools/TextFile.h"
 #include <algorithm>
