@@ -13,19 +13,19 @@ std::size_t const kLongest = 4;   // how many of the items that do not show are 
 // Of the items outside of the range those with the most characters, as far as there are.
 std::array<MenuItem const *, kLongest> Longest(Menu const &menu, int firstItem, int lastItem) {
     std::array<MenuItem const *, kLongest> longest{};
+    std::array<std::size_t, kLongest> lengths{};
     std::size_t least = 0; // the shortest of them, which the next longer one replaces
     int number = 0;
     for (MenuItem const &item : menu.All()) {
         ++number;
         if (number >= firstItem && number <= lastItem)
             continue;
-        if (longest[least] && item.text.length() <= longest[least]->text.length())
+        std::size_t const length = item.text.length();
+        if (length <= lengths[least])
             continue;
         longest[least] = &item;
-        auto const lengthOf = [&](std::size_t i) { return longest[i] ? longest[i]->text.length() : 0; };
-        for (std::size_t i = 0; i < kLongest; ++i)
-            if (lengthOf(i) < lengthOf(least))
-                least = i;
+        lengths[least] = length;
+        least = static_cast<std::size_t>(std::min_element(lengths.begin(), lengths.end()) - lengths.begin());
     }
     return longest;
 }

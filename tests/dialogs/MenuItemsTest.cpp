@@ -67,6 +67,13 @@ TEST_F(MenuItemsTest, SubmenusStandWithinTheirItems) {
     menu->RemoveSubMenus();
 }
 
+TEST_F(MenuItemsTest, SubmenusFiftyDeepAreRefused) {
+    std::string items = MenuItem("choose");
+    for (int i = 0; i < 50; ++i)
+        items = MenuItem("down", "<SubmenuItems>" + items + "</SubmenuItems>");
+    EXPECT_TRUE(Holds(ComplaintAboutItem("PopUpMenu", MenuItems(items)), "there is no key <SubmenuItems>"));
+}
+
 TEST_F(MenuItemsTest, TheCurrentItemIsTheOneThatIsNamed) {
     EXPECT_EQ(
         LoadMenu(MenuItems(MenuItem("a") + MenuItem("b")) + "<Selected>2</Selected>")->GetSelectedItem(), 2);

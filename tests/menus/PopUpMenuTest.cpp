@@ -559,3 +559,81 @@ TEST_F(PopUpMenuTest, AMarkThatOpeningHasSetIsGoneAfterwards) {
     Do(menu, "menu 0");
     EXPECT_FALSE(MenuAccess::Of(menu.GetMenuHandle())->Find(1)->checked);
 }
+
+// Bad input
+
+TEST_F(PopUpMenuTest, ItemsThatAreNotThereChangeNothing) {
+    Add(menu, {"a", "b"});
+    menu.Calls();
+    for (short item : {-32768, -1, 3, 32767}) {
+        menu.DeleteItem(item);
+        menu.DeleteOneMenuItem(item);
+        menu.SetEnableItem(item, 0);
+        menu.SetItemIcon(item, 5);
+        menu.SetItemCheck(item, true);
+        menu.SetItemName(item, Text("-"));
+        menu.ApplyDecoratorToItem(item, boost::make_shared<Undecorated>());
+        EXPECT_FALSE(menu.ItemIsEnabled(item)) << item;
+        EXPECT_FALSE(menu.GetEnableItem(item)) << item;
+        UString name = Text("left over");
+        menu.GetItemName(item, name);
+        EXPECT_TRUE(name.empty()) << item;
+    }
+    EXPECT_EQ(menu.CountItems(), 2);
+    EXPECT_EQ(NameIn(menu, 2), "b");
+    EXPECT_TRUE(menu.ItemIsEnabled(2));
+    EXPECT_EQ(menu.GetMenuHandle().GetMenuItemIcon(2), 0);
+    EXPECT_EQ(menu.Calls(), "");
+}
+
+TEST_F(PopUpMenuTest, ItemsAreInsertedAtTheEndThatIsNearer) {
+    Add(menu, {"b"});
+    menu.InsertItem(-5, Text("a"), PopUpMenu::kDashIsText);
+    menu.InsertItem(32767, Text("c"), PopUpMenu::kDashIsText);
+    menu.InsertSeparator(1000);
+    ASSERT_EQ(menu.CountItems(), 4);
+    EXPECT_EQ(NameIn(menu, 1), "a");
+    EXPECT_EQ(NameIn(menu, 3), "c");
+    EXPECT_FALSE(menu.ItemIsEnabled(4));
+}
+
+TEST_F(PopUpMenuTest, TenThousandItemsAreChosenFrom) {
+    ShowWindow();
+    for (int i = 0; i < 10000; ++i)
+        menu.AddItem(UString(), PopUpMenu::kDashIsText);
+    menu.SetItemName(10000, Text("last"));
+    EXPECT_EQ(Do(menu, "menu 10000"), 10000);
+    int found = 0;
+    EXPECT_TRUE(menu.FindItemByName(Text("last"), found));
+    EXPECT_EQ(found, 10000);
+    menu.DeleteAllItems();
+    EXPECT_EQ(menu.CountItems(), 0);
+}
+
+TEST_F(PopUpMenuTest, FiftySubmenusLieWithinEachOther) {
+    ShowWindow();
+    OSMenuHandle deepest = menu.GetMenuHandle();
+    std::string path = "menu 1";
+    for (int i = 0; i < 50; ++i) {
+        deepest = menu.AppendNewEmptyHierarchicalMenu(Text("down"), deepest);
+        path += "/1";
+    }
+    deepest.AppendItem(Text("choose"));
+    EXPECT_EQ(Do(menu, path), 1);
+    EXPECT_TRUE(menu.chosenMenu == deepest);
+    EXPECT_EQ(menu.chosenItem, 1);
+}
+
+TEST_F(PopUpMenuTest, ASubmenuMayOpenItsOwnParent) {
+    ShowWindow();
+    OSMenuHandle submenu = menu.AppendNewEmptyHierarchicalMenu(Text("down"));
+    submenu.AppendItem(Text("up again"));
+    submenu.AppendItem(Text("choose"));
+    OSMenuHandle parent = menu.GetMenuHandle();
+    parent.InsertMenuBeforeMenuID(-1);
+    submenu.SetMenuItemHierarchicalID(1, parent.GetMenuID());
+    EXPECT_EQ(Do(menu, "menu 1/1/1/2"), 1);
+    EXPECT_TRUE(menu.chosenMenu == submenu);
+    EXPECT_EQ(menu.chosenItem, 2);
+    parent.RemoveFromMenuList();
+}
