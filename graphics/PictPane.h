@@ -16,9 +16,9 @@ class OSRgn;
 // The order of bases is fixed.
 class PictPane : public Provider<PictPane_Listener>, public GlogPane {
 public:
-    // Attaches the pane to the glog under the number; the glog owns it. The record is only read. A pane that
-    // is as large as its picture takes the top left corner of the record's box, and reports the picture's
-    // size as its natural one.
+    // Attaches the pane to the glog under the number; the glog owns it. The record is only read and must not
+    // be null. A pane that is as large as its picture takes the top left corner of the record's box, and
+    // reports the picture's size as its natural one.
     PictPane(glogRec *, short id, gpicResRec *);
     // The same from the keys of gpicResRec and "PicAllowClickThrough", under the number 0. Calls
     // FailMemFullError when the pane cannot be made, and answers null if that returns.

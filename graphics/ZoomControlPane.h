@@ -33,7 +33,8 @@ public:
     };
 
     // Attaches the pane under the number 0, as large as its buttons: the one that zooms in is at the top, or
-    // at the right. Becomes the client's one pane. Without a glog it has no buttons.
+    // at the right. Becomes the one pane of the client, which must not be null. Without a glog it has no
+    // buttons.
     ZoomControlPane(glogRec *, Client *, Orientation);
     ~ZoomControlPane() override;
 
