@@ -6,7 +6,7 @@ namespace {
 
 constexpr std::uint32_t kMeasured = 0x80000000u;
 // Paragraphs of a block: beyond the first number it is divided into blocks of the second.
-constexpr std::size_t kMostInBlock = 512, kUsualInBlock = 256;
+constexpr std::size_t kMostInBlock = 64, kUsualInBlock = 32;
 
 // How many blocks before it an element of the tree stands for.
 std::size_t Span(std::size_t element) { return element & (~element + 1); }
