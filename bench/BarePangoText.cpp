@@ -7,9 +7,11 @@ static FontSpec SpecOf(int font) {
     return FontSpec::Make(record.family.GetOrderedFontID(), record.face, record.size);
 }
 
-BarePangoText::BarePangoText(cairo_surface_t *surface, char const *text, int font)
+BarePangoText::BarePangoText(cairo_surface_t *surface, char const *text, int font, int wrapWidth)
     : context(cairo_create(surface))
     , layout(FontLibrary::Instance().NewLayout(SpecOf(font))) {
+    if (wrapWidth > 0)
+        pango_layout_set_width(layout, wrapWidth * PANGO_SCALE);
     pango_layout_set_text(layout, text, -1);
     cairo_set_source_rgb(context, 0, 0, 0);
 }

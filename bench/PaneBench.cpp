@@ -4,15 +4,21 @@
 #include "buttons/OvalButtonPane.h"
 #include "desktop/SimulatedDesktop.h"
 #include "desktop/panes/PaneAccess.h"
+#include "frame/ResourceReading.h"
 #include "host/glogRec.h"
 #include "tests/drawing/Canvas.h"
 #include "text/LabelPane.h"
+#include "text/TextPane.h"
 #include <benchmark/benchmark.h>
 
 namespace {
 
 int const kWidth = 320, kHeight = 80;
 char const kText[] = "Send level";
+char const kLines[] =
+    "The project will be opened as a copy, since another program has it open. Changes that are made "
+    "here do not come into the original until the copy is saved in its place.";
+short const kTextWidth = 280;
 int const kFont = 0;
 short const kLeft = 20, kTop = 20, kButtonWidth = 120;
 
@@ -40,6 +46,24 @@ void LabelOurs(benchmark::State &state) {
     stage.Measure(state, *LabelPane::NewLabelPane(stage.glog, 1, &place, false, Text()));
 }
 BENCHMARK(LabelOurs)->Name("Label/ours");
+
+void StaticTextOurs(benchmark::State &state) {
+    Stage stage;
+    boost::shared_ptr<XMLLib::ContainerItem> const item = XMLLib::CreateContainer(ResourceKey("Item"));
+    XMLLib::AddRect(item, ResourceKey("BoundsRect"), {kTop, kLeft, kHeight, kLeft + kTextWidth});
+    item->AddSIntItem(ResourceKey("WrapText"), 1);
+    item->AddUStringItem(ResourceKey("Text"), ResourceKey(kLines));
+    stage.Measure(state, *new TextPane(stage.glog, item, false));
+}
+BENCHMARK(StaticTextOurs)->Name("Static text/ours");
+
+void StaticTextBare(benchmark::State &state) {
+    Canvas canvas(kWidth, kHeight);
+    BarePangoText text(canvas.surface.CairoSurface(), kLines, kFont, kTextWidth);
+    for (auto _ : state)
+        text.Draw(kLeft, kTop);
+}
+BENCHMARK(StaticTextBare)->Name("Static text/bare");
 
 void ButtonOurs(benchmark::State &state) {
     Stage stage;

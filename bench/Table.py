@@ -31,6 +31,10 @@ OUT_OF_SIGHT = 1.2
 ROWS = 1.15
 # Erasing the rows, clips and frame come to the texts.
 TEXTS_OF_A_LIST = 1.5
+# Colours and the pane's place come to the text.
+STATIC_TEXT = 1.2
+# Paragraphs that do not show cost nothing but the way to the one that is changed.
+PARAGRAPHS = 1.5
 
 RATIOS = (
     Ratio("message to nobody / pointer test", "Broadcast/ours/0", "Broadcast/bare/0", POINTER_TEST),
@@ -43,6 +47,7 @@ RATIOS = (
     Ratio("horizontal line / pixman", "Line/ours", "Line/bare", 1.5),
     Ratio("label, its layout cached / Pango", "Text/ours at a point", "Text/bare", 1.2),
     Ratio("button label, layout cached / Pango", "Text/ours in a rectangle", "Text/bare", 1.2),
+    Ratio("static text in lines / Pango", "Static text/ours", "Static text/bare", STATIC_TEXT),
     Ratio("whole label pane / Pango", "Label/ours", "Text/bare"),
     Ratio("whole oval button / pixman and Pango", "Button/ours", "Button/bare"),
     Ratio("redraw of 16 x 16 / of 200 panes", "Redraw/spot", "Redraw/all", 0.02),
@@ -70,6 +75,8 @@ RATIOS = (
     Ratio("click among 1,000,000 rows / 1,000", "List/click/1000000/manual_time", "List/click/1000/manual_time", ROWS,
           "real_time"),
     Ratio("select 1 of 1,000,000 rows / of 1,000", "List/select one/1000000", "List/select one/1000", ROWS),
+    Ratio("letter typed in 10,000 lines / 100", "TypeInTheMiddle/10000", "TypeInTheMiddle/100", PARAGRAPHS),
+    Ratio("letter typed in 1,000,000 lines / 100", "TypeInTheMiddle/1000000", "TypeInTheMiddle/100", PARAGRAPHS),
     Ratio("start to first frame / bare program", "Start/ours", "Start/bare", 1.15, "real_time"),
     Ratio("processor time of it / bare program", "Start/ours", "Start/bare"),
 )
@@ -88,6 +95,10 @@ AMOUNTS = (
     Amount("deselect all, a row", "List/deselect all/manual_time", "ns", 1, 10, "perRow"),
     Amount("memory of several rows, each", "List/bytes of several/iterations:3", "B", 1, 4, "perRow"),
     Amount("memory of one row among them, each", "List/bytes of one/iterations:3", "B", 1, 0.01, "perRow"),
+    Amount("line broken in 1,000,000, and joined", "BreakALineAndJoinIt/1000000", "ms", 1e6, 2, "cpu_time"),
+    Amount("letter typed in a field", "TypeInAField", "us", 1e3, None, "cpu_time"),
+    Amount("text of 10 MB to its first frame", "OpenTenMillionUnits", "ms", 1e6, 500),
+    Amount("memory of it, times the text", "OpenTenMillionUnits", "", 1, 6, "timesTheText"),
     Amount("drag step in a cube, at 2x", "Panner/drag step", "us", 1e3, 1000, "cpu_time"),
     Amount("graph of 1,000 points, at 2x", "Graph/repaint/1000", "us", 1e3, None, "cpu_time"),
     Amount("graph of 100,000 points, at 2x", "Graph/repaint/100000", "us", 1e3, 20000, "cpu_time"),
@@ -97,7 +108,7 @@ AMOUNTS = (
 )
 
 SIZES = {"ns": 1, "us": 1e3, "ms": 1e6, "s": 1e9, "count": 1, "bytes": 1}
-COUNTERS = ("beyond", "perRow")
+COUNTERS = ("beyond", "perRow", "timesTheText")
 MARKS = {True: "PASS", False: "over"}
 
 

@@ -6,6 +6,7 @@
 //     peer_NAME list SERVER       steps through a list of labels
 //     peer_NAME table SERVER      shows, scrolls and clicks a list of 1,000,000 rows
 //     peer_NAME tabs SERVER       gives a row of 40 tabs other widths
+//     peer_NAME text SERVER       types in the middle of a text of 10,000 lines
 //
 // Times are nanoseconds of the processor, of the program and the server together: so neither what else runs
 // on the machine counts, nor a wait for the next frame or for a press that is shown for a while, and work
@@ -15,6 +16,7 @@
 #include "bench/peers/PeerList.h"
 #include "bench/peers/PeerTable.h"
 #include "bench/peers/PeerTabs.h"
+#include "bench/peers/PeerText.h"
 #include <X11/Xlib.h>
 #include <X11/extensions/XTest.h>
 #include <cstdio>
@@ -31,6 +33,7 @@ namespace {
 int const kBuilds = 5, kRepaints = 15, kToggles = 40, kClicks = 8;
 int const kScrollSteps = 200, kScrollStep = 10; // pixels
 int const kTabWidths = 100;
+int const kKeys = 100;
 int const kTableSteps = 200, kTableJumps = 100;
 int const kStep = 37;                // from box to box; has no factor in common with their number
 int const kPressH = 6, kPressV = 11; // within a check box: on its mark in each of the toolkits
@@ -191,6 +194,15 @@ void MeasureTabs(PeerTabs &tabs) {
         Time("tabs-width", [&] { tabs.SetWidth(TabWidth(i)); });
 }
 
+void MeasureText(PeerText &text) {
+    text.Show();
+    Settle(text);
+    for (int i = 0; i < kKeys; ++i) {
+        Time("text-type", [&] { text.Type(); });
+        text.Delete(); // lines of one length throughout
+    }
+}
+
 // Rows far apart, and none twice.
 int RandomRow(int i) { return static_cast<int>(i * 382467LL % (PeerTable::kRows - PeerTable::kHeight)); }
 
@@ -238,6 +250,10 @@ int main(int argc, char **argv) {
     }
     if (what == "tabs") {
         MeasureTabs(*std::unique_ptr<PeerTabs>(NewPeerTabs(argc, argv)));
+        return EXIT_SUCCESS;
+    }
+    if (what == "text") {
+        MeasureText(*std::unique_ptr<PeerText>(NewPeerText(argc, argv)));
         return EXIT_SUCCESS;
     }
     if (what == "table") {

@@ -39,6 +39,7 @@ ROWS = (
     Row("million rows: click", "table-click", "us", 1e3, AHEAD_OR_NEAR),
     Row("million rows: first frame", "table-first-frame", "us", 1e3, AHEAD),
     Row("40 tabs in another width", "tabs-width", "us", 1e3, AHEAD),
+    Row("10,000 lines: one letter typed", "text-type", "us", 1e3, AHEAD),
     Row("first build of the program", "first-build", "us", 1e3),
     Row("first build and frame", "first-frame", "us", 1e3),
 )
@@ -59,7 +60,7 @@ def measure(program, *arguments):
 
 def run_round(directory, peer, server, values):
     program = os.path.join(directory, f"peer_{peer}")
-    for what in ("window", "offscreen", "list", "table", "tabs"):
+    for what in ("window", "offscreen", "list", "table", "tabs", "text"):
         for name, measured in measure(program, what, server).items():
             # The median of a run counts once, so that no run counts for more than another.
             values.setdefault((peer, name), []).append(statistics.median(measured))
@@ -69,14 +70,14 @@ def run_round(directory, peer, server, values):
 
 
 def print_heading(ours):
-    print((f"{'':27}" + "".join(f"{peer:>11}" for peer in (ours,) + PEERS) +
+    print((f"{'':31}" + "".join(f"{peer:>11}" for peer in (ours,) + PEERS) +
            "".join(f"   {ours + ' / ' + peer:15}" for peer in PEERS)).rstrip())
 
 
 def print_row(row, medians, ours=OURS):
     """Prints a line; how many of its goals are missed."""
     missed = 0
-    line = f"{row.what:27}"
+    line = f"{row.what:31}"
     for peer in (ours,) + PEERS:
         line += f"{medians[peer, row.name] / row.size:8.0f} {row.unit:2}"
     for peer in PEERS:
