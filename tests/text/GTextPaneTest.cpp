@@ -490,6 +490,32 @@ TEST_F(GTextPaneTest, TheFontIsThatOfTheTable) {
     EXPECT_EQ(pane->GetTextHeight() > 0, true);
 }
 
+// Neither of the others is asked to draw, and no pixel beyond the one is presented.
+TEST_F(GTextPaneTest, AKeyRedrawsItsFieldOnly) {
+    OpenTextField *const pane = Make(TestItem().String("InitTextID", "Bass").Integer("AutoScroll", 1));
+    for (short top : {4, 36, 90}) {
+        Rect box = {top, 20, short(top + 16), 200};
+        GTextPane::NewGTextPane(glog, 9, &box, Text("Other"), nullptr);
+    }
+    Repainted();
+    desktop.Play("click 190 28");
+    Repainted();
+    for (char const *key : {"type \"x\"", "key Backspace", "key Home", "key Delete", "key z command"}) {
+        desktop.TakeDrawing();
+        desktop.TakePresented(glog);
+        desktop.Play(key);
+        std::vector<Rect> const presented = Repainted();
+        EXPECT_FALSE(presented.empty()) << key;
+        Rect const box = BoxOf(*pane);
+        for (Rect const &r : presented)
+            EXPECT_TRUE(r.top >= box.top && r.left >= box.left && r.bottom <= box.bottom &&
+                        r.right <= box.right)
+                << key << ": " << r;
+        for (std::string const &line : Only("DrawTextEdit", desktop.TakeDrawing()))
+            EXPECT_EQ(line.find("Other"), std::string::npos) << key;
+    }
+}
+
 TEST_F(GTextPaneTest, ANewModeEndsTheEditingAndRepaints) {
     OpenTextField *const pane = Make();
     pane->Select(true);
