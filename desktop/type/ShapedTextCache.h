@@ -14,7 +14,7 @@ ShapedText const &GetFitted(std::u16string_view, TextShape const &);
 // Width of the whole text in one line, as Get would give it.
 int Width(std::u16string_view, TextShape const &);
 
-// Keeps for a while what a layout drops because its text is to have another shape.
+// Keeps for a while what a layout drops because it is to have another text or shape.
 void SetAside(std::u16string_view, TextShape const &, std::unique_ptr<ShapedText>);
 // The text in that shape, for the caller alone: one that was set aside, or else a new one.
 std::unique_ptr<ShapedText> TakeAside(std::u16string_view, TextShape const &);

@@ -15,13 +15,18 @@ struct OS::TextLayout::Rep {
         std::unique_ptr<ShapedText> shaped;
     };
 
-    // The shaped text, made only when the text or the shape is another than last time. What it was is set
-    // aside: a row of tabs, for one, goes to and fro between a few looks.
+    // What is dropped is set aside: a row of tabs, for one, goes to and fro between a few looks, and between
+    // its names and short ones.
+    void Drop(Slot &slot) const {
+        if (slot.shaped)
+            ShapedTextCache::SetAside(Utf::View(text), slot.shape, std::move(slot.shaped));
+    }
+
+    // The shaped text, made only when the text or the shape is another than last time.
     ShapedText const &Get(Slot &slot, TextShape const &shape) {
         if (!slot.shaped || !(slot.shape == shape) || !slot.shaped->IsCurrent()) {
             std::unique_ptr<ShapedText> next = ShapedTextCache::TakeAside(Utf::View(text), shape);
-            if (slot.shaped)
-                ShapedTextCache::SetAside(Utf::View(text), slot.shape, std::move(slot.shaped));
+            Drop(slot);
             slot.shaped = std::move(next);
             slot.shape = shape;
         }
@@ -31,9 +36,9 @@ struct OS::TextLayout::Rep {
     void SetText(UString const &newText) {
         if (text == newText)
             return;
+        Drop(whole);
+        Drop(fitted);
         text = newText;
-        whole.shaped.reset();
-        fitted.shaped.reset();
     }
 
     void Update(UString const &, TextShape, float scale);

@@ -9,6 +9,7 @@
 #include "tests/resources/Text.h"
 #include "tests/type/Canvas.h"
 #include <chrono>
+#include <functional>
 #include <gtest/gtest.h>
 #include <memory>
 #include <string>
@@ -85,24 +86,27 @@ TEST(TextLayout, HasTheBrokenWidthAfterItWasDrawnInLines) {
     EXPECT_LE(layout.GetWidth(), 60);
 }
 
-TEST(TextLayout, GoingBackToALookShapesNothingAnew) {
+TEST(TextLayout, GoingBackToALookOrATextShapesNothingAnew) {
     Canvas canvas(10, 10);
     OS::TextLayout layout;
-    auto const update = [&](short style) {
-        UpdateTextLayout(layout, U("To and fro"), OS::Font::FamilyID(), style, 11, kAlignLeft, kTruncateNone,
-                         0, 0, 0, 0, 0, 1, 1);
+    auto const update = [&](char const *text, short style) {
+        UpdateTextLayout(layout, U(text), OS::Font::FamilyID(), style, 11, kAlignLeft, kTruncateNone, 0, 0, 0,
+                         0, 0, 1, 1);
         return layout.GetWidth();
     };
     TextShape plain;
     plain.font = FontSpec::Make(OS::Font::FamilyID().GetOrderedFontID(), 0, 11);
-    double const width = update(0);
-    update(1);
-    std::unique_ptr<ShapedText> first = ShapedTextCache::TakeAside(u"To and fro", plain);
-    ShapedText const *const kept = first.get();
-    ShapedTextCache::SetAside(u"To and fro", plain, std::move(first));
-    EXPECT_EQ(update(0), width);
-    update(1);
-    EXPECT_EQ(ShapedTextCache::TakeAside(u"To and fro", plain).get(), kept);
+    for (auto const &goElsewhere : {std::function<void()>([&] { update("To and fro", 1); }),
+                                    std::function<void()>([&] { update("Elsewhere", 0); })}) {
+        double const width = update("To and fro", 0);
+        goElsewhere();
+        std::unique_ptr<ShapedText> first = ShapedTextCache::TakeAside(u"To and fro", plain);
+        ShapedText const *const kept = first.get();
+        ShapedTextCache::SetAside(u"To and fro", plain, std::move(first));
+        EXPECT_EQ(update("To and fro", 0), width);
+        goElsewhere();
+        EXPECT_EQ(ShapedTextCache::TakeAside(u"To and fro", plain).get(), kept);
+    }
 }
 
 TEST(TextLayout, WhatIsSetAsideGoesWithTheFonts) {
