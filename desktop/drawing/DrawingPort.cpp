@@ -112,7 +112,7 @@ void DrawingPort::SetSurface(Surface *newSurface, DeviceScale newScale) {
     page = nullptr;
     scale = newScale;
     clipPath.reset(); // is bound to the old device pixels
-    touched.Take();
+    TakeTouched();
     device->ForgetSurface();
 }
 
@@ -372,14 +372,31 @@ void DrawingPort::MoveDevicePixels(OSRgn const &destination, int dh, int dv) {
             scale.ToDevice(r.left, r.top, r.right, r.bottom).Intersected(whole).Intersected(source);
         if (!box.Empty())
             boxes.push_back({box.left, box.top, box.right, box.bottom});
-        touched.Add(box);
     }
     if (boxes.empty())
         return;
+    NoteMove(boxes, dx, dy);
     pixman_region32_t region;
     pixman_region32_init_rects(&region, boxes.data(), static_cast<int>(boxes.size()));
     MovePixels(*surface, region, dx, dy);
     pixman_region32_fini(&region);
+}
+
+// Moves in several boxes, and after something else that is not shown yet, are rare: those are shown by their
+// pixels.
+void DrawingPort::NoteMove(std::vector<pixman_box32_t> const &boxes, int dx, int dy) {
+    if (boxes.size() == 1 && touched.Empty() && !move) {
+        move = PixelMove{{boxes[0].x1, boxes[0].y1, boxes[0].x2, boxes[0].y2}, dx, dy};
+        return;
+    }
+    for (pixman_box32_t const &box : boxes)
+        touched.Add({box.x1, box.y1, box.x2, box.y2});
+}
+
+std::vector<DeviceRect> DrawingPort::TakeTouched() {
+    if (std::optional<PixelMove> const moved = TakeMove())
+        touched.Add(moved->to);
+    return touched.Take();
 }
 
 OSPort &OSPort::Current() {

@@ -1,6 +1,7 @@
 // The drawing port of a window.
 #pragma once
 #include "desktop/drawing/DeviceScale.h"
+#include "desktop/drawing/PixelMove.h"
 #include "desktop/drawing/TouchedBoxes.h"
 #include "host/Geometry.h"
 #include "host/OSFont.h"
@@ -11,10 +12,13 @@
 #include "host/VelaDrawing.h"
 #include <functional>
 #include <memory>
+#include <optional>
+#include <utility>
 #include <vector>
 
 class ClipPath;
 class Surface;
+struct pixman_box32;
 typedef struct _cairo cairo_t;                 // NOLINT(bugprone-reserved-identifier): Cairo's own names
 typedef struct _cairo_surface cairo_surface_t; // NOLINT(bugprone-reserved-identifier)
 
@@ -112,7 +116,12 @@ public:
 
     // The device pixels that have been drawn on since the last call, and so have to be shown: a few boxes
     // that cover them.
-    std::vector<DeviceRect> TakeTouched() { return touched.Take(); }
+    std::vector<DeviceRect> TakeTouched();
+    // The box is to be shown as if it had been drawn on.
+    void Touch(DeviceRect const &box) { touched.Add(box); }
+    // What ScrollRect moved since the last call of TakeTouched, where it is enough to move what is shown as
+    // well, before the boxes that were drawn on are shown. Who takes it has to do that, or to touch the box.
+    std::optional<PixelMove> TakeMove() { return std::exchange(move, std::nullopt); }
 
     Rect LocalToWindow(Rect const &) const; // saturates at the ends of 16 bits
     Rect WindowToLocal(Rect const &) const;
@@ -148,6 +157,7 @@ private:
     // `line` is the width of a frame in device pixels; 0 fills.
     void DrawRoundRect(Rect const &bounds, OS::Size const &corner, int line);
     void MoveDevicePixels(OSRgn const &destination, int dh, int dv);
+    void NoteMove(std::vector<pixman_box32> const &boxes, int dx, int dy);
     static DrawingPort *current;
 
     Surface *surface;
@@ -159,6 +169,7 @@ private:
     std::shared_ptr<ClipPath const> clipPath;
     GraphicsState state;
     TouchedBoxes touched;
+    std::optional<PixelMove> move; // before all that is touched
     std::function<Point()> screenPlace;
     std::unique_ptr<Device> device;
     unsigned long serial; // of all ports ever made

@@ -11,6 +11,8 @@ constexpr int kMissingIconSide = 16;
 constexpr std::size_t kMostScaledImages = 1024;
 // Asking for icons that are larger than any window would only eat memory.
 constexpr int kLongestScaledSide = 8192;
+constexpr std::size_t kMostTiledImages = 256;
+constexpr int kTiledSide = 128; // device pixels that tiles are made up to
 
 pixman_image_t *ViewOf(std::uint32_t const *pixels, int width, int height) {
     // Only ever a source, so that the pixels are not written to.
@@ -123,6 +125,30 @@ PixelImage IconSet::ScaledImage(Icon const &icon, int deviceWidth, int deviceHei
         kept = scaled.emplace(key, Scaled{std::move(surface), opaque}).first;
     }
     return {kept->second.surface->PixmanImage(), width, height, kept->second.opaque, false};
+}
+
+// How many tiles make one along a side of the area; always as many or one, so that few images are kept.
+static int TilesAlong(int tile, int area) { return area > tile ? std::max(kTiledSide / tile, 1) : 1; }
+
+PixelImage IconSet::Tiles(Icon const &icon, int deviceWidth, int deviceHeight, DeviceRect const &area) {
+    PixelImage const tile = Image(icon, deviceWidth, deviceHeight);
+    int const across = TilesAlong(tile.width, area.Width()), down = TilesAlong(tile.height, area.Height());
+    if (tile.empty || (across == 1 && down == 1))
+        return tile;
+    int const width = across * tile.width, height = down * tile.height;
+    TilesKey const key(icon.record, tile.width, tile.height, across, down);
+    auto kept = tiled.find(key);
+    if (kept == tiled.end()) {
+        if (tiled.size() >= kMostTiledImages)
+            tiled.clear();
+        std::unique_ptr<Surface> surface(new Surface(width, height));
+        for (int top = 0; top < height; top += tile.height)
+            for (int left = 0; left < width; left += tile.width)
+                pixman_image_composite32(PIXMAN_OP_SRC, tile.pixels, nullptr, surface->PixmanImage(), 0, 0, 0,
+                                         0, left, top, tile.width, tile.height);
+        kept = tiled.emplace(key, Scaled{std::move(surface), tile.opaque}).first;
+    }
+    return {kept->second.surface->PixmanImage(), width, height, tile.opaque, false};
 }
 
 void DrawMissingIcon(PixelScope &pixels, DeviceRect const &r) {

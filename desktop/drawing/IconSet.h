@@ -5,8 +5,10 @@
 #include "desktop/resources/Atlas.h"
 #include <array>
 #include <cstdint>
+#include <map>
 #include <memory>
 #include <string>
+#include <tuple>
 #include <unordered_map>
 #include <vector>
 
@@ -37,6 +39,10 @@ public:
     // The icon at that size in device pixels: straight from the atlas where that has it, else scaled and
     // kept. Only for icons with artwork; each side at least 1. Valid until the next call.
     PixelImage Image(Icon const &, int deviceWidth, int deviceHeight);
+    // The same, that many times side by side and below each other, and kept: bars are covered by dozens of
+    // small tiles, which costs more than all else in a bar. For the tiles of an area that starts at its top
+    // left.
+    PixelImage Tiles(Icon const &, int deviceWidth, int deviceHeight, DeviceRect const &area);
 
 private:
     struct Layer;
@@ -55,6 +61,8 @@ private:
 
     std::vector<std::unique_ptr<Layer>> layers;
     std::unordered_map<std::uint64_t, Scaled> scaled;
+    typedef std::tuple<AtlasFormat::IconRecord const *, int, int, int, int> TilesKey; // size of one, how many
+    std::map<TilesKey, Scaled> tiled;
     std::array<Found, kFoundPlaces> found;
 };
 

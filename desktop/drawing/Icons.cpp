@@ -33,7 +33,9 @@ void DrawTiles(PixelScope &pixels, DeviceScale scale, IconSet &set, IconSet::Ico
     bool const alike = scale.MovesExactly(tileWidth) && scale.MovesExactly(tileHeight);
     if (alike && icon.layer >= 0) { // all tiles have the same size in device pixels: one call repeats them
         DeviceRect const first = pixels.ToDevice(r.left, r.top, r.left + tileWidth, r.top + tileHeight);
-        DrawIcon(pixels, set, icon, first, box);
+        if (!first.Empty())
+            pixels.DrawImage(set.Tiles(icon, first.Width(), first.Height(), box), first.left, first.top, box,
+                             true);
         return;
     }
     for (int top = r.top; top < r.bottom; top += tileHeight) {

@@ -1,6 +1,7 @@
 #include "desktop/drawing/PixelMove.h"
 #include "desktop/drawing/Surface.h"
 #include <cstring>
+#include <pixman.h>
 
 namespace {
 
@@ -16,7 +17,7 @@ void MoveBox(Surface &surface, pixman_box32_t const &box, int dx, int dy) {
 
 } // namespace
 
-void MovePixels(Surface &surface, pixman_region32_t const &destination, int dx, int dy) {
+void MovePixels(Surface &surface, pixman_region32 const &destination, int dx, int dy) {
     int count = 0;
     pixman_box32_t const *boxes =
         pixman_region32_rectangles(const_cast<pixman_region32_t *>(&destination), &count);

@@ -77,6 +77,15 @@ private:
     pixman_image_t *image;
 };
 
+// For tiles, of which there are many, this is several times as fast as a call of pixman for each.
+void CopyRows(pixman_image_t *from, int fromH, int fromV, Surface &to, DeviceRect const &part) {
+    std::uint32_t const *const pixels = pixman_image_get_data(from);
+    int const stride = pixman_image_get_stride(from) / static_cast<int>(sizeof(std::uint32_t));
+    for (int y = part.top; y < part.bottom; ++y)
+        std::copy_n(pixels + static_cast<std::ptrdiff_t>(fromV + y - part.top) * stride + fromH, part.Width(),
+                    to.Row(y) + part.left);
+}
+
 // Drawing a tile at a time is faster than having pixman repeat an image row by row, but for the smallest.
 constexpr int kSmallestTile = 64; // device pixels
 
@@ -182,6 +191,15 @@ void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRec
     bool const repeats =
         left > box.left || top > box.top || left + image.width < box.right || top + image.height < box.bottom;
     bool const inTiles = repeats && image.width * image.height >= kSmallestTile;
+    if (inTiles && image.opaque && !faded && port.state.darken == 0) {
+        ForEachVisible(box, [&](DeviceRect const &visible) {
+            ForEachTile(visible, left, top, image.width, image.height,
+                        [&](DeviceRect const &part, int fromH, int fromV) {
+                            CopyRows(image.pixels, fromH, fromV, *port.surface, part);
+                        });
+        });
+        return;
+    }
     WithRepeat repeating(image.pixels, repeats && !inTiles);
     pixman_image_t *target = port.surface->PixmanImage();
     auto compose = [&](pixman_op_t operation, pixman_image_t *source, pixman_image_t *mask) {

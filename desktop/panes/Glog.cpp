@@ -296,9 +296,10 @@ void Glog::Update() {
         return;
     HostCall const call;
     LayoutEngine::Settle(this);
-    std::vector<DeviceRect> shownBoxes = port.TakeTouched();
-    for (DeviceRect const &bar : outline.TakeChanged(scale))
-        shownBoxes.push_back(bar);
+    std::vector<DeviceRect> shownBoxes = outline.TakeChanged(scale);
+    MoveShown(!shownBoxes.empty());
+    for (DeviceRect const &box : port.TakeTouched())
+        shownBoxes.push_back(box);
     OSRgn region = port.TakeDamage();
     Region::IntersectRect(region, port.Extent());
     if (!Region::IsEmpty(region)) {
@@ -339,6 +340,15 @@ void Glog::DrawDamage(OSRgn const &region) {
     updating.done = true;
 }
 
+// What lies over the window's pixels does not move with them.
+void Glog::MoveShown(bool outlineChanged) {
+    if (outlineChanged || outline.Shown() || !MenuTracker::DrawnOver(*this).empty())
+        return;
+    std::optional<PixelMove> const move = port.TakeMove();
+    if (move && !window->Move(*move))
+        port.Touch(move->to);
+}
+
 void Glog::Present(std::vector<DeviceRect> const &rects) {
     std::vector<PixelOverlay> const menus = MenuTracker::DrawnOver(*this);
     WithOutline const outlined(*surface, scale, outline);
@@ -347,13 +357,19 @@ void Glog::Present(std::vector<DeviceRect> const &rects) {
 }
 
 void Glog::PresentAll() {
-    if (shown && surface)
-        Present({{0, 0, surface->Width(), surface->Height()}});
+    if (!shown || !surface)
+        return;
+    port.TakeMove(); // shown with the rest
+    Present({{0, 0, surface->Width(), surface->Height()}});
 }
 
 void Glog::PresentPart(Rect const &part) {
-    if (shown && surface)
-        Present({scale.ToDevice(part.left, part.top, part.right, part.bottom)});
+    if (!shown || !surface)
+        return;
+    // What the part is to show has moved already, so what is shown can no longer be.
+    if (std::optional<PixelMove> const move = port.TakeMove())
+        port.Touch(move->to);
+    Present({scale.ToDevice(part.left, part.top, part.right, part.bottom)});
 }
 
 bool Glog::WritePng(std::string const &path, std::string &error) {

@@ -105,6 +105,7 @@ private:
     template <class Operation> void ForEachItem(Operation);
     void DrawDamage(OSRgn const &);
     void Present(std::vector<DeviceRect> const &);
+    void MoveShown(bool outlineChanged);
     void MakeSurface();
     void ReportHit(int value);
     int ClickFrom(GlogPane &topmost,

@@ -1,6 +1,7 @@
 #include "desktop/type/FontLibrary.h"
 #include "desktop/resources/Resources.h"
 #include "desktop/type/FontFamilies.h"
+#include "desktop/type/PlainShaper.h"
 #include <algorithm>
 #include <cmath>
 #include <fontconfig/fontconfig.h>
@@ -13,6 +14,7 @@ struct FontLibrary::Font {
     PangoFontDescription *description = nullptr;
     FontMetrics metrics = {0, 0, 0};
     bool measured = false;
+    std::unique_ptr<PlainShaper> plain; // of the map at that time
 
     Font() {}
     ~Font() { pango_font_description_free(description); }
@@ -190,6 +192,8 @@ void FontLibrary::CloseMap() {
     Retire(map);
     context = nullptr;
     map = nullptr;
+    for (auto &font : fonts)
+        font.second.plain.reset();
 }
 
 void FontLibrary::Close() {
@@ -233,6 +237,16 @@ PangoLayout *FontLibrary::NewLayout(FontSpec const &spec) {
     PangoLayout *layout = pango_layout_new(context);
     pango_layout_set_font_description(layout, description);
     return layout;
+}
+
+PlainShaper const &FontLibrary::Plain(FontSpec const &spec) {
+    std::unique_ptr<PlainShaper> &plain = Find(spec).plain;
+    if (!plain) {
+        PangoLayout *const layout = NewLayout(spec);
+        plain = std::make_unique<PlainShaper>(layout);
+        g_object_unref(layout);
+    }
+    return *plain;
 }
 
 FontMetrics const &FontLibrary::Metrics(FontSpec const &spec) {

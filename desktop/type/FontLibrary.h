@@ -13,6 +13,7 @@ typedef struct _PangoContext PangoContext;
 typedef struct _PangoFontDescription PangoFontDescription;
 typedef struct _PangoFontMap PangoFontMap;
 typedef struct _PangoLayout PangoLayout;
+class PlainShaper;
 
 // Whole logical pixels, the same at every scale.
 struct FontMetrics {
@@ -31,6 +32,9 @@ public:
 
     // An empty layout, the caller's, with the font: grayscale, glyphs on whole logical pixels.
     PangoLayout *NewLayout(FontSpec const &);
+    // For texts in the font that need no layout; stays the library's, and valid until another font is asked
+    // for.
+    PlainShaper const &Plain(FontSpec const &);
     FontMetrics const &Metrics(FontSpec const &);
     // How Pango is told of the font; stays the library's, and valid until the generation changes. A first
     // call may open files, after which layouts of other fonts are to be made anew.

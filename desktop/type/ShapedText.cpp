@@ -1,5 +1,6 @@
 #include "desktop/type/ShapedText.h"
 #include "desktop/type/FontLibrary.h"
+#include "desktop/type/PlainShaper.h"
 #include "desktop/type/TextSanitizer.h"
 #include <algorithm>
 #include <cmath>
@@ -8,6 +9,7 @@
 namespace {
 
 constexpr float kMostSpacing = 256;
+constexpr std::size_t kLongestPlain = 1024; // characters
 // Keeps sums of places within 32 bits whatever a text claims to be.
 constexpr int kWidestLine = 1 << 20;
 
@@ -76,14 +78,17 @@ float TextShape::CleanSpacing(float spacing) {
 }
 
 ShapedText::ShapedText(std::u16string_view text, TextShape const &shape) {
-    Shape(text, shape);
-    FontMetrics const &metrics = FontLibrary::Instance().Metrics(shape.font);
-    ascent = metrics.ascent;
-    lineHeight = metrics.LineHeight();
-    MeasureLines();
-    // A line below the text is drawn by Pango.
-    if (!(shape.font.face & FontFace::kUnderline))
-        KeepGlyphs();
+    TakeMetrics(shape.font);
+    if (!ShapePlain(text, shape)) {
+        Shape(text, shape);
+        TakeMetrics(shape.font); // of fonts that may only have been added now
+        MeasureLines();
+        // A line below the text is drawn by Pango.
+        if (!(shape.font.face & FontFace::kUnderline))
+            KeepGlyphs();
+    }
+    overhang += 1; // finer pixels may round outward once more
+    rightToLeft = !lines.empty() && lines.front().rightToLeft;
     generation = FontLibrary::Instance().Generation();
 }
 
@@ -93,6 +98,35 @@ ShapedText::~ShapedText() {
 }
 
 bool ShapedText::IsCurrent() const { return generation == FontLibrary::Instance().Generation(); }
+
+void ShapedText::TakeMetrics(FontSpec const &font) {
+    FontMetrics const &metrics = FontLibrary::Instance().Metrics(font);
+    ascent = metrics.ascent;
+    lineHeight = metrics.LineHeight();
+}
+
+// Ligatures stay with the layout, see KeepGlyphs; so does what has to be shortened or has no end.
+bool ShapedText::ShapePlain(std::u16string_view text, TextShape const &shape) {
+    bool const shortens = shape.truncation != TextSettings::kTruncateNone && shape.width >= 0;
+    if (shape.wraps || shortens || shape.spacing != 0 || (shape.font.face & FontFace::kUnderline) ||
+        text.size() > kLongestPlain)
+        return false;
+    static PangoGlyphString *const shaped = pango_glyph_string_new();
+    PangoFont *const font = FontLibrary::Instance().Plain(shape.font).Shape(text, shaped);
+    if (!font || shaped->num_glyphs != static_cast<int>(text.size()))
+        return false;
+    PangoRectangle ink, logical;
+    pango_glyph_string_extents(shaped, font, &ink, &logical);
+    int h = 0;
+    glyphs.reserve(text.size());
+    if (!AddGlyphs(font, *shaped, h, 0)) {
+        DropGlyphs();
+        return false;
+    }
+    MeasureLine(ink, logical, false);
+    lines.back().runs = 1;
+    return true;
+}
 
 void ShapedText::Shape(std::u16string_view text, TextShape const &shape) {
     std::string const utf8 = shape.wraps ? TextSanitizer::Lines(text) : TextSanitizer::OneLine(text);
@@ -115,27 +149,29 @@ void ShapedText::Replace(PangoLayout *other) {
 void ShapedText::MeasureLines() {
     int const count = pango_layout_get_line_count(layout);
     lines.reserve(static_cast<std::size_t>(count));
-    int below = 0; // ink beneath the last line's box
     for (int i = 0; i < count; ++i) {
         PangoLayoutLine *const line = pango_layout_get_line_readonly(layout, i);
         PangoRectangle ink, logical;
-        pango_layout_line_get_pixel_extents(line, &ink, &logical);
-        int const lineWidth = std::max(ClampWidth(logical.width), 0);
-        lines.push_back(
-            {0, lineWidth, pango_layout_line_get_resolved_direction(line) == PANGO_DIRECTION_RTL});
-        width = std::max(width, lineWidth);
-        if (ink.width <= 0)
-            continue;
-        int const left = ClampWidth(ink.x), right = ClampWidth(ink.x + ink.width);
-        bool const first = inkRight <= inkLeft;
-        inkLeft = first ? left : std::min(inkLeft, left);
-        inkRight = first ? right : std::max(inkRight, right);
-        below = std::max({below, -left, right - lineWidth, -ClampWidth(ink.y) - ascent,
-                          ClampWidth(ink.y + ink.height) - (lineHeight - ascent)});
+        pango_layout_line_get_extents(line, &ink, &logical);
+        MeasureLine(ink, logical, pango_layout_line_get_resolved_direction(line) == PANGO_DIRECTION_RTL);
     }
-    // Finer pixels may round outward once more.
-    overhang = below + 1;
-    rightToLeft = !lines.empty() && lines.front().rightToLeft;
+}
+
+// Whole pixels that hold both, which are in units of Pango.
+void ShapedText::MeasureLine(PangoRectangle ink, PangoRectangle logical, bool fromTheRight) {
+    pango_extents_to_pixels(&ink, nullptr);
+    pango_extents_to_pixels(&logical, nullptr);
+    int const lineWidth = std::max(ClampWidth(logical.width), 0);
+    lines.push_back({0, lineWidth, fromTheRight});
+    width = std::max(width, lineWidth);
+    if (ink.width <= 0)
+        return;
+    int const left = ClampWidth(ink.x), right = ClampWidth(ink.x + ink.width);
+    bool const first = inkRight <= inkLeft;
+    inkLeft = first ? left : std::min(inkLeft, left);
+    inkRight = first ? right : std::max(inkRight, right);
+    overhang = std::max({overhang, -left, right - lineWidth, -ClampWidth(ink.y) - ascent,
+                         ClampWidth(ink.y + ink.height) - (lineHeight - ascent)});
 }
 
 // Takes what drawing needs out of the layout, and gives the layout up. Glyphs that no font has are boxes with
@@ -163,24 +199,31 @@ bool ShapedText::AddRunsOf(PangoLayoutLine const &line) {
 }
 
 bool ShapedText::AddRun(PangoGlyphItem const &run, int &h) {
+    if (run.glyphs->num_glyphs != run.item->num_chars)
+        return false;
+    h += run.start_x_offset;
+    if (!AddGlyphs(run.item->analysis.font, *run.glyphs, h, run.y_offset))
+        return false;
+    h += run.end_x_offset;
+    return true;
+}
+
+bool ShapedText::AddGlyphs(PangoFont *of, PangoGlyphString const &string, int &h, int rise) {
     cairo_scaled_font_t *const font =
-        pango_cairo_font_get_scaled_font(reinterpret_cast<PangoCairoFont *>(run.item->analysis.font));
-    if (!font || run.glyphs->num_glyphs != run.item->num_chars)
+        pango_cairo_font_get_scaled_font(reinterpret_cast<PangoCairoFont *>(of));
+    if (!font)
         return false;
     runs.push_back({cairo_scaled_font_reference(font), 0});
-    h += run.start_x_offset;
-    for (int i = 0; i < run.glyphs->num_glyphs; ++i) {
-        PangoGlyphInfo const &glyph = run.glyphs->glyphs[i];
+    for (int i = 0; i < string.num_glyphs; ++i) {
+        PangoGlyphInfo const &glyph = string.glyphs[i];
         if (glyph.glyph & PANGO_GLYPH_UNKNOWN_FLAG)
             return false;
         if (glyph.glyph != PANGO_GLYPH_EMPTY) {
-            glyphs.push_back(
-                {glyph.glyph, h + glyph.geometry.x_offset, glyph.geometry.y_offset - run.y_offset});
+            glyphs.push_back({glyph.glyph, h + glyph.geometry.x_offset, glyph.geometry.y_offset - rise});
             ++runs.back().glyphs;
         }
         h += glyph.geometry.width;
     }
-    h += run.end_x_offset;
     return true;
 }
 

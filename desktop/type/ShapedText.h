@@ -11,9 +11,12 @@
 
 typedef struct _cairo cairo_t;
 typedef struct _cairo_scaled_font cairo_scaled_font_t;
+typedef struct _PangoFont PangoFont;
 typedef struct _PangoGlyphItem PangoGlyphItem;
+typedef struct _PangoGlyphString PangoGlyphString;
 typedef struct _PangoLayout PangoLayout;
 typedef struct _PangoLayoutLine PangoLayoutLine;
+typedef struct _PangoRectangle PangoRectangle;
 
 // All that shaping depends on beside the text.
 struct TextShape {
@@ -80,12 +83,16 @@ private:
         int width;
         bool rightToLeft;
     };
+    void TakeMetrics(FontSpec const &);
+    bool ShapePlain(std::u16string_view, TextShape const &);
     void Shape(std::u16string_view, TextShape const &);
     void Replace(PangoLayout *);
     void MeasureLines();
     void KeepGlyphs();
     bool AddRunsOf(PangoLayoutLine const &);
     bool AddRun(PangoGlyphItem const &, int &h);
+    bool AddGlyphs(PangoFont *, PangoGlyphString const &, int &h, int rise);
+    void MeasureLine(PangoRectangle ink, PangoRectangle logical, bool fromTheRight);
     void DropGlyphs();
     void DrawRuns(cairo_t *, Run const *&, Glyph const *&, Line const &, int h, int baseline) const;
 

@@ -8,6 +8,7 @@
 
 class PlatformWindow;
 class Surface;
+struct PixelMove;
 
 struct WindowSpec {
     std::string title;             // UTF-8
@@ -38,6 +39,9 @@ public:
     // Copies the rectangles of the surface to the screen. They may reach beyond the surface; what does is not
     // copied. The screen may change only after the call has returned, but the surface is not read any more.
     virtual void Present(Surface const &, DeviceRect const *, std::size_t count) = 0;
+    // Moves what the screen shows as the pixels of the surface that was presented have been moved. False
+    // where that cannot be done: then the box is to be presented.
+    virtual bool Move(PixelMove const &) { return false; }
     // Returns when the screen shows all that was presented.
     virtual void Finish() {}
     // Lets an input method work at the place (content coordinates), or stops it.

@@ -1,11 +1,14 @@
 #include "desktop/windows/SdlPicture.h"
 #include "desktop/drawing/FreshMemory.h"
+#include "desktop/drawing/PixelMove.h"
 #include "desktop/drawing/Surface.h"
+#include "desktop/windows/SdlScreen.h"
 #include "desktop/windows/ShownPixels.h"
 #include <SDL.h>
 #include <SDL_syswm.h>
 #include <X11/Xutil.h>
 #include <X11/extensions/XShm.h>
+#include <algorithm>
 #include <sys/ipc.h>
 #include <sys/shm.h>
 #include <vector>
@@ -16,12 +19,15 @@ static int const kOwnerOnly = 0600;
 
 struct SdlPicture::Shared {
     Display *display = nullptr; // SDL's
+    SDL_Window *of = nullptr;
     ::Window window = 0;
     GC context = nullptr;
     XImage *image = nullptr;
     XShmSegmentInfo segment = {};
     bool attached = false;
+    bool watched = false; // for what a move misses
     std::unique_ptr<ShownPixels> pixels;
+    bool lost = true;                // the window does not show all that was taken
     std::vector<DeviceRect> changed; // of one call; kept for its memory
     unsigned long shown = 0;         // number of the last request to the server that shows pixels
 
@@ -48,7 +54,8 @@ SdlPicture::Shared::~Shared() {
         shmdt(segment.shmaddr);
 }
 
-bool SdlPicture::Shared::FindWindow(SDL_Window *of) {
+bool SdlPicture::Shared::FindWindow(SDL_Window *of_) {
+    of = of_;
     SDL_SysWMinfo info;
     SDL_VERSION(&info.version);
     if (SDL_GetWindowWMInfo(of, &info) != SDL_TRUE || info.subsystem != SDL_SYSWM_X11)
@@ -145,10 +152,16 @@ void SdlPicture::Shared::Put(DeviceRect const &rect) {
                  static_cast<unsigned int>(rect.Width()), static_cast<unsigned int>(rect.Height()), False);
 }
 
+static bool Covers(DeviceRect const *rects, std::size_t count, DeviceRect const &all) {
+    return std::any_of(rects, rects + count, [&](DeviceRect const &rect) { return rect.Contains(all); });
+}
+
 void SdlPicture::Keep(Surface const &surface, DeviceRect const *rects, std::size_t count) {
     shared->changed.clear();
     for (DeviceRect const *rect = rects; rect != rects + count; ++rect)
         shared->pixels->Take(surface, *rect, shared->changed);
+    if (shared->lost && Covers(rects, count, {0, 0, Width(), Height()}))
+        shared->lost = false;
 }
 
 void SdlPicture::Show(Surface const &surface, DeviceRect const *rects, std::size_t count) {
@@ -172,7 +185,27 @@ void SdlPicture::ShowAll() {
     XFlush(shared->display);
 }
 
-void SdlPicture::Forget() { shared->pixels->ForgetAll(); }
+// The server reads our memory when it gets to it: were it behind, a move might take along what came later.
+bool SdlPicture::Move(PixelMove const &move) {
+    if (shared->lost)
+        return false;
+    if (!shared->watched) {
+        SdlScreen::WatchMoves(shared->of);
+        shared->watched = true;
+    }
+    Finish();
+    DeviceRect const from = move.From(), &to = move.to;
+    XCopyArea(shared->display, shared->window, shared->window, shared->context, from.left, from.top,
+              static_cast<unsigned int>(to.Width()), static_cast<unsigned int>(to.Height()), to.left, to.top);
+    shared->pixels->Forget(to);
+    XFlush(shared->display);
+    return true;
+}
+
+void SdlPicture::Forget() {
+    shared->pixels->ForgetAll();
+    shared->lost = true;
+}
 
 void SdlPicture::Finish() {
     if (IsBehind(shared->display, shared->shown))

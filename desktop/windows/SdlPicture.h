@@ -6,6 +6,7 @@
 
 struct SDL_Window;
 class Surface;
+struct PixelMove;
 
 // SDL has such memory too, but waits for the server's answer each time some of it is shown. Here a program
 // goes on while the server copies: at a click that wait would cost as much as all the rest.
@@ -29,6 +30,10 @@ public:
     void Keep(Surface const &, DeviceRect const *, std::size_t count);
     // Has the server copy all that was taken over.
     void ShowAll();
+    // Has the server move what the window shows; Show is for what was not in the window before. False where
+    // the server may not have all of that: then the box is to be shown. What lies behind another window only
+    // comes to light when the server has said so: SdlWindow::Lost is called for it.
+    bool Move(PixelMove const &);
     // The server has lost what it showed.
     void Forget();
     // Returns when the server has copied all that is to be shown.

@@ -2,7 +2,9 @@
 #include <SDL.h>
 #include <SDL_syswm.h>
 #include <X11/extensions/XInput2.h>
+#include <algorithm>
 #include <poll.h>
+#include <vector>
 
 static Display *theDisplay = nullptr; // SDL's
 
@@ -41,4 +43,53 @@ bool SdlScreen::Wait(int milliseconds) {
     return poll(&connection, 1, milliseconds) != 0; // an interruption by a signal counts
 }
 
-void SdlScreen::Forget() { theDisplay = nullptr; }
+namespace {
+struct Watched {
+    ::Window window;
+    Uint32 id; // SDL's
+};
+} // namespace
+
+static std::vector<Watched> theWatched;
+
+// Called by SDL for every event before it is queued, and for every message of the server while it hands those
+// on: they end here, one of missing pixels as the exposure that SDL would not make of it.
+static int SDLCALL TakeMissing(void *, SDL_Event *event) {
+    if (event->type != SDL_SYSWMEVENT)
+        return 1;
+    XEvent const &message = event->syswm.msg->msg.x11.event;
+    if (message.type != GraphicsExpose)
+        return 0;
+    auto const found = std::find_if(theWatched.begin(), theWatched.end(), [&](Watched const &watched) {
+        return watched.window == message.xgraphicsexpose.drawable;
+    });
+    if (found == theWatched.end())
+        return 0;
+    SDL_WindowEvent exposure = {};
+    exposure.type = SDL_WINDOWEVENT;
+    exposure.windowID = found->id;
+    exposure.event = SDL_WINDOWEVENT_EXPOSED;
+    event->window = exposure;
+    return 1;
+}
+
+void SdlScreen::WatchMoves(SDL_Window *window) {
+    SDL_SysWMinfo info;
+    SDL_VERSION(&info.version);
+    if (SDL_GetWindowWMInfo(window, &info) != SDL_TRUE || info.subsystem != SDL_SYSWM_X11)
+        return;
+    if (theWatched.empty()) {
+        SDL_SetEventFilter(TakeMissing, nullptr);
+        SDL_EventState(SDL_SYSWMEVENT, SDL_ENABLE);
+    }
+    ::Window const watched = info.info.x11.window; // the server gives numbers anew
+    theWatched.erase(std::remove_if(theWatched.begin(), theWatched.end(),
+                                    [&](Watched const &other) { return other.window == watched; }),
+                     theWatched.end());
+    theWatched.push_back({watched, SDL_GetWindowID(window)});
+}
+
+void SdlScreen::Forget() {
+    theDisplay = nullptr;
+    theWatched.clear();
+}

@@ -21,6 +21,10 @@ bool CanWait();
 // something came. SDL, whose own wait looks for events first, does not learn of it.
 bool Wait(int milliseconds);
 
+// From now on SDL reports the window as exposed, as it does for what other windows uncover, when pixels are
+// moved within it and some of them were not on the screen.
+void WatchMoves(SDL_Window *);
+
 // SDL has given up its connection to the server.
 void Forget();
 

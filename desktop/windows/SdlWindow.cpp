@@ -221,6 +221,14 @@ void SdlWindow::Lost() {
         picture->Forget();
 }
 
+// Between a resize and the surface that answers it, a part of the picture is not on the screen.
+bool SdlWindow::Move(PixelMove const &move) {
+    int deviceWidth = 0, deviceHeight = 0;
+    SDL_GetWindowSize(window, &deviceWidth, &deviceHeight);
+    return picture && !keptHidden && picture->Width() == deviceWidth && picture->Height() == deviceHeight &&
+           (SDL_GetWindowFlags(window) & SDL_WINDOW_HIDDEN) == 0 && picture->Move(move);
+}
+
 void SdlWindow::Finish() {
     if (picture)
         picture->Finish();

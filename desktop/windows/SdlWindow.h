@@ -54,6 +54,7 @@ public:
     Point ScreenPlace() const override;
     double Scale() const override { return scale.Factor(); }
     void Present(Surface const &, DeviceRect const *, std::size_t count) override;
+    bool Move(PixelMove const &) override;
     void Finish() override;
     void StartTextInput(Rect const &caret) override;
     void StopTextInput() override;

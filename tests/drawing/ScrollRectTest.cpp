@@ -162,3 +162,52 @@ TEST(ScrollRect, APathInTheClipMakesItDamageAll) {
     ScrollBy({0, 0, 10, 10}, 1, 0);
     EXPECT_EQ(Region::Area(canvas.port.GetDamage()), 100);
 }
+TEST(ScrollRectMove, IsTakenInPlaceOfItsPixels) {
+    Canvas canvas(100, 100);
+    canvas.port.TakeTouched();
+    ScrollBy({10, 10, 90, 90}, 0, -20);
+    std::optional<PixelMove> const move = canvas.port.TakeMove();
+    ASSERT_TRUE(move);
+    EXPECT_EQ(move->dx, 0);
+    EXPECT_EQ(move->dy, -20);
+    EXPECT_EQ(move->to.top, 10);
+    EXPECT_EQ(move->to.bottom, 70);
+    EXPECT_EQ(move->From().top, 30);
+    EXPECT_EQ(move->From().bottom, 90);
+    EXPECT_TRUE(canvas.port.TakeTouched().empty());
+    EXPECT_FALSE(canvas.port.TakeMove());
+}
+
+TEST(ScrollRectMove, ThatNobodyTakesIsTouched) {
+    Canvas canvas(100, 100);
+    canvas.port.TakeTouched();
+    ScrollBy({10, 10, 90, 90}, 0, -20);
+    std::vector<DeviceRect> const touched = canvas.port.TakeTouched();
+    ASSERT_EQ(touched.size(), 1u);
+    EXPECT_EQ(touched[0].top, 10);
+    EXPECT_EQ(touched[0].bottom, 70);
+    EXPECT_FALSE(canvas.port.TakeMove());
+}
+
+TEST(ScrollRectMove, OfWhatWasDrawnOnSinceIsTouched) {
+    Canvas canvas(100, 100);
+    canvas.port.TakeTouched();
+    Rect const drawn = {40, 40, 50, 50};
+    VelaDrawing::PaintRect(&drawn);
+    ScrollBy({10, 10, 90, 90}, 0, -20);
+    EXPECT_FALSE(canvas.port.TakeMove());
+    EXPECT_FALSE(canvas.port.TakeTouched().empty());
+}
+
+TEST(ScrollRectMove, ASecondOneIsTouched) {
+    Canvas canvas(100, 100);
+    canvas.port.TakeTouched();
+    ScrollBy({10, 10, 90, 90}, 0, -20);
+    ScrollBy({10, 10, 90, 90}, 0, -5);
+    std::optional<PixelMove> const move = canvas.port.TakeMove();
+    ASSERT_TRUE(move);
+    EXPECT_EQ(move->dy, -20);
+    std::vector<DeviceRect> const touched = canvas.port.TakeTouched();
+    ASSERT_EQ(touched.size(), 1u);
+    EXPECT_EQ(touched[0].bottom, 85);
+}

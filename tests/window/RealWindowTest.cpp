@@ -1,3 +1,4 @@
+#include "desktop/drawing/PixelMove.h"
 #include "tests/window/WindowTest.h"
 #include <cstdlib>
 #include <stdexcept>
@@ -283,6 +284,78 @@ TEST_F(Picture, WhatIsPresentedAgainAfterItWasLostIsShownAgain) {
     ASSERT_EQ(Await(InputEvent::kExposed).window, below.get());
     below->Present(surface, &all, 1);
     ExpectPixel(*below, 199, 149, 0x336699);
+}
+
+// Every row has a colour of its own.
+std::uint32_t ColourOfRow(int y) { return static_cast<std::uint32_t>(y) * 0x010101U; }
+
+void FillRows(Surface &surface, int from) {
+    for (int y = 0; y < surface.Height(); ++y)
+        std::fill(surface.Row(y), surface.Row(y) + surface.Width(), 0xFF000000U | ColourOfRow(y + from));
+}
+
+TEST_F(Picture, MovesWithoutItsPixelsBeingPresented) {
+    Window window = Open(At(200, 150, 100, 80));
+    Drain();
+    Surface surface(100, 80);
+    FillRows(surface, 0);
+    DeviceRect all = {0, 0, 100, 80}, uncovered = {0, 70, 100, 80};
+    window->Present(surface, &all, 1);
+    ASSERT_TRUE(window->Move({{0, 0, 100, 70}, 0, -10}));
+    FillRows(surface, 10);
+    window->Present(surface, &uncovered, 1);
+    ExpectPixel(*window, 50, 0, ColourOfRow(10));
+    ExpectPixel(*window, 50, 69, ColourOfRow(79));
+    ExpectPixel(*window, 50, 79, ColourOfRow(89));
+    EXPECT_TRUE(Drain(InputEvent::kExposed).empty());
+}
+
+TEST_F(Picture, MovedTwiceIsShownAgainWhereItIsPresented) {
+    Window window = Open(At(200, 150, 100, 80));
+    Surface surface(100, 80);
+    FillRows(surface, 0);
+    DeviceRect all = {0, 0, 100, 80};
+    window->Present(surface, &all, 1);
+    ASSERT_TRUE(window->Move({{0, 0, 100, 70}, 0, -10}));
+    ASSERT_TRUE(window->Move({{0, 10, 100, 80}, 0, 10}));
+    ExpectPixel(*window, 50, 10, ColourOfRow(10));
+    ExpectPixel(*window, 50, 0, ColourOfRow(10)); // nothing moved into it
+    window->Present(surface, &all, 1);
+    ExpectPixel(*window, 50, 0, ColourOfRow(0));
+}
+
+TEST_F(Picture, OfWhichAPartThatMovesIsBehindAnotherWindowIsAskedFor) {
+    Window below = Open(At(200, 150, 200, 150));
+    Surface surface(200, 150);
+    FillRows(surface, 0);
+    DeviceRect all = {0, 0, 200, 150};
+    below->Present(surface, &all, 1);
+    Window above = Open(At(250, 200, 200, 150));
+    Fill(*above, 0xC00000);
+    Drain();
+    ASSERT_TRUE(below->Move({{0, 0, 200, 90}, 0, -60}));
+    EXPECT_EQ(Await(InputEvent::kExposed).window, below.get());
+    FillRows(surface, 60);
+    below->Present(surface, &all, 1);
+    ExpectPixel(*below, 150, 10, ColourOfRow(70));
+}
+
+TEST_F(Picture, ThatIsNotWhollyOnTheScreenDoesNotMove) {
+    Window window = System().CreateWindow(At(200, 150, 100, 80));
+    PixelMove const move = {{0, 0, 100, 70}, 0, -10};
+    EXPECT_FALSE(window->Move(move));
+    Surface surface(100, 80), larger(120, 80);
+    DeviceRect all = {0, 0, 120, 80}, part = {0, 0, 50, 80};
+    window->Present(surface, &all, 1);
+    EXPECT_FALSE(window->Move(move)) << "hidden";
+    ShowActive(*window);
+    Drain();
+    window->Present(surface, &part, 1);
+    EXPECT_FALSE(window->Move(move)) << "lost, and presented in part";
+    window->Present(surface, &all, 1);
+    EXPECT_TRUE(window->Move(move));
+    window->Present(larger, &all, 1);
+    EXPECT_FALSE(window->Move(move)) << "larger than the window";
 }
 
 TEST_F(Picture, ASurfaceOfTheOldSizeIsStillShownAfterAResize) {
