@@ -11,6 +11,7 @@
 #include "host/EventRecordAdapter.h"
 #include "host/GlogStyleSheet.h"
 #include "host/NamedColors.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
@@ -260,7 +261,10 @@ public:
 protected:
     bool BecomeGopherOnSelect() override { return true; }
     int HandleClick(EventRecordAdapter *event) override {
-        Select(true);
+        PaneWatch const self(this);
+        Select(true); // the pane that was selected before tells its listeners
+        if (!self.PaneExists())
+            return -1;
         Prepare();
         return GetTextEdit().HandleEvent(event) ? -1 : 0;
     }

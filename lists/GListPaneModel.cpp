@@ -204,7 +204,7 @@ void GListPane::AutoResize(short dh, short dv) {
 
 void GListPane::GetFirstAndLast(int *first, int *last) const {
     *first = topLine;
-    *last = static_cast<int>(std::min<long long>(0LL + topLine + numDisplayed - 1, numItems - 1));
+    *last = Saturated(std::min<long long>(0LL + topLine + numDisplayed - 1, numItems - 1));
 }
 
 bool GListPane::Shows(int line) const {

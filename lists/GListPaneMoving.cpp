@@ -62,10 +62,10 @@ int GListPane::MoveItem(Point point) {
     PaneWatch const self(this);
     DeselectAll();
     Rect row;
-    if (!self.PaneExists() || !GetRowBox(from, row))
+    if (!self.PaneExists() || !HasRow(from) || !GetRowBox(from, row))
         return kStays;
     int dropV = 0;
-    if (!DragRow(point, row, dropV) || !self.PaneExists())
+    if (!DragRow(point, row, dropV) || !self.PaneExists() || !HasRow(from))
         return kStays;
     int to = PlaceOfDrop({Pixel16(dropV), point.h});
     if (to == from)

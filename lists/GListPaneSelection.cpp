@@ -4,12 +4,14 @@
 #include <algorithm>
 
 namespace {
-int const kNone = -1;
-}
 
-bool GListPane::HasFlags() const {
-    return res.selMode == kListSelectSeveral || res.selMode == kListSelectToggle;
-}
+int const kNone = -1;
+
+bool NeedsFlags(GListSelectionMode mode) { return mode == kListSelectSeveral || mode == kListSelectToggle; }
+
+} // namespace
+
+bool GListPane::HasFlags() const { return NeedsFlags(res.selMode); }
 
 bool GListPane::SelModeDiscontig() { return HasFlags(); }
 
@@ -112,7 +114,7 @@ void GListPane::SelectAllAndTell(PaneWatch const &self) {
 void GListPane::SelectAllAtOnce() {
     int first = 0, last = 0;
     GetFirstAndLast(&first, &last);
-    for (int row = last; row >= first; --row)
+    for (int row = last; row >= std::max(first, 0); --row)
         SelectByAll(row);
     selected.SetZerosToOne();
 }
@@ -167,13 +169,15 @@ void GListPane::SetSelMode(GListSelectionMode mode) {
     DeselectAll();
     if (!self.PaneExists() || mode == res.selMode)
         return;
-    bool const hadFlags = HasFlags();
-    GListSelectionMode const former = res.selMode;
+    // The flags first: without memory for them, nothing changes.
+    bool const getsFlags = !HasFlags() && NeedsFlags(mode);
+    if (getsFlags && !MakeFlags(numItems))
+        return;
     res.selMode = mode;
-    if (hadFlags)
+    if (HasFlags())
+        selected.SetAllToZero();
+    else
         selected.Clear();
-    if (HasFlags() && !MakeFlags(numItems))
-        res.selMode = former;
 }
 
 // Marks
@@ -213,7 +217,7 @@ void GListPane::InvertSelection() {
         return;
     int first = 0, last = 0;
     GetFirstAndLast(&first, &last);
-    for (int row = last; row >= first; --row) {
+    for (int row = last; row >= std::max(first, 0); --row) {
         if (selected.IsSelected(row))
             InvalLine(row);
     }

@@ -8,6 +8,7 @@
 #include "host/glogRec.h"
 #include "lists/GListPane.h"
 #include "scrolling/CurrentTick.h"
+#include "scrolling/Truncation.h"
 #include <algorithm>
 #include <limits>
 
@@ -237,7 +238,7 @@ private:
             return;
         }
         nextScrollTick = now + kTicksPerScroll;
-        list.SetScrollPosition(static_cast<int>(0LL + list.topLine + direction));
+        list.SetScrollPosition(Saturated(0LL + list.topLine + direction));
     }
 
     GListPane &list;
@@ -303,6 +304,8 @@ bool GListPane::TrackCol(int line, int column) {
     Point point = {row.top, row.left};
     InvertItemRect(line, true);
     UpdateGlog(glog);
+    if (!self.PaneExists())
+        return false;
     Prepare();
     while (MouseIsDragging(&point, nullptr) && self.PaneExists()) {
         if (VelaDrawing::PtInRect(point, &cell) != isInside) {
@@ -313,7 +316,9 @@ bool GListPane::TrackCol(int line, int column) {
         if (!self.PaneExists())
             return false;
         UpdateGlog(glog);
+        if (!self.PaneExists())
+            return false;
         Prepare();
     }
-    return isInside;
+    return isInside && self.PaneExists();
 }

@@ -10,8 +10,9 @@
 
 namespace {
 
-int const kTextFont = 0; // in the font table
-int const kGap = 4;      // pixels between icon and text
+int const kTextFont = 0;          // in the font table
+int const kGap = 4;               // pixels between icon and text
+int const kMostLayouts = 1 << 16; // beyond them cells share
 int const kCentred = 1, kOneLine = 0, kUpright = 0, kNothing = 0;
 
 // The column's part of the row without its margins.
@@ -49,6 +50,8 @@ void ListTextDrawer::SetTruncation(TextSettings::TruncateCode code) { truncation
 
 void ListTextDrawer::DrawLine(int line, Rect *rowBox, bool hilite) {
     Rect const row = *rowBox;
+    if (line < 0 || !list->GetColumnList())
+        return;
     SaveColors const colors;
     if (hilite && HighlightsItself()) {
         SetUserHiliteColorAsForeColor();
@@ -72,7 +75,8 @@ bool ListTextDrawer::HighlightsItself() const {
 
 // There are layouts for as many rows as show and one more: while one scrolls in, another is still to be seen.
 OS::TextLayout &ListTextDrawer::LayoutOf(int line, int column) {
-    int const rows = list->GetNumDisplayed() + 1, columns = list->GetColumnList()->GetNumColumns();
+    int const columns = std::max<int>(list->GetColumnList()->GetNumColumns(), 1);
+    int const rows = std::clamp(list->GetNumDisplayed() + 1, 1, std::max(kMostLayouts / columns, 1));
     if (rows > rowsKept || columns != columnsKept) {
         rowsKept = std::max(rows, rowsKept);
         columnsKept = columns;

@@ -1,5 +1,6 @@
 #include "lists/SelectPane.h"
 #include "host/NamedColors.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
 #include "scrolling/Truncation.h"
@@ -67,8 +68,10 @@ void SelectPane::Deactivate() {
 void SelectPane::Select(bool on) {
     if (on == IsSelected())
         return;
-    GlogPane::Select(on);
-    Inval();
+    PaneWatch const self(this);
+    GlogPane::Select(on); // the pane that was selected before tells its listeners
+    if (self.PaneExists())
+        Inval();
 }
 
 unsigned char SelectPane::Selectable() { return true; }

@@ -3,7 +3,20 @@
 #include "host/GlogPane.h"
 #include "host/glogRec.h"
 
-EditOpInterface::EditOpInterface() { EditCommands::Install(DoEditOp); }
+namespace {
+
+// What the keyboard calls. A shortcut that the active item knows and cannot carry out now is lost: nobody
+// else may take it for text.
+bool DoIfPossible(glogRec *glog, CommandSpecifier const &command, bool &commits) {
+    if (EditOpInterface::CanDoEditOp(glog, command))
+        return EditOpInterface::DoEditOp(glog, command, commits);
+    commits = false;
+    return EditOpInterface::GetActiveItemInterface(glog) && EditOpInterface::KnowsCommand(command);
+}
+
+} // namespace
+
+EditOpInterface::EditOpInterface() { EditCommands::Install(DoIfPossible); }
 
 bool EditOpInterface::KnowsCommand(CommandSpecifier const &command) {
     switch (command.commandID) {

@@ -107,6 +107,8 @@ GTextPane::~GTextPane() {
 void GTextPane::SetDrawingHelper(AutoPtr<GTextPaneDrawingHelper> helper) {
     GTextPaneDrawingHelper *const former = drawingHelper;
     drawingHelper = helper.release();
+    if (former == drawingHelper)
+        return;
 #pragma GCC diagnostic push
 #pragma GCC diagnostic ignored "-Wdelete-non-virtual-dtor"
 #ifdef __clang__
@@ -270,7 +272,7 @@ Rect GTextPane::TextBox() {
 }
 
 short GTextPane::Boxed(int baselineOffset) const {
-    return static_cast<short>(boxIt ? baselineOffset + frameOffset : baselineOffset);
+    return Pixel16(boxIt ? 0LL + baselineOffset + frameOffset : baselineOffset);
 }
 
 void GTextPane::PanePositionChanged() {

@@ -114,8 +114,12 @@ void GTextPane::Select(bool on) {
     // Also when the field was not selected.
     if (!on)
         TellOnce(&TextPaneListener::TextPaneConfirmation);
-    if (self.PaneExists())
-        EditBoxPane::Select(on);
+    if (!self.PaneExists())
+        return;
+    EditBoxPane::Select(on);
+    // A listener that selected it meanwhile found it selected still: its caret must not go on blinking.
+    if (self.PaneExists() && !on && !IsSelected() && textEdit)
+        textEdit->Deactivate();
 }
 
 // Leaves no pane with the keyboard if this one has it.

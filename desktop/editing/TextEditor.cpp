@@ -67,6 +67,7 @@ void TextEditor::SetText(UString const &text) {
     ReplaceText(0, document.Size(), whole);
     selection.from = std::min(selection.from, units.size());
     selection.to = std::min(selection.to, units.size());
+    KeepTextInSight();
     DamageAll();
     CaretChanged();
 }

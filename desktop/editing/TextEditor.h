@@ -135,6 +135,7 @@ private:
     bool ScrollIntoView(std::size_t unit);
     void FollowCaret();
     void LayOut();
+    void KeepTextInSight();
     void LayOutVisible();
     void KeepTop(ParagraphChange const &);
     std::size_t LastVisible() const;

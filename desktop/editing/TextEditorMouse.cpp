@@ -38,8 +38,11 @@ public:
         Follow(where);
     }
 
-    // In whole units of what was taken first.
+    // In whole units of what was taken first, as far as the text has not been replaced by a shorter one
+    // meanwhile.
     void Follow(Point where) {
+        first.from = std::min(first.from, editor.document.Size());
+        first.to = std::min(first.to, editor.document.Size());
         EditSelection const here = RangeAt(where);
         if (here.Start() < first.Start())
             editor.Select({first.End(), here.Start()});

@@ -74,6 +74,13 @@ void TextEditor::SetBounds(OS::RectBase<OS::RectTag> const &other) {
 void TextEditor::LayOut() {
     flow.SetRoom(RoomWidth(), alignment);
     topOffset = std::min(topOffset, Saturated(document.Paragraphs().At(topParagraph).height));
+    KeepTextInSight();
+}
+
+// A line that has become shorter, or has got more room, does not leave its end for nothing.
+void TextEditor::KeepTextInSight() {
+    if (scrollLeft > 0)
+        scrollLeft = std::clamp(scrollLeft, 0, std::max(flow.WidthOf(0) - RoomWidth(), 0));
 }
 
 // Scrolling
@@ -193,8 +200,8 @@ Rect TextEditor::CaretBox() const {
 
 // Damage
 
-// A text that stands higher than its bounds may show above them, and a line's tails below them by as much: then
-// its place is a frame's, and bounds are what the frame leaves.
+// A text that stands higher than its bounds may show above them, and a line's tails below them by as much:
+// then its place is a frame's, and bounds are what the frame leaves.
 Rect TextEditor::ShownBox() const {
     Rect box = BoundsBox();
     int const higher = -std::min(baselineOffset, 0);

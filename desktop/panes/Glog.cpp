@@ -159,8 +159,12 @@ void Glog::StartPanes() {
 void Glog::SetCurItem(GlogPane *pane) {
     HostCall const call;
     GlogPane *const former = current;
-    if (former && former != pane && former->IsSelected())
+    if (former && former != pane && former->IsSelected()) {
+        PaneWatch const next(pane);
         former->Select(false);
+        if (pane && !next.PaneExists())
+            pane = nullptr;
+    }
     current = pane;
     if (pane && !pane->IsSelected())
         pane->Select(true);

@@ -1,4 +1,4 @@
-// How often labels of groups are shaped: by the count of the layouts that Pango is asked for.
+// How often labels of groups are shaped.
 #include "tests/ShapingCount.h"
 #include "tests/buttons/ButtonGroupTest.h"
 
@@ -13,9 +13,9 @@ protected:
     }
     // How many texts the action shapes.
     static int Shaped(std::function<void()> const &action) {
-        int const before = ShapingCount::layouts;
+        int const before = ShapingCount::texts;
         action();
-        return ShapingCount::layouts - before;
+        return ShapingCount::texts - before;
     }
     // Names that no other test has.
     static UString Name(std::string const &test, int i) {

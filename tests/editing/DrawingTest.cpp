@@ -182,3 +182,18 @@ TEST_F(EditorDrawing, AtTwiceTheScaleTheInsertionPointIsTwoPixelsWide) {
     EXPECT_NE(row[1], row[2]);
     EXPECT_NE(row[-1], row[0]);
 }
+
+TEST_F(EditorTest, AShorterTextShowsInAFieldThatWasScrolled) {
+    Open(0, std::u16string(100, u'm'), {10, 10, 30, 110});
+    Play("key End");
+    editor->SetText(Utf::FromUnits(u"ab"));
+    UpdateGlog(glog);
+    Surface const &scrolled = *desktop.Picture(glog);
+    std::vector<std::uint32_t> const shown(scrolled.Row(12) + 10, scrolled.Row(28) + 100);
+    delete pane;
+    Open(0, u"ab", {10, 10, 30, 110});
+    Play("key End");
+    UpdateGlog(glog);
+    Surface const &fresh = *desktop.Picture(glog);
+    EXPECT_EQ(shown, std::vector<std::uint32_t>(fresh.Row(12) + 10, fresh.Row(28) + 100));
+}

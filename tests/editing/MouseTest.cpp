@@ -1,4 +1,5 @@
 // Placing the insertion point and selecting with the mouse.
+#include "host/CIdleChore.h"
 #include "tests/editing/EditorTest.h"
 
 class EditorMouse : public EditorTest {
@@ -109,4 +110,37 @@ TEST_F(EditorMouse, TheCharacterUnderAPointCountsFromTheBounds) {
     EXPECT_EQ(edit.GetLayoutInfo().GetCharacterIndexForPoint(OS::Point(h + 1, 4)), 2u);
     EXPECT_EQ(edit.GetLayoutInfo().GetCharacterIndexForPoint(OS::Point(h - 1, 4)), 1u);
     EXPECT_EQ(edit.GetLayoutInfo().GetCharacterIndexForPoint(OS::Point(-1e9, -1e9)), 0u);
+}
+
+TEST_F(EditorMouse, ATextThatIsReplacedDuringADragLeavesASelectionWithinIt) {
+    class Shortening : public CIdleChore {
+    public:
+        explicit Shortening(TextEditor &editor_)
+            : CIdleChore(2, kInitialDelay)
+            , editor(editor_) {
+            Assign();
+        }
+        void DoIdle() override {
+            Cancel();
+            editor.SetText(Utf::FromUnits(u"abc"));
+        }
+
+    private:
+        TextEditor &editor;
+    };
+    for (int clicks : {1, 2, 3}) {
+        Open(kSeveralLines, u"one two three four\nfive six seven eight\nnine");
+        std::string const place = PlaceOf(40);
+        Shortening const shortening(*editor);
+        std::string script;
+        for (int i = 1; i < clicks; ++i)
+            script += "press " + place + "\nrelease\n";
+        Play(script + "press " + place + "\nwait 0.5\nmove 12 14\nmove 150 14\nmove 12 14\nrelease");
+        EXPECT_EQ(Text(), u"abc");
+        EXPECT_LE(Selection().first, 3u);
+        EXPECT_LE(Selection().second, 3u);
+        Play("key c command\ntype \"x\"");
+        EXPECT_LE(Text().size(), 4u);
+        delete pane;
+    }
 }

@@ -1,4 +1,5 @@
 // A row that is dragged to another place.
+#include "host/CIdleChore.h"
 #include "host/OSPort.h"
 #include "tests/lists/ListTest.h"
 
@@ -245,4 +246,24 @@ TEST_F(GListPaneMovingTest, AListThatGoesWhileItsRowIsDraggedAnswersThatNothingM
     } const deleting(Movable(100));
     EXPECT_EQ(Dragged(kRow2, 100, "wait 0.5\n"), -1);
     EXPECT_EQ(CountGlogItems(glog), 0);
+}
+
+TEST_F(GListPaneMovingTest, ARowThatGoesWhileItIsDraggedStays) {
+    GListPane *const list = Movable(6);
+    class Emptying : public CIdleChore {
+    public:
+        explicit Emptying(GListPane &list_)
+            : CIdleChore(66, kInitialDelay) // 1.1 seconds: the press is after one
+            , list(list_) {
+            Assign();
+        }
+        void DoIdle() override {
+            Cancel();
+            list.SetNumItems(0);
+        }
+
+    private:
+        GListPane &list;
+    } const emptying(*list);
+    EXPECT_EQ(Dragged(kRow2, 300, "wait 0.5\nmove 100 20\n"), -1);
 }

@@ -401,3 +401,50 @@ TEST_F(GListPaneReentrancyTest, TheListMayBeDeletedByTheSecondaryButton) {
     }
     EXPECT_EQ(CountGlogItems(glog), 0);
 }
+
+TEST_F(GListPaneReentrancyTest, PagesFarOutOfRangeDoNotHangTheSelection) {
+    for (int page : {kLeast, kMost})
+        for (GListSelectionMode mode : {kListSelectSeveral, kListSelectToggle}) {
+            Shown(10, mode);
+            list->SetScrollWithNoBar(false);
+            list->SelectAll();
+            list->ScrollToPage(page);
+            list->InvertSelection();
+            list->SelectAll();
+            list->DeselectAll();
+            desktop.Play("click " + At(2) + "\nactivate off\nactivate on");
+            list->SetSelMode(kListSelectOne);
+            EXPECT_EQ(list->NumSelected(), 0);
+            delete list;
+        }
+}
+
+TEST_F(GListPaneReentrancyTest, ACellOfAListThatGoesInTheWaitDoesNotCount) {
+    Shown(10, kListSelectOne);
+    class Deleting : public CIdleChore {
+    public:
+        explicit Deleting(GListPane *&list_)
+            : CIdleChore(2, kInitialDelay)
+            , list(list_) {
+            Assign();
+        }
+        void DoIdle() override {
+            Cancel();
+            delete list;
+            list = nullptr;
+        }
+
+    private:
+        GListPane *&list;
+    };
+    bool answer = true;
+    std::unique_ptr<Deleting> deleting;
+    listener.onCall = [&](std::string const &) {
+        listener.onCall = nullptr;
+        deleting = std::make_unique<Deleting>(list);
+        answer = list->TrackCol(1, 0);
+    };
+    desktop.Play("press " + At(1) + "\nwait 0.5\nrelease");
+    EXPECT_EQ(list, nullptr);
+    EXPECT_FALSE(answer);
+}

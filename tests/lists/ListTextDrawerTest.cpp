@@ -237,25 +237,25 @@ TEST_F(ListTextDrawerTest, TheSameTextsAreNotShapedAgain) {
     GListPane *const list = NewTextList(1000);
     list->Inval();
     UpdateGlog(glog);
-    int const before = ShapingCount::layouts;
+    int const before = ShapingCount::texts;
     for (int i = 0; i < 3; ++i) {
         list->Inval();
         UpdateGlog(glog);
     }
-    EXPECT_EQ(ShapingCount::layouts, before);
+    EXPECT_EQ(ShapingCount::texts, before);
 }
 
 TEST_F(ListTextDrawerTest, AStepShapesTheTextsOfTheRowThatComesIn) {
     GListPane *const list = NewTextList(1000);
     list->SetScrollPosition(100);
     UpdateGlog(glog);
-    int const before = ShapingCount::layouts;
+    int const before = ShapingCount::texts;
     list->SetScrollPosition(101);
     UpdateGlog(glog);
-    EXPECT_EQ(ShapingCount::layouts - before, 3);
+    EXPECT_EQ(ShapingCount::texts - before, 3);
     list->SetScrollPosition(100);
     UpdateGlog(glog);
-    EXPECT_EQ(ShapingCount::layouts - before, 3) << "the row that went out is still known";
+    EXPECT_EQ(ShapingCount::texts - before, 3) << "the row that went out is still known";
 }
 
 // More than the texts that the host keeps for calls without layouts.
@@ -267,10 +267,10 @@ TEST_F(ListTextDrawerTest, ManyColumnsAreNotShapedAgainEither) {
     list->SetColumnList(columns);
     list->Inval();
     UpdateGlog(glog);
-    int const before = ShapingCount::layouts;
+    int const before = ShapingCount::texts;
     list->Inval();
     UpdateGlog(glog);
-    EXPECT_EQ(ShapingCount::layouts, before);
+    EXPECT_EQ(ShapingCount::texts, before);
 }
 
 // Changes from inside
@@ -297,8 +297,19 @@ TEST_F(ListTextDrawerTest, ALargerListKeepsMoreTexts) {
     list->SetBox(&large);
     list->Inval();
     UpdateGlog(glog);
-    int const before = ShapingCount::layouts;
+    int const before = ShapingCount::texts;
     list->Inval();
     UpdateGlog(glog);
-    EXPECT_EQ(ShapingCount::layouts, before);
+    EXPECT_EQ(ShapingCount::texts, before);
+}
+
+TEST_F(ListTest, WithoutColumnsADrawerOfTextsDrawsNothing) {
+    GListPane *const list = NewList(Record());
+    int asked = 0;
+    list->SetLineDrawer(new ListTextDrawer(list, [&](int, int, ListCell &) { ++asked; }), true);
+    list->SetNumItems(5);
+    Show();
+    list->Inval();
+    Repainted();
+    EXPECT_EQ(asked, 0);
 }

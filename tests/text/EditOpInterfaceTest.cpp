@@ -111,4 +111,20 @@ TEST_F(EditOpInterfaceTest, AShortcutThatCountsIsAHitOfTheItem) {
     EXPECT_EQ(answer, 2);
 }
 
+TEST_F(TextFieldTest, AShortcutOfAnEditCommandThatThePaneRefusesDoesNothing) {
+    class Refusing : public OpenTextField {
+    public:
+        bool CanDoOp(CommandSpecifier const &) override { return false; }
+    };
+    Refusing *const pane = new Refusing;
+    TestItem item;
+    item.Box("BoundsRect", {20, 20, 36, 200});
+    ASSERT_EQ(pane->InitGTextPane(glog, item.Sheet(), nullptr, nullptr), pane);
+    Show();
+    glog->SetCurItem(pane);
+    desktop.Windows().SetClipboardText("pasted");
+    desktop.Play("key v command");
+    EXPECT_EQ(pane->GetText(), UString());
+}
+
 } // namespace

@@ -101,4 +101,48 @@ TEST_F(GTextPaneReentrancy, ModeAndFontMayBeSetFromAnyMessage) {
     EXPECT_LT(acting.calls, 2000);
 }
 
+TEST_F(GTextPaneReentrancy, ANeighbourMayBeDeletedWhileItTakesTheKeyboard) {
+    for (char const *message : {"End", "Confirmation"})
+        for (int way : {0, 1, 2}) {
+            OpenTextField *const first = Make();
+            OpenTextField *second = new OpenTextField;
+            TestItem item;
+            item.Box("BoundsRect", {60, 20, 76, 200});
+            ASSERT_EQ(second->InitGTextPane(glog, item.Sheet(), nullptr, nullptr), second);
+            Repainted();
+            glog->SetCurItem(first);
+            Acting acting(first, [&second](GTextPane *) {
+                delete second;
+                second = nullptr;
+            });
+            acting.at = message;
+            if (way == 0)
+                desktop.Play("click 190 68");
+            else if (way == 1)
+                desktop.Play("key Tab");
+            else
+                glog->SetCurItem(second);
+            EXPECT_EQ(second, nullptr) << message << way;
+            desktop.Play("type \"x\"");
+            delete first;
+        }
+}
+
+TEST_F(GTextPaneReentrancy, AFieldThatIsSelectedAgainWhileItIsDeselectedHasNoCaretLeft) {
+    for (char const *message : {"End", "Confirmation"}) {
+        OpenTextField *const pane = Make();
+        glog->SetCurItem(pane);
+        {
+            Acting acting(pane, [](GTextPane *p) { p->Select(true); });
+            acting.at = message;
+            glog->SetCurItem(nullptr);
+        }
+        EXPECT_FALSE(pane->IsSelected()) << message;
+        Repainted();
+        desktop.Play("wait 1.5");
+        EXPECT_TRUE(Repainted().empty()) << message;
+        delete pane;
+    }
+}
+
 } // namespace
