@@ -3,20 +3,16 @@
 #include "host/GlogPane.h"
 #include "host/glogRec.h"
 
-namespace {
-
 // What the keyboard calls. A shortcut that the active item knows and cannot carry out now is lost: nobody
 // else may take it for text.
-bool DoIfPossible(glogRec *glog, CommandSpecifier const &command, bool &commits) {
-    if (EditOpInterface::CanDoEditOp(glog, command))
-        return EditOpInterface::DoEditOp(glog, command, commits);
-    commits = false;
-    return EditOpInterface::GetActiveItemInterface(glog) && EditOpInterface::KnowsCommand(command);
+EditOpInterface::EditOpInterface() {
+    EditCommands::Install([](glogRec *glog, CommandSpecifier const &command, bool &commits) {
+        if (CanDoEditOp(glog, command))
+            return DoEditOp(glog, command, commits);
+        commits = false;
+        return GetActiveItemInterface(glog) && KnowsCommand(command);
+    });
 }
-
-} // namespace
-
-EditOpInterface::EditOpInterface() { EditCommands::Install(DoIfPossible); }
 
 bool EditOpInterface::KnowsCommand(CommandSpecifier const &command) {
     switch (command.commandID) {

@@ -29,7 +29,7 @@ TEST_F(LabelShaping, ALabelIsShapedOnceWhenItIsMeasuredForTheFirstTime) {
     CheckBoxPane *const group = NewBoxes();
     EXPECT_EQ(Shaped([&] {
                   for (int i = 0; i < 10; ++i)
-                      group->AddButton(0, static_cast<short>(20 * i), Name("first", i));
+                      group->AddButton(0, static_cast<short>(20 * i), Name("new", i));
               }),
               10);
 }

@@ -8,6 +8,7 @@
 namespace {
 class RealWindow : public WindowTest {};
 class Picture : public WindowTest {};
+class PictureThatMoves : public WindowTest {}; // on a screen of all colours
 class Wait : public WindowTest {};
 class Clipboard : public WindowTest {};
 class Scale : public WindowTest {};
@@ -294,7 +295,7 @@ void FillRows(Surface &surface, int from) {
         std::fill(surface.Row(y), surface.Row(y) + surface.Width(), 0xFF000000U | ColourOfRow(y + from));
 }
 
-TEST_F(Picture, MovesWithoutItsPixelsBeingPresented) {
+TEST_F(PictureThatMoves, NeedsNoPixels) {
     Window window = Open(At(200, 150, 100, 80));
     Drain();
     Surface surface(100, 80);
@@ -310,7 +311,7 @@ TEST_F(Picture, MovesWithoutItsPixelsBeingPresented) {
     EXPECT_TRUE(Drain(InputEvent::kExposed).empty());
 }
 
-TEST_F(Picture, MovedTwiceIsShownAgainWhereItIsPresented) {
+TEST_F(PictureThatMoves, TwiceIsShownAgainWhereItIsPresented) {
     Window window = Open(At(200, 150, 100, 80));
     Surface surface(100, 80);
     FillRows(surface, 0);
@@ -324,7 +325,7 @@ TEST_F(Picture, MovedTwiceIsShownAgainWhereItIsPresented) {
     ExpectPixel(*window, 50, 0, ColourOfRow(0));
 }
 
-TEST_F(Picture, OfWhichAPartThatMovesIsBehindAnotherWindowIsAskedFor) {
+TEST_F(PictureThatMoves, FromBehindAnotherWindowIsAskedFor) {
     Window below = Open(At(200, 150, 200, 150));
     Surface surface(200, 150);
     FillRows(surface, 0);
@@ -340,7 +341,7 @@ TEST_F(Picture, OfWhichAPartThatMovesIsBehindAnotherWindowIsAskedFor) {
     ExpectPixel(*below, 150, 10, ColourOfRow(70));
 }
 
-TEST_F(Picture, ThatIsNotWhollyOnTheScreenDoesNotMove) {
+TEST_F(PictureThatMoves, HasToBeWhollyOnTheScreen) {
     Window window = System().CreateWindow(At(200, 150, 100, 80));
     PixelMove const move = {{0, 0, 100, 70}, 0, -10};
     EXPECT_FALSE(window->Move(move));
@@ -356,6 +357,12 @@ TEST_F(Picture, ThatIsNotWhollyOnTheScreenDoesNotMove) {
     EXPECT_TRUE(window->Move(move));
     window->Present(larger, &all, 1);
     EXPECT_FALSE(window->Move(move)) << "larger than the window";
+}
+
+TEST_F(Picture, MovesOnAScreenOfAllColoursOnly) {
+    Window window = Open(At(200, 150, 100, 80));
+    Fill(*window, 0x336699);
+    EXPECT_EQ(window->Move({{0, 0, 100, 70}, 0, -10}), Screen().ColourBits() == 8);
 }
 
 TEST_F(Picture, ASurfaceOfTheOldSizeIsStillShownAfterAResize) {
