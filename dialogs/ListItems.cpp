@@ -14,7 +14,9 @@
 #include "lists/GListPane.h"
 #include "lists/ListTextDrawer.h"
 #include "scrolling/ScrollBarPane.h"
+#include "scrolling/Truncation.h"
 #include "text/FontIndex.h"
+#include <algorithm>
 #include <boost/make_shared.hpp>
 #include <limits>
 #include <memory>
@@ -123,10 +125,9 @@ boost::shared_ptr<ColumnList> ColumnsOf(Container const &item) {
     return boost::make_shared<ColumnList>(static_cast<short>(columns.size()), columns.data());
 }
 
-// As wide as the list.
-boost::shared_ptr<ColumnList> OneColumn(Rect const &box) {
+// Without a width yet.
+boost::shared_ptr<ColumnList> OneColumn() {
     ColumnList::Data column;
-    column.rightEdge = static_cast<short>(box.right - box.left);
     column.alignment = TextSettings::kAlignLeft;
     column.columnMargin = kUsualMargin;
     return boost::make_shared<ColumnList>(static_cast<short>(1), &column);
@@ -200,11 +201,15 @@ public:
             return false;
         SetNaturalSize(*this, record.bounds.right - record.bounds.left,
                        record.bounds.bottom - record.bounds.top);
-        bool const hasColumns = bool(item->GetContainerItem(ResourceKey("Columns")));
-        SetColumnList(hasColumns ? ColumnsOf(item) : OneColumn(record.bounds));
+        TakeColumns(item);
         SetUp(item);
         TakeRows(item, sheet);
         return true;
+    }
+
+    void SetBox(Rect *box) override {
+        GListPane::SetBox(box);
+        WidenOneColumn();
     }
 
     void GlogItemInit() override {
@@ -215,6 +220,27 @@ public:
     }
 
 private:
+    void TakeColumns(Container const &item) {
+        if (item->GetContainerItem(ResourceKey("Columns"))) {
+            SetColumnList(ColumnsOf(item));
+            return;
+        }
+        oneColumn = OneColumn();
+        SetColumnList(oneColumn);
+        WidenOneColumn();
+    }
+
+    // The column of a list that was given none is as wide as the list, until the program has other columns.
+    void WidenOneColumn() {
+        if (!oneColumn || GetColumnList() != oneColumn.get())
+            return;
+        int const width = Pixel16(std::max(GetBounds().right - GetBounds().left, 0));
+        if (width == oneColumn->GetWidth(0))
+            return;
+        oneColumn->SetBothEdges(0, 0, width);
+        Inval();
+    }
+
     void SetUp(Container const &item) {
         SetSelColumn(Number(item, "SelColumn"));
         SetScrollWithNoBar(Number(item, "ScrollWithNoBar") != 0);
@@ -246,6 +272,7 @@ private:
     }
 
     BarName bar;
+    boost::shared_ptr<ColumnList> oneColumn; // null where the dialog says which columns there are
 };
 
 GlogPane *MakeList(glogRec *glog, GlogStyleSheet *sheet) {

@@ -4,6 +4,7 @@
 #include "scrolling/ScrollBarPane.h"
 #include "tests/dialogs/DialogTest.h"
 #include "tests/resources/TemporaryDirectory.h"
+#include <boost/make_shared.hpp>
 #include <vector>
 
 namespace {
@@ -33,8 +34,11 @@ protected:
         desktop.TakeDrawing();
         ShowGlog(glog, kShowGlog);
         UpdateGlog(glog);
+        return TextsIn(desktop.TakeDrawing());
+    }
+    static Texts TextsIn(Texts const &drawing) {
         Texts texts;
-        for (std::string const &line : desktop.TakeDrawing()) {
+        for (std::string const &line : drawing) {
             std::string const mark = "\"text\":\"";
             std::size_t const at = line.find(mark);
             if (at != std::string::npos)
@@ -79,6 +83,53 @@ TEST_F(ListItems, WithoutColumnsThereIsOneAsWideAsTheList) {
     GListPane *const list = LoadList("");
     ASSERT_EQ(list->GetColumnList()->GetNumColumns(), 1);
     EXPECT_EQ(list->GetColumnList()->GetWidth(0), 200);
+}
+
+TEST_F(ListItems, TheColumnOfAListWithoutColumnsGrowsWithIt) {
+    GListPane *const list =
+        LoadList("<AutoEdge>3</AutoEdge><EdgeH>15</EdgeH><EdgeV>10</EdgeV><Style>1</Style>"
+                 "<Rows><Row><Cell>Track 0</Cell></Row></Rows>");
+    EXPECT_EQ(list->GetColumnList()->GetWidth(0), 285) << "also where it has grown while it was made";
+    ShowGlog(list->GetGlog(), kShowGlog);
+    desktop.Play("wait 1\nresize 400 300");
+    EXPECT_EQ(list->GetColumnList()->GetLeftEdge(0), 0);
+    EXPECT_EQ(list->GetColumnList()->GetRightEdge(0), 365);
+    int line = -1, column = -1;
+    EXPECT_TRUE(list->CheckHit({20, 380}, &line, &column));
+    UpdateGlog(list->GetGlog());
+    desktop.TakeDrawing();
+    Rect narrow = {10, 20, 112, 25}, upsideDown = {10, 20, 112, 15}, box = {10, 20, 112, 220};
+    list->SetBox(&box);
+    UpdateGlog(list->GetGlog());
+    EXPECT_EQ(TextsIn(desktop.TakeDrawing()), (Texts{"Track 0"})) << "where its end may be another one";
+    list->SetBox(&narrow);
+    EXPECT_EQ(list->GetColumnList()->GetWidth(0), 5);
+    list->SetBox(&upsideDown);
+    EXPECT_EQ(list->GetColumnList()->GetWidth(0), 0);
+}
+
+TEST_F(ListItems, TheColumnOfAListInALayoutGrowsWithIt) {
+    glogRec *const glog =
+        Load(Dialog("<Item type=\"Group\"><BoundsRect top=\"0\" left=\"0\" bottom=\"200\" right=\"320\"/>"
+                    "<Layout><GrowWidth>1</GrowWidth></Layout><Items>" +
+                    Item("List", kPlace + "<Layout><GrowWidth>1</GrowWidth></Layout>") + "</Items></Item>"));
+    GListPane *const list = dynamic_cast<GListPane *>(GetGlogItem(glog, 1));
+    ShowGlog(glog, kShowGlog);
+    desktop.Play("wait 1\nresize 500 300");
+    EXPECT_EQ(list->GetColumnList()->GetWidth(0), BoxOf(list).right - BoxOf(list).left);
+    EXPECT_GT(list->GetColumnList()->GetWidth(0), 400);
+}
+
+TEST_F(ListItems, ColumnsThatAreGivenStayAsTheyAreWhenTheListGrows) {
+    GListPane *list = LoadList(kColumns + "<AutoEdge>3</AutoEdge>");
+    Rect box = {10, 20, 112, 320};
+    list->SetBox(&box);
+    EXPECT_EQ(list->GetColumnList()->GetRightEdge(1), 180);
+    list = LoadList("<AutoEdge>3</AutoEdge>");
+    boost::shared_ptr<ColumnList> const own = boost::make_shared<ColumnList>(static_cast<short>(1));
+    list->SetColumnList(own);
+    list->SetBox(&box);
+    EXPECT_EQ(own->GetWidth(0), 0) << "also those that the program gives";
 }
 
 TEST_F(ListItems, ColumnsMayBeNone) {
