@@ -1,5 +1,6 @@
 // glogview from outside: exit status, messages and files.
 #include "desktop/drawing/Surface.h"
+#include "tests/printing/PdfReading.h"
 #include "tests/tools/RunProgram.h"
 #include <filesystem>
 #include <gtest/gtest.h>
@@ -11,6 +12,19 @@ std::string const kDialog =
     "<Glog title=\"Metronome\" width=\"160\" height=\"100\"><Items><Item type=\"OvalButton\" "
     "id=\"3\"><BoundsRect top=\"20\" left=\"20\" bottom=\"39\" right=\"120\"/>"
     "<TextNum>2</TextNum></Item></Items></Glog>";
+
+// A list of two columns.
+std::string DialogWithRows(int count) {
+    std::string rows;
+    for (int i = 0; i < count; ++i) {
+        std::string const number = std::to_string(i);
+        rows += "<Row><Cell>Take " + number + "</Cell><Cell>length " + number + "</Cell></Row>";
+    }
+    return "<Glog width=\"300\" height=\"200\"><Items><Item type=\"List\" id=\"1\"><BoundsRect "
+           "top=\"10\" left=\"10\" bottom=\"110\" right=\"250\"/><LineHeight>16</LineHeight>"
+           "<Columns><Column><Width>120</Width></Column><Column><Width>100</Width></Column></Columns><Rows>" +
+           rows + "</Rows></Item></Items></Glog>";
+}
 
 bool Holds(std::string const &text, std::string const &part) { return text.find(part) != std::string::npos; }
 
@@ -155,6 +169,39 @@ TEST_F(Glogview, EndsWithOneForABadScript) {
 TEST_F(Glogview, EndsWithOneForAScriptThatCannotGoOn) {
     directory.Write("script", "snapshot no/such/folder.png\n");
     ProgramResult const result = Run("good.xml --script script");
+    EXPECT_EQ(result.status, 1);
+    EXPECT_TRUE(Holds(result.errors, "script:1: ")) << result.errors;
+}
+
+TEST_F(Glogview, PrintsByAScript) {
+    directory.Write("list.xml", DialogWithRows(70)); // 60 fit on a page
+    directory.Write("script", "wait 1\nprint list.pdf\n");
+    ProgramResult const result = Run("list.xml --script script");
+    EXPECT_EQ(result.status, 0) << result.errors;
+    std::string const file = directory.Path() + "/list.pdf";
+    ASSERT_EQ(PdfReading::Pages(file), 2);
+    std::string const first = PdfReading::Text(file, 1), second = PdfReading::Text(file, 2);
+    EXPECT_TRUE(Holds(first, "Page 1\n")) << first;
+    EXPECT_TRUE(Holds(first, "Take 0 ") && Holds(first, "length 0\n")) << first;
+    EXPECT_TRUE(Holds(first, "Take 59 ") && Holds(first, "length 59\n")) << first;
+    EXPECT_FALSE(Holds(first, "Take 60")) << first;
+    EXPECT_TRUE(Holds(second, "Page 2\n")) << second;
+    EXPECT_FALSE(Holds(second, "Take 59")) << second;
+    EXPECT_TRUE(Holds(second, "Take 60 ") && Holds(second, "length 69\n")) << second;
+}
+
+TEST_F(Glogview, EndsWithOneWhereNothingPrints) {
+    directory.Write("script", "print none.pdf\n");
+    ProgramResult const result = Run("good.xml --script script");
+    EXPECT_EQ(result.status, 1);
+    EXPECT_EQ(result.errors, "glogview: script:1: nothing in the window prints\n");
+    EXPECT_FALSE(std::filesystem::exists(directory.Path() + "/none.pdf"));
+}
+
+TEST_F(Glogview, EndsWithOneForAPrintThatCannotBeWritten) {
+    directory.Write("list.xml", DialogWithRows(3));
+    directory.Write("script", "print no/such/list.pdf\n");
+    ProgramResult const result = Run("list.xml --script script");
     EXPECT_EQ(result.status, 1);
     EXPECT_TRUE(Holds(result.errors, "script:1: ")) << result.errors;
 }
