@@ -58,8 +58,8 @@ public:
     // equal edges stay as they are. Edges are cut to 16 bits. Other columns stay where they are.
     void SetBothEdges(int column, int left, int right);
     // Gives the column another width and moves those to its right along. The right edge of the last column is
-    // a wall: it stays, and what would lie beyond it ends there. The last column itself only moves its left
-    // edge.
+    // a wall: it stays, and what would lie beyond it ends there. The last column itself does not get the
+    // width: made wider, it loses as much at its left edge; made narrower, it moves to the left as it is.
     void ResizeColumn(int column, int newWidth);
 
 private:

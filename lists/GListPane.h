@@ -137,7 +137,7 @@ public:
 
     // Set up
 
-    // Sets the pixels of a row, cut to 16 bits, and invalidates the list.
+    // Sets the pixels of a row, 32767 at most, and invalidates the list. Below 1 no row shows.
     void SetLineHeight(int);
     // Takes a bar, or null, in place of the one before, which has no client then, and of that of the record.
     // The bar hears of a position at the next SetScrollPosition.

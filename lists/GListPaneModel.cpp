@@ -176,7 +176,7 @@ void GListPane::SetLineHeight(int height) {
 }
 
 void GListPane::Resize(Point) {
-    if (!IsInLayout() && res.autoEdge != glistResRec::kNoEdge)
+    if (glog && !IsInLayout() && res.autoEdge != glistResRec::kNoEdge)
         FollowEdges();
     SetScrollPosition(topLine);
 }

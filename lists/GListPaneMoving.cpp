@@ -93,10 +93,10 @@ int GListPane::PlaceOfDrop(Point drop) {
     int line = kAbove, column = 0;
     CheckHit(drop, &line, &column);
     if (line == kAbove)
-        return topLine;
+        return std::max(topLine, 0);
     if (line == kBelow)
-        return static_cast<int>(std::min<long long>(0LL + topLine + numDisplayed, numItems));
-    return line;
+        return static_cast<int>(std::clamp<long long>(0LL + topLine + numDisplayed, 0, numItems));
+    return std::max(line, 0);
 }
 
 // A preview of the change that the caller is about to make.

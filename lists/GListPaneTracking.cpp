@@ -68,7 +68,7 @@ int GListPane::HandleClick(EventRecordAdapter *event) {
 // A click that brings the window to the front is meant for the window.
 int GListPane::ClickOutside(EventRecordAdapter const &event, int line) {
     bool const isBelow = line == kBelow && !(event.modifiers & (kCommand | kShift));
-    if (!isBelow || res.selMode == kListSelectToggle || glog->DidActivateWithCurrentMouseDown())
+    if (!isBelow || res.selMode == kListSelectToggle || !glog || glog->DidActivateWithCurrentMouseDown())
         return kNoRowHit;
     ClickBelowLastItem();
     return kForOwner;
@@ -115,6 +115,8 @@ public:
     void Begin(unsigned short modifiers) {
         bool const extends =
             list.res.selMode == kListSelectSeveral && (modifiers & kShift) && !(modifiers & kCommand);
+        // Kept: the anchor is not selected itself. So where nothing is, the first row selects nothing, while
+        // any other one selects itself and all before it.
         if (extends) {
             current = anchor = Anchor();
             return;

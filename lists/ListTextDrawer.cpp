@@ -10,9 +10,10 @@
 
 namespace {
 
-int const kTextFont = 0;          // in the font table
-int const kGap = 4;               // pixels between icon and text
-int const kMostLayouts = 1 << 16; // beyond them cells share
+int const kTextFont = 0;           // in the font table
+int const kGap = 4;                // pixels between icon and text
+int const kMostLayouts = 1 << 16;  // beyond them cells share
+short const kDisabledOnPaper = 45; // percent of white
 int const kCentred = 1, kOneLine = 0, kUpright = 0, kNothing = 0;
 
 // The column's part of the row without its margins.
@@ -122,7 +123,10 @@ void ListTextDrawer::DrawText(ListCell const &cell, OS::TextLayout &layout, Rect
         return;
     }
     SaveColors const colors;
-    SetForegroundColor(kDialogListInactiveTextColor);
+    if (GListPane::printing)
+        GrayForeColor(kDisabledOnPaper); // paper is white in every theme
+    else
+        SetForegroundColor(kDialogListInactiveTextColor);
     DrawTextLayoutInRect(layout, cell.text, box, font, alignment, truncation, kCentred, kOneLine, kUpright,
                          kNothing, 0.0f, 1.0f, 0.0f);
 }

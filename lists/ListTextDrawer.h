@@ -26,11 +26,11 @@ struct ListCell {
 class ListTextDrawer : public ListLineDrawer {
 public:
     // Fills in a cell, which is empty, of a row and a logical column. Asked each time that the row is drawn,
-    // also for rows behind the last, when those are.
+    // also for rows behind the last, when those are. Must not give the list another drawer or delete it.
     typedef std::function<void(int line, int column, ListCell &)> CellSource;
 
-    // For the list, which must outlive the drawer and have columns before it draws; mostly it owns the
-    // drawer. Font 0, texts shortened at their end.
+    // For the list, which must outlive the drawer and mostly owns it; without columns nothing is drawn. Font
+    // 0, texts shortened at their end.
     ListTextDrawer(GListPane *, CellSource);
 
     // Both only store: the list is to be invalidated.
