@@ -7,11 +7,13 @@ namespace {
 long const kNever = -1;
 
 long calls = 0;
+long long bytes = 0;
 long successesLeft = kNever;
 bool failed = false;
 
 void *Allocate(std::size_t size) {
     ++calls;
+    bytes += static_cast<long long>(size);
     if (successesLeft == 0) {
         successesLeft = kNever;
         failed = true;
@@ -28,9 +30,12 @@ void *Allocate(std::size_t size) {
 } // namespace
 
 Allocations::Counter::Counter()
-    : start(calls) {}
+    : start(calls)
+    , startBytes(bytes) {}
 
 long Allocations::Counter::Count() const { return calls - start; }
+
+long long Allocations::Counter::Bytes() const { return bytes - startBytes; }
 
 Allocations::FailAfter::FailAfter(long successes) {
     failed = false;

@@ -3,14 +3,16 @@
 
 namespace Allocations {
 
-// How often operator new was called since this was made.
+// How often operator new was called since this was made, and for how much memory altogether.
 class Counter {
 public:
     Counter();
     long Count() const;
+    long long Bytes() const;
 
 private:
     long start;
+    long long startBytes;
 };
 
 // From now on, so many calls of operator new succeed and the next one throws std::bad_alloc; after that one,

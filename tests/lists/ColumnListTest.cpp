@@ -143,6 +143,28 @@ TEST_F(ColumnListTest, AColumnOfNoWidthStaysPossible) {
     EXPECT_EQ(columns.GetWidth(0), 0);
 }
 
+TEST_F(ColumnListTest, AColumnWithoutANameIsTwoPixelsWideAtLeast) {
+    columns.SetBothEdges(0, 100, 101);
+    EXPECT_EQ(columns.GetRightEdge(0), 102);
+    columns.SetBothEdges(0, 100, 103);
+    EXPECT_EQ(columns.GetRightEdge(0), 103);
+}
+
+// The headers' font counts, whatever the port has.
+TEST_F(ColumnListTest, TheFontOfThePortDoesNotMatter) {
+    columns.SetName(0, Text("Position"));
+    for (int font = 0; font < 8; ++font) {
+        SetFontData(GetIndVelaFont(font));
+        columns.SetBothEdges(0, 0, 1);
+        EXPECT_EQ(columns.GetWidth(0), WidthOf(Text("Position")) + 2) << font;
+    }
+}
+
+TEST_F(ColumnListTest, SettingEdgesLeavesOtherColumnsAlone) {
+    columns.SetBothEdges(1, 150, 420);
+    EXPECT_EQ(EdgesOf(columns), (Edges{{0, 100}, {150, 420}, {200, 300}}));
+}
+
 TEST_F(ColumnListTest, EdgesAreCutToSixteenBits) {
     columns.SetBothEdges(0, 65536 + 5, 65536 + 105);
     EXPECT_EQ(columns.GetLeftEdge(0), 5);
@@ -181,6 +203,27 @@ TEST_F(ColumnListTest, ANarrowerColumnPullsThoseToItsRight) {
 TEST_F(ColumnListTest, TheLastColumnMadeWiderBecomesNarrower) {
     columns.ResizeColumn(2, 130);
     EXPECT_EQ(EdgesOf(columns), (Edges{{0, 100}, {100, 200}, {230, 300}}));
+}
+
+TEST_F(ColumnListTest, TheLastColumnMadeNarrowerMovesToTheLeft) {
+    columns.ResizeColumn(2, 50);
+    EXPECT_EQ(EdgesOf(columns), (Edges{{0, 100}, {100, 200}, {150, 250}}));
+}
+
+TEST_F(ColumnListTest, ASingleColumnIsTheLastOne) {
+    ColumnList single(1);
+    single.SetBothEdges(0, 0, 100);
+    single.ResizeColumn(0, 130);
+    EXPECT_EQ(EdgesOf(single), (Edges{{30, 100}}));
+    single.ResizeColumn(0, 50);
+    EXPECT_EQ(EdgesOf(single), (Edges{{10, 80}}));
+}
+
+// What is on the other side of the wall does not come before it by being pushed.
+TEST_F(ColumnListTest, ColumnsBeyondTheWallComeBackToIt) {
+    columns.SetBothEdges(1, 350, 400);
+    columns.ResizeColumn(0, 110);
+    EXPECT_EQ(EdgesOf(columns), (Edges{{0, 110}, {300, 300}, {210, 300}}));
 }
 
 TEST_F(ColumnListTest, WidthsBeyondSixteenBitsAreCut) {

@@ -130,6 +130,28 @@ TEST_F(GListPaneClickTest, WithShiftAndNothingSelectedExtendsFromTheFirstRow) {
     EXPECT_EQ(listener.Take(), (Log{"select 0 tracking", "select 1 tracking", "select 2 tracking", "done"}));
 }
 
+// Kept: the row that a selection extends from is taken as selected already.
+TEST_F(GListPaneClickTest, WithShiftAndNothingSelectedAClickOnTheFirstRowSelectsNothing) {
+    GListPane *const list = Shown(kListSelectSeveral);
+    EXPECT_EQ(ClickOn(At(0), "shift"), kHandled);
+    EXPECT_EQ(SelectedRows(*list), Rows());
+    EXPECT_EQ(listener.Take(), (Log{"done"}));
+}
+
+TEST_F(GListPaneClickTest, WithShiftARowIsReachedOnlySomePixelsInsideAlsoByThePress) {
+    GListPane *const list = Shown(kListSelectSeveral, {0});
+    ClickOn("40 56", "shift"); // row 2 begins at 53
+    EXPECT_EQ(SelectedRows(*list), (Rows{0, 1}));
+    ClickOn("40 57", "shift");
+    EXPECT_EQ(SelectedRows(*list), (Rows{0, 1, 2}));
+    list->DeselectAll();
+    list->SelectItem(4);
+    ClickOn("40 66", "shift"); // it ends at 69
+    EXPECT_EQ(SelectedRows(*list), (Rows{3, 4}));
+    ClickOn("40 65", "shift");
+    EXPECT_EQ(SelectedRows(*list), (Rows{2, 3, 4}));
+}
+
 TEST_F(GListPaneClickTest, WithShiftASelectedRowStaysAsItIs) {
     GListPane *const list = Shown(kListSelectSeveral, {2});
     ClickOn(At(2), "shift");
@@ -201,6 +223,23 @@ TEST_F(GListPaneClickTest, InModeOneAClickOnlyEnds) {
     EXPECT_EQ(ClickOn(At(3)), kHandled);
     EXPECT_EQ(listener.Take(), (Log{"done"}));
     EXPECT_EQ(SelectedRows(*list), Rows());
+}
+
+TEST_F(GListPaneClickTest, InModeOneAClickBelowTheRowsIsForTheOwnerAndTellsNobody) {
+    GListPane *const list = Shown(kListSelectOne);
+    list->SetSelMode(kListSelectNothing);
+    listener.Take();
+    EXPECT_EQ(ClickOn(kBelowTheRows), kForOwner);
+    EXPECT_EQ(listener.Take(), Log());
+    EXPECT_EQ(Clicked(*list), (Place{-1, -1}));
+}
+
+TEST_F(GListPaneClickTest, InAnUnknownModeAClickOnlyEnds) {
+    GListPane *const list = Shown(static_cast<GListSelectionMode>(77));
+    list->SetSelRange(1, 2);
+    EXPECT_EQ(ClickOn(At(3)), kHandled);
+    EXPECT_EQ(listener.Take(), (Log{"done"}));
+    EXPECT_EQ(list->GetFirstSelectedItem(), 1) << "it is not cleared before either";
 }
 
 TEST_F(GListPaneClickTest, AClickInAnotherColumnIsReported) {
@@ -394,6 +433,9 @@ TEST_F(GListPaneClickTest, WhereAllColumnsSelectAClickBesideThemDoesToo) {
     EXPECT_EQ(ClickOn("225 60"), kHandled);
     EXPECT_EQ(SelectedRows(*list), Rows{2});
     EXPECT_EQ(ClickOn("50 20"), kNoRowHit);
+    EXPECT_EQ(SelectedRows(*list), Rows{2});
+    EXPECT_EQ(ClickOn("225 110"), kForOwner) << "but below the rows there is none";
+    EXPECT_EQ(SelectedRows(*list), Rows());
 }
 
 TEST_F(GListPaneClickTest, WithoutColumnsNoCellIsHit) {

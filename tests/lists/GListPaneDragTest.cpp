@@ -2,6 +2,7 @@
 #include "host/VelaDrawing.h"
 #include "tests/lists/ListTest.h"
 #include <algorithm>
+#include <limits>
 
 namespace {
 
@@ -180,6 +181,87 @@ TEST_F(GListPaneDragTest, WhereAClickTogglesADragTogglesAllTheSame) {
     EXPECT_EQ(SelectedRows(*list), (Rows{0, 1, 2}));
 }
 
+TEST_F(GListPaneDragTest, WhereAClickTogglesADragWithCommandDeselects) {
+    GListPane *const list = Shown(6, kListSelectToggle, {0});
+    desktop.Play(Press(2, "command") + Move(4) + Move(3) + kRelease);
+    EXPECT_EQ(SelectedRows(*list), (Rows{0, 1, 4, 5}));
+    EXPECT_EQ(listener.Take(),
+              (Log{"select 5", "select 4", "select 3", "select 2", "select 1", "done", "deselect 2",
+                   "deselect 3 tracking", "deselect 4 tracking", "select 4 tracking", "done"}));
+    EXPECT_EQ(list->NumSelected(), 4);
+}
+
+TEST_F(GListPaneDragTest, WhereAClickTogglesADragWithOptionSelectsAlone) {
+    GListPane *const list = Shown(6, kListSelectToggle, {0, 2, 5});
+    desktop.Play(Press(2, "option") + Move(4) + Move(3) + kRelease);
+    EXPECT_EQ(SelectedRows(*list), (Rows{2, 3}));
+    EXPECT_EQ(listener.Take(),
+              (Log{"deselect 5", "deselect 4", "deselect 3", "deselect 2", "deselect 1", "deselect 0", "done",
+                   "select 2", "select 3 tracking", "select 4 tracking", "deselect 4 tracking", "done"}));
+}
+
+TEST_F(GListPaneDragTest, WhereAClickTogglesADragWithShiftTogglesToo) {
+    GListPane *const list = Shown(6, kListSelectToggle, {0, 3});
+    desktop.Play(Press(2, "shift") + Move(4) + kRelease);
+    EXPECT_EQ(SelectedRows(*list), (Rows{0, 2, 3, 4}));
+    EXPECT_EQ(listener.Take(), (Log{"select 2", "select 4 tracking", "done"}));
+}
+
+TEST_F(GListPaneDragTest, WithShiftAndCommandADragToggles) {
+    GListPane *const list = Shown(6, kListSelectSeveral, {0, 3});
+    desktop.Play(Press(2, "shift command") + Move(4) + kRelease);
+    EXPECT_EQ(SelectedRows(*list), (Rows{0, 2, 3, 4}));
+    EXPECT_EQ(listener.Take(), (Log{"select 2", "select 4 tracking", "done"}));
+    desktop.Play(Press(2, "shift command") + Move(5) + Move(3) + kRelease);
+    EXPECT_EQ(SelectedRows(*list), (Rows{0, 4}));
+}
+
+TEST_F(GListPaneDragTest, WithOptionADragReplaces) {
+    GListPane *const list = Shown(6, kListSelectSeveral, {0, 3, 5});
+    desktop.Play(Press(2, "option") + Move(4) + Move(3) + kRelease);
+    EXPECT_EQ(SelectedRows(*list), (Rows{2, 3}));
+}
+
+TEST_F(GListPaneDragTest, OutsideOfTheColumnThatSelectsNothingHappensToSeveralRows) {
+    for (GListSelectionMode mode : {kListSelectSeveral, kListSelectToggle}) {
+        GListPane *const list = Shown(100, mode);
+        desktop.Play(Press(1) + Move(2) + Move(5, 1) + Wait(0.2) + "move 100 140\nwait 0.5\n" + kRelease);
+        EXPECT_EQ(SelectedRows(*list), (Rows{1, 2})) << mode;
+        EXPECT_EQ(list->GetScrollPos(), 0) << mode;
+        list->DeselectAll();
+        desktop.Play(Press(1) + Move(5, 1) + Wait(0.2) + Move(3) + kRelease);
+        EXPECT_EQ(SelectedRows(*list), (Rows{1, 2, 3})) << "back in it the drag goes on";
+        delete list;
+    }
+}
+
+// Kept: only the one row that moves is a step.
+TEST_F(GListPaneDragTest, WhereSeveralRowsAreSelectedNoStepOfTrackingIsTold) {
+    for (GListSelectionMode mode : {kListSelectSeveral, kListSelectToggle}) {
+        GListPane *const list = Shown(100, mode);
+        ListHooks hooks;
+        desktop.Play(Press(1) + Wait(0.2) + Move(3) + Below() + Wait(0.3) + Move(2) + kRelease);
+        EXPECT_EQ(hooks.steps, 0) << mode;
+        EXPECT_EQ(hooks.otherSteps, 0) << mode;
+        delete list;
+    }
+}
+
+TEST_F(GListPaneDragTest, OfSeveralRowsTheOneThatTheDragHasReachedIsReported) {
+    glistResRec record = Record(kListSelectSeveral);
+    record.selReturn = true;
+    GListPane *const list = Equipped(NewList(record), 100);
+    Show();
+    int line = 0, column = 0;
+    EXPECT_EQ(ResultOfClick(Press(1) + V("move", 72) + kRelease), 3);
+    list->GetClickParameters(line, column);
+    EXPECT_EQ(line, 2) << "row 3, which begins at 69, is not reached yet";
+    EXPECT_EQ(ResultOfClick(Press(3) + Below() + kRelease), 3);
+    list->GetClickParameters(line, column);
+    EXPECT_EQ(line, 6) << "the last one that showed";
+    EXPECT_EQ(column, 0);
+}
+
 TEST_F(GListPaneDragTest, WhereAllColumnsSelectRowsChangeWithoutBeingDrawn) {
     GListPane *const list = Shown(6, kListSelectSeveral);
     list->SetSelColumn(GListPane::kAnyColumn);
@@ -276,6 +358,37 @@ TEST_F(GListPaneDragTest, WithoutASelectedRowItScrollsWhileTheMouseRests) {
     EXPECT_EQ(list->GetFirstSelectedItem(), -2);
 }
 
+TEST_F(GListPaneDragTest, AboveTheListTheOneRowScrolls) {
+    GListPane *const list = Shown(100, kListSelectOne);
+    list->SetScrollPosition(50);
+    desktop.Play(Press(3) + Above() + Wait(0.52) + kRelease);
+    EXPECT_EQ(list->GetScrollPos(), 39);
+    EXPECT_EQ(list->GetFirstSelectedItem(), -1);
+    EXPECT_EQ(list->NumSelected(), 0);
+}
+
+// Kept: scrolling does not ask for the mode.
+TEST_F(GListPaneDragTest, InModeOneADragOffTheListScrolls) {
+    GListPane *const list = Shown(100, kListSelectOne);
+    list->SetSelMode(kListSelectNothing);
+    listener.Take();
+    desktop.Play(Press(3) + Below() + Wait(0.52) + kRelease);
+    EXPECT_EQ(list->GetScrollPos(), 11);
+    EXPECT_EQ(listener.Take(), (Log{"done"}));
+}
+
+// Lower than a row, so the list can be scrolled until its last row has left it.
+TEST_F(GListPaneDragTest, AtTheGreatestRowADragBelowStaysThere) {
+    int const most = std::numeric_limits<int>::max();
+    glistResRec record = Record();
+    record.bounds = {20, 30, 32, 230};
+    GListPane *const list = Equipped(NewList(record), most);
+    list->SetScrollPosition(most - 1);
+    Show();
+    desktop.Play("wait 1\npress 40 25\n" + Below() + Wait(0.5) + kRelease);
+    EXPECT_EQ(list->GetScrollPos(), most);
+}
+
 // Kept: a pass that scrolls leaves the row before it as the one that was dealt with last.
 TEST_F(GListPaneDragTest, BackOnTheRowThatItLeftTheListFromADragGoesOnAtTheNextRow) {
     GListPane *const list = Shown(7, kListSelectSeveral);
@@ -370,6 +483,21 @@ TEST_F(TrackingColumn, CrossingTheEdgeDrawsTheRowAnew) {
     Tracking(5);
     EXPECT_EQ(RowsDrawnBy([&] { desktop.Play(kPressCell + "move 40 60\nmove 100 60\n" + kRelease); }),
               (Log{"2*", "2*", "2*"}));
+}
+
+// A row that is selected has no mark, and looks as it does without the press.
+TEST_F(TrackingColumn, ASelectedRowIsNotMarkedByTrackingItsCell) {
+    GListPane *const list = Tracking(5);
+    list->SetSelRange(2, 2);
+    UpdateGlog(glog);
+    EXPECT_EQ(RowsDrawnBy([&] { desktop.Play(kPressCell + "move 40 60\nmove 100 60\n" + kRelease); }),
+              (Log{"2*", "2*", "2*"}));
+    EXPECT_EQ(RowsDrawnBy([&] {
+                  list->SetSelRange(-1, -1);
+                  list->InvalRow(2);
+              }),
+              (Log{"2"}))
+        << "nothing is left of it";
 }
 
 TEST_F(TrackingColumn, TheCellEndsWithItsRow) {

@@ -170,17 +170,21 @@ TEST_F(GListPaneDrawingTest, DrawsTheInactiveSelectionLastWhileItIsNotActive) {
     class List : public OpenList {
     public:
         using OpenList::OpenList;
-        void DrawInactiveSelection() override { ++drawn; }
+        void DrawInactiveSelection() override {
+            ++drawn;
+            VelaDrawing::LineTo(1, 2);
+        }
         int drawn = 0;
     };
     List *const list = new List(glog, Record());
+    Equipped(list, 3);
     Show();
     int before = list->drawn;
     list->DrawGuts(nullptr);
     EXPECT_EQ(list->drawn, before);
     desktop.Play("activate off");
     before = list->drawn;
-    list->DrawGuts(nullptr);
+    EXPECT_NE(DrawingOf(*list).back().find("\"LineTo\""), std::string::npos);
     EXPECT_EQ(list->drawn, before + 1);
     list->DrawSelectionWhenInactive();
     list->DrawGuts(nullptr);
@@ -236,6 +240,18 @@ TEST_F(GListPaneDrawingTest, ARowIsClippedToWhatShowsOfIt) {
     EXPECT_EQ(clip, (Rect{40, 100, 45, 229}));
     list->DrawListLine(1, 1, &region);
     EXPECT_EQ(clip, (Rect{40, 100, 45, 151}));
+}
+
+TEST_F(GListPaneDrawingTest, ARowDoesNotLeaveTheClipNarrowed) {
+    OpenList *const list = NewOpen(100);
+    Show();
+    OSRgn region(Rect{40, 30, 45, 400});
+    for (int row : {1, 6, 50}) {
+        list->DrawListLine(row, 1, &region);
+        TempRgn const clip;
+        VelaDrawing::GetClip(clip);
+        EXPECT_EQ(CarbonUtils::GetRgnBounds(clip), ListBox()) << row;
+    }
 }
 
 TEST_F(GListPaneDrawingTest, ColumnsOutsideOfTheListAreNotDrawn) {
@@ -410,6 +426,15 @@ TEST_F(GListPaneDrawingTest, AMarkShowsInAListThatIsNotActiveToo) {
     Show();
     desktop.Play("activate off");
     drawer.TakeRows();
+    list->InvertItemRect(2, false);
+    list->UpdateListLine(2);
+    EXPECT_EQ(drawer.TakeRows(), (Log{"2*"}));
+}
+
+TEST_F(GListPaneDrawingTest, WhereAllColumnsSelectAMarkShowsAllTheSame) {
+    OpenList *const list = NewOpen(100);
+    list->SetSelColumn(GListPane::kAnyColumn);
+    Show();
     list->InvertItemRect(2, false);
     list->UpdateListLine(2);
     EXPECT_EQ(drawer.TakeRows(), (Log{"2*"}));

@@ -1,5 +1,6 @@
 // Rows and columns, and where they lie.
 #include "host/TarnError.h"
+#include "tests/frame/Allocations.h"
 #include "tests/lists/ListTest.h"
 #include <limits>
 
@@ -20,6 +21,16 @@ protected:
             return out << (hit.isCell ? "cell " : "no cell ") << hit.line << " " << hit.column;
         }
     };
+    // Whether the action fails as it should when so many uses of memory succeed and the next one does not.
+    static bool FailsWithoutMemory(long successes, std::function<void()> const &action) {
+        Allocations::FailAfter const fail(successes);
+        try {
+            action();
+        } catch (TarnError const &) {
+            return fail.HasFailed();
+        }
+        return false;
+    }
     static Hit HitAt(GListPane &list, int h, int v) {
         Hit hit = {false, -100, -100};
         hit.isCell = list.CheckHit({static_cast<short>(v), static_cast<short>(h)}, &hit.line, &hit.column);
@@ -116,6 +127,17 @@ TEST_F(GListPaneModelTest, RowsOfASmallListTakeTheWholeBox) {
     record.firstLineOffset = 5;
     GListPane *const list = Equipped(NewList(record), 100);
     EXPECT_EQ(RowBox(*list, 1), (Rect{41, 30, 57, 230}));
+}
+
+// Kept: coordinates are 16 bits wide.
+TEST_F(GListPaneModelTest, RowsBeyondTheCoordinatesWrapAround) {
+    glistResRec record = Record();
+    record.bounds = {32000, 30, 32767, 230};
+    record.style = glistResRec::kSmallStyle;
+    record.lineHeight = 500;
+    GListPane *const list = Equipped(NewList(record), 10);
+    EXPECT_EQ(RowBox(*list, 0), (Rect{32000, 30, 32500, 230}));
+    EXPECT_EQ(RowBox(*list, 1), (Rect{32500, 30, 33000 - 65536, 230}));
 }
 
 TEST_F(GListPaneModelTest, RowsOutOfViewHaveNoBox) {
@@ -381,10 +403,16 @@ TEST_F(GListPaneModelTest, ARangeIsCutAtTheLastRow) {
 
 TEST_F(GListPaneModelTest, OneRowIgnoresTheEndOfItsRange) {
     GListPane *const list = Filled(6);
-    list->SetSelRange(2, 5);
-    list->SetSelRange(2, 5); // drawing makes both the same; the second one is stored after it
+    Show();
+    desktop.Play("click " + At(2));
+    int first = 0, last = 0;
+    list->GetSelRange(first, last);
+    ASSERT_EQ(first, 2);
+    ASSERT_EQ(last, -1) << "a click leaves the end where it was";
     list->DelItem(2);
-    EXPECT_EQ(list->GetFirstSelectedItem(), -1);
+    list->GetSelRange(first, last);
+    EXPECT_EQ(first, -1);
+    EXPECT_EQ(last, -1);
 }
 
 TEST_F(GListPaneModelTest, ARowThatThereIsNotCannotGo) {
@@ -408,6 +436,77 @@ TEST_F(GListPaneModelTest, TheMarkOfARowThatGoesGoesToo) {
     list->DelItem(1);
     UpdateGlog(glog);
     EXPECT_EQ(drawer.TakeRows(), (Log{"0", "1"}));
+}
+
+// Kept: marks behind the row that goes keep their number.
+TEST_F(GListPaneModelTest, MarksOfOtherRowsStayAtTheirNumbers) {
+    GListPane *const list = Filled(5);
+    Show();
+    list->InvertItemRect(3, false);
+    list->DelItem(1);
+    UpdateGlog(glog);
+    EXPECT_EQ(drawer.TakeRows(), (Log{"0", "1", "2", "3*"}));
+}
+
+TEST_F(GListPaneModelTest, ARowThatComesInIsThereWhenItIsToldOf) {
+    GListPane *const list = Filled(3, kListSelectSeveral);
+    list->SelectItem(1);
+    listener.Take();
+    std::vector<int> selected;
+    int rows = 0;
+    listener.onCall = [&](std::string const &) {
+        rows = list->GetNumItems();
+        selected = SelectedRows(*list);
+    };
+    list->AddItem(1);
+    EXPECT_EQ(rows, 4);
+    EXPECT_EQ(selected, std::vector<int>{2});
+}
+
+TEST_F(GListPaneModelTest, RowsOfANewCountAreDeselectedOneByOne) {
+    GListPane *const list = Filled(5, kListSelectSeveral);
+    list->SelectAll();
+    listener.Take();
+    std::vector<int> selected; // how many, at each call
+    listener.onCall = [&](std::string const &) { selected.push_back(list->NumSelected()); };
+    list->SetNumItems(4);
+    EXPECT_EQ(selected, (std::vector<int>{3, 2, 1, 0}));
+}
+
+TEST_F(GListPaneModelTest, WithoutMemoryForFlagsNothingChanges) {
+    GListPane *const list = Filled(5, kListSelectSeveral);
+    list->SelectItem(1);
+    listener.Take();
+    for (long successes : {0L, 1L})
+        EXPECT_TRUE(FailsWithoutMemory(successes, [&] { list->SetNumItems(20000); }));
+    EXPECT_TRUE(FailsWithoutMemory(0, [&] { list->AddItem(0); }));
+    EXPECT_EQ(list->GetNumItems(), 5);
+    EXPECT_EQ(SelectedRows(*list), std::vector<int>{1});
+    EXPECT_EQ(listener.Take(), Log());
+    list->AddItem(0);
+    EXPECT_EQ(SelectedRows(*list), std::vector<int>{2}) << "there is a flag for every row";
+}
+
+TEST_F(GListPaneModelTest, WithoutMemoryForFlagsTheModeStays) {
+    GListPane *const list = Filled(5);
+    list->SetSelectionListener(nullptr); // whose notes need memory
+    EXPECT_TRUE(FailsWithoutMemory(0, [&] { list->SetSelMode(kListSelectSeveral); }));
+    EXPECT_EQ(list->GetResInfo().selMode, kListSelectOne);
+    list->SetSelRange(3, 3);
+    EXPECT_EQ(SelectedRows(*list), std::vector<int>{3});
+    list->AddItem(0);
+    EXPECT_EQ(SelectedRows(*list), std::vector<int>{4});
+}
+
+TEST_F(GListPaneModelTest, FromOneModeWithFlagsToTheOtherNoMemoryIsNeeded) {
+    GListPane *const list = Filled(5, kListSelectSeveral);
+    list->SelectItem(1);
+    list->SetSelectionListener(nullptr);
+    EXPECT_FALSE(FailsWithoutMemory(0, [&] { list->SetSelMode(kListSelectToggle); }));
+    EXPECT_EQ(list->GetResInfo().selMode, kListSelectToggle);
+    EXPECT_EQ(list->NumSelected(), 0);
+    list->SelectItem(4);
+    EXPECT_EQ(SelectedRows(*list), std::vector<int>{4});
 }
 
 // Columns

@@ -248,6 +248,34 @@ TEST_F(GListPaneMovingTest, AListThatGoesWhileItsRowIsDraggedAnswersThatNothingM
     EXPECT_EQ(CountGlogItems(glog), 0);
 }
 
+TEST_F(GListPaneMovingTest, ARowThatGoesBeforeItIsDraggedStays) {
+    GListPane *const list = Movable(6);
+    int answer = kNotAsked;
+    listener.onCall = [&](std::string const &call) {
+        if (call == "done") {
+            listener.onCall = nullptr;
+            list->SetNumItems(2);
+        }
+    };
+    desktop.Script("move 100 110\nrelease");
+    answer = list->MoveItem({kRow2, 100});
+    EXPECT_EQ(answer, -1);
+}
+
+// Its place has a number below 0 then, which no row has.
+TEST_F(GListPaneMovingTest, AboveTheFirstRowOfAListThatBeginsBeforeItIsTheFirstPlace) {
+    for (int to : {120, 70}) { // to the places of rows -1 and -4
+        GListPane *const list = Movable(10);
+        list->SetScrollWithNoBar(false);
+        list->ScrollToPage(0); // seven rows before the first one
+        Rect box = {20, 30, 199, 230};
+        list->SetBox(&box); // in which twelve rows show
+        ASSERT_EQ(list->CheckHitV(160), 1);
+        EXPECT_EQ(Dragged(160, to), 0);
+        delete list;
+    }
+}
+
 TEST_F(GListPaneMovingTest, ARowThatGoesWhileItIsDraggedStays) {
     GListPane *const list = Movable(6);
     class Emptying : public CIdleChore {

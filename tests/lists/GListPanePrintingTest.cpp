@@ -3,13 +3,14 @@
 #include "host/OSFont.h"
 #include "host/PageFormat.h"
 #include "host/TextLayout.h"
+#include "lists/ListTextDrawer.h"
 #include "tests/lists/ListTest.h"
 #include "tests/printing/PdfReading.h"
 #include <limits>
 
 namespace {
 
-int const kRowsOfAPage = 60; // of A4 on its side
+int const kRowsOfAPage = 60; // of A4, upright
 
 class GListPanePrintingTest : public ListTest {
 protected:
@@ -137,6 +138,32 @@ TEST_F(GListPanePrintingTest, InTheDarkThemeThePaperIsReadableToo) {
     EXPECT_GT(dark, header + 30) << "the rows";
 }
 
+TEST_F(GListPanePrintingTest, DisabledTextsAreReadableOnPaperInEveryTheme) {
+    GListPane *const list = Printable(3);
+    list->SetLineDrawer(new ListTextDrawer(list,
+                                           [](int, int, ListCell &cell) {
+                                               cell.text = Text("disabled");
+                                               cell.isActive = false;
+                                           }),
+                        true);
+    std::vector<std::unique_ptr<Surface>> pictures;
+    for (char const *theme : {"light", "dark"}) {
+        desktop.SetTheme(theme);
+        desktop.Print(glog, file);
+        pictures.push_back(PdfReading::Picture(file, 3));
+        ASSERT_NE(pictures.back(), nullptr);
+    }
+    int readable = 0, different = 0;
+    for (int y = 3 * (36 + 39); y < 3 * (36 + 39 + 36); ++y) // the rows
+        for (int x = 0; x < pictures[0]->Width(); ++x) {
+            std::uint32_t const light = pictures[0]->Row(y)[x], dark = pictures[1]->Row(y)[x];
+            readable += (dark & 0xFF) < 0x78; // a contrast of 4.5 to 1
+            different += light != dark;
+        }
+    EXPECT_GT(readable, 300);
+    EXPECT_EQ(different, 0);
+}
+
 // Afterwards
 
 TEST_F(GListPanePrintingTest, AfterwardsTheListIsAsItWas) {
@@ -262,6 +289,31 @@ TEST_F(GListPanePrintingTest, AProtectedRowIsLeftOut) {
     EXPECT_EQ(drawer.TakeRows(), (Log{"0", "2", "3", "4"}));
     EXPECT_TRUE(Only("InvalRect", drawn).empty());
     Printed(*list, kEnd, 1);
+}
+
+TEST(GListPaneWithoutADesktop, HasNoPageFormatAndPrintsNothing) {
+    GListPane list;
+    list.SetLineHeight(16);
+    list.SetNumItems(100);
+    Rect box = {20, 30, 120, 230};
+    list.SetBox(&box);
+    PrintMessageRec message = {kPage, 1, {}};
+    EXPECT_FALSE(list.Print(&message));
+    EXPECT_EQ(list.GetScrollPos(), 0) << "nor is there a next page";
+    message.kind = kBegin;
+    message.page = 2;
+    int const rows = list.GetNumDisplayed();
+    EXPECT_TRUE(list.Print(&message));
+    EXPECT_EQ(list.GetScrollPos(), rows);
+    EXPECT_EQ(list.GetBounds(), box);
+    EXPECT_EQ(list.GetLineHeight(), 16);
+    EXPECT_EQ(list.GetNumDisplayed(), rows);
+    message.kind = kEnd;
+    EXPECT_FALSE(list.Print(&message));
+    EXPECT_EQ(list.GetScrollPos(), 0);
+    EXPECT_EQ(list.GetBounds(), box);
+    EXPECT_EQ(list.GetLineHeight(), 16);
+    EXPECT_EQ(list.GetNumDisplayed(), rows);
 }
 
 // Misuse

@@ -1,6 +1,7 @@
 // Listeners and drawers that change the list, or delete it, from inside.
 #include "host/TarnError.h"
 #include "tests/lists/ListTest.h"
+#include <algorithm>
 #include <limits>
 #include <stdexcept>
 
@@ -87,6 +88,40 @@ void CallEverythingWith(GListPane &list, int number) {
     list.SetSelColumn(0);
 }
 
+// The same for what takes all rows, with the list at a page that there may not be.
+void ChangeEverythingAt(GListPane &list, int number) {
+    GListSelectionMode const mode = list.GetResInfo().selMode;
+    int const rows = list.GetNumItems();
+    auto const onThePage = [&list, number](std::function<void()> const &action) {
+        list.SetScrollWithNoBar(false); // the list stays where it is
+        list.ScrollToPage(number);
+        action();
+        list.SetScrollWithNoBar(true);
+    };
+    onThePage([&] { list.SelectAll(); });
+    onThePage([&] { list.InvertSelection(); });
+    onThePage([&] { list.DrawVisibleLines(nullptr); });
+    onThePage([&] { list.InvalCol(0); });
+    onThePage([&] { list.MoveItem({60, 100}); });
+    onThePage([&] { list.DeselectAll(); });
+    onThePage([&] { list.SetNumItems(std::min(number, rows)); });
+    onThePage([&] { list.SetNumItems(rows); });
+    onThePage([&] { list.AddItem(number); });
+    onThePage([&] { list.DelItem(number); });
+    onThePage([&] { list.SetSelMode(static_cast<GListSelectionMode>(number)); });
+    onThePage([&] { list.SetSelMode(mode); });
+    onThePage([&] { list.SetLineHeight(number); });
+    onThePage([&] { list.SetLineHeight(16); });
+    onThePage([&] {
+        list.SaveSetup();
+        list.ScrollToPage(number);
+        list.DrawVisibleLines(nullptr);
+        list.RestoreSetup();
+    });
+    list.MoveItem({60, 100});
+    list.SetScrollPosition(0);
+}
+
 } // namespace
 
 TEST_F(GListPaneReentrancyTest, NumbersOutOfRangeAreTakenEverywhere) {
@@ -94,12 +129,19 @@ TEST_F(GListPaneReentrancyTest, NumbersOutOfRangeAreTakenEverywhere) {
          {kListSelectOne, kListSelectNothing, kListSelectSeveral, kListSelectToggle, kListSelectByCode}) {
         for (int rows : {0, 5, 100}) {
             GListPane *const made = Filled(rows, mode);
+            made->SetSelMode(mode); // also the one that no record makes
             Show();
             for (int number :
                  {-1, -2, rows, rows + 1, 1000, 20000, 65536, kMost, kMost - 1, kLeast, kLeast + 1})
                 CallEverythingWith(*made, number);
             UpdateGlog(glog);
             EXPECT_LE(made->GetNumItems(), 120) << "rows were added, but not lost";
+            for (int number : {-1, 0, 1, 2, rows, 65536, kMost, kMost - 1, kLeast, kLeast + 1})
+                ChangeEverythingAt(*made, number);
+            UpdateGlog(glog);
+            EXPECT_EQ(made->GetResInfo().selMode, mode);
+            EXPECT_EQ(made->GetNumDisplayed(), 7);
+            EXPECT_EQ(made->GetScrollPos(), 0);
             delete made;
         }
     }
@@ -112,6 +154,8 @@ TEST_F(GListPaneReentrancyTest, NumbersOutOfRangeAreTakenFromInsideANotification
             At1(call, [](GListPane *changed) {
                 for (int number : {-1, 10, 1000, kMost, kLeast})
                     CallEverythingWith(*changed, number);
+                for (int number : {-1, 1, kMost, kLeast})
+                    ChangeEverythingAt(*changed, number);
             });
             desktop.Play("wait 1\n" + drag);
             desktop.Play("wait 1\nclick " + At(1, 1));
@@ -404,19 +448,28 @@ TEST_F(GListPaneReentrancyTest, TheListMayBeDeletedByTheSecondaryButton) {
 
 TEST_F(GListPaneReentrancyTest, PagesFarOutOfRangeDoNotHangTheSelection) {
     for (int page : {kLeast, kMost})
-        for (GListSelectionMode mode : {kListSelectSeveral, kListSelectToggle}) {
-            Shown(10, mode);
-            list->SetScrollWithNoBar(false);
-            list->SelectAll();
-            list->ScrollToPage(page);
-            list->InvertSelection();
-            list->SelectAll();
-            list->DeselectAll();
-            desktop.Play("click " + At(2) + "\nactivate off\nactivate on");
-            list->SetSelMode(kListSelectOne);
-            EXPECT_EQ(list->NumSelected(), 0);
-            delete list;
-        }
+        for (GListSelectionMode mode : {kListSelectSeveral, kListSelectToggle})
+            for (short offset : {short(0), short(30000)}) // which leaves no room for rows
+                for (bool isHeard : {true, false}) {
+                    glistResRec record = Record(mode);
+                    record.firstLineOffset = offset;
+                    list = Equipped(NewList(record), 10);
+                    if (!isHeard)
+                        list->SetSelectionListener(nullptr);
+                    Show();
+                    list->SetScrollWithNoBar(false);
+                    list->SelectAll();
+                    list->ScrollToPage(page);
+                    list->InvertSelection();
+                    list->SelectAll();
+                    EXPECT_EQ(list->NumSelected(), 10);
+                    desktop.Play("activate off\nactivate on\nwait 1\nclick " + At(2));
+                    list->DeselectAll();
+                    EXPECT_EQ(list->NumSelected(), 0);
+                    list->SetSelMode(kListSelectOne);
+                    EXPECT_EQ(list->GetResInfo().selMode, kListSelectOne);
+                    delete list;
+                }
 }
 
 TEST_F(GListPaneReentrancyTest, ACellOfAListThatGoesInTheWaitDoesNotCount) {

@@ -100,6 +100,38 @@ TEST_F(GListPaneScrollingTest, EveryPositionIsShownOnTheBarAndDrawsTheListAnew) 
     EXPECT_EQ(RowsDrawnBy([&] { list->SetScrollPosition(50); }).size(), 7u) << "also the same one";
 }
 
+TEST_F(GListPaneScrollingTest, ARowThatComesInOrGoesShowsOnTheBar) {
+    GListPane *const list = WithBar(100);
+    Show();
+    Log const all = {"0", "1", "2", "3", "4", "5", "6"};
+    EXPECT_EQ(RowsDrawnBy([&] { list->AddItem(50); }), all);
+    EXPECT_EQ(bar->GetRange(), 95);
+    EXPECT_EQ(RowsDrawnBy([&] { list->DelItem(50); }), all);
+    EXPECT_EQ(bar->GetRange(), 94);
+    list->SetScrollPosition(94);
+    list->DelItem(0);
+    EXPECT_EQ(list->GetScrollPos(), 93);
+    EXPECT_EQ(bar->GetPosition(), 93);
+}
+
+// Kept: only a row that goes invalidates by itself.
+TEST_F(GListPaneScrollingTest, WithoutABarARowThatComesInDrawsNothing) {
+    GListPane *const list = Filled(3);
+    list->SetScrollWithNoBar(false);
+    Show();
+    EXPECT_EQ(RowsDrawnBy([&] { list->AddItem(0); }), Log());
+    EXPECT_EQ(RowsDrawnBy([&] { list->DelItem(0); }), (Log{"0", "1", "2"}));
+}
+
+TEST_F(GListPaneScrollingTest, GoingToAPageNeitherDrawsNorShowsOnTheBar) {
+    GListPane *const list = WithBar(100);
+    Show();
+    EXPECT_EQ(RowsDrawnBy([&] { EXPECT_TRUE(list->ScrollToPage(3)); }), Log());
+    EXPECT_EQ(list->GetScrollPos(), 14);
+    EXPECT_EQ(bar->GetPosition(), 0);
+    EXPECT_FALSE(list->ScrolledToEnd());
+}
+
 TEST_F(GListPaneScrollingTest, ItsRatioIsTheRowsThatFitOverAllRows) {
     GListPane *const list = WithBar(100);
     EXPECT_DOUBLE_EQ(list->GetThumbRatio(bar), 0.06);

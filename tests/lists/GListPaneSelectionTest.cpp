@@ -304,6 +304,40 @@ TEST_F(GListPaneSelectionTest, DeselectingAllWhileNotActiveDrawsNothing) {
     EXPECT_EQ(RowsDrawnBy([&] { list->DeselectAll(); }), Log());
 }
 
+TEST_F(GListPaneSelectionTest, SelectingAllWhileNotActiveDrawsNothing) {
+    GListPane *const list = Filled(5, kListSelectSeveral);
+    Show();
+    desktop.Play("activate off");
+    EXPECT_EQ(RowsDrawnBy([&] { list->SelectAll(); }), Log());
+    EXPECT_EQ(list->NumSelected(), 5);
+    list->SetSelectionListener(nullptr);
+    EXPECT_EQ(RowsDrawnBy([&] {
+                  list->DeselectAll();
+                  list->SelectAll();
+              }),
+              Log());
+}
+
+TEST_F(GListPaneSelectionTest, WhereAllColumnsSelectSelectingAllDrawsNothing) {
+    GListPane *const list = Filled(5, kListSelectSeveral);
+    list->SetSelColumn(GListPane::kAnyColumn);
+    Show();
+    EXPECT_EQ(RowsDrawnBy([&] { list->SelectAll(); }), Log());
+    EXPECT_EQ(list->NumSelected(), 5);
+}
+
+// Whoever hears of a row sees it changed, and those that come after it not yet.
+TEST_F(GListPaneSelectionTest, AllRowsChangeOneByOne) {
+    GListPane *const list = Filled(3, kListSelectSeveral);
+    std::vector<Rows> seen;
+    listener.onCall = [&](std::string const &) { seen.push_back(SelectedRows(*list)); };
+    list->SelectAll();
+    EXPECT_EQ(seen, (std::vector<Rows>{{2}, {1, 2}, {0, 1, 2}, {0, 1, 2}}));
+    seen.clear();
+    list->DeselectAll();
+    EXPECT_EQ(seen, (std::vector<Rows>{{0, 1}, {0}, {}, {}}));
+}
+
 // The range
 
 TEST_F(GListPaneSelectionTest, SettingTheRangeTellsNobodyAndDrawsBothRows) {
@@ -413,6 +447,26 @@ TEST_F(GListPaneSelectionTest, SelectedRowsAreInvalidatedTogether) {
     GListPane *const ranged = Filled(5, kListSelectByCode);
     ranged->SetSelRange(1, 3);
     EXPECT_EQ(RowsDrawnBy([&] { ranged->InvertSelection(); }), Log());
+}
+
+TEST_F(GListPaneSelectionTest, RowsWithoutASelectingFlagAreNotInvalidatedTogether) {
+    GListPane *const list = Filled(5, kListSelectSeveral);
+    list->DoSelect(1, -1, false);
+    list->DoSelect(2, 3, false);
+    Show();
+    EXPECT_EQ(RowsDrawnBy([&] { list->InvertSelection(); }), (Log{"2*"}));
+}
+
+TEST_F(GListPaneSelectionTest, AMarkGoesWithTheSelectionAlsoWhileNotActive) {
+    GListPane *const list = Filled(5);
+    Show();
+    desktop.Play("activate off");
+    EXPECT_EQ(RowsDrawnBy([&] {
+                  list->InvertItemRect(2, false);
+                  list->DeselectAll();
+                  list->InvalRow(2);
+              }),
+              (Log{"2"}));
 }
 
 TEST_F(GListPaneSelectionTest, TheSelectionSurvivesScrolling) {

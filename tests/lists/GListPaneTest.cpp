@@ -2,6 +2,7 @@
 #include "host/CompoundPane.h"
 #include "host/NamedColors.h"
 #include "tests/VirtualPlace.h"
+#include "tests/frame/Allocations.h"
 #include "tests/lists/ListTest.h"
 #include <cstddef>
 #include <limits>
@@ -111,6 +112,14 @@ TEST_F(GListPaneTest, WithoutAGlogThereIsNone) {
     glistResRec record = Record();
     EXPECT_EQ(GListPane::NewGListPane(nullptr, &record), nullptr);
     EXPECT_EQ(GListPane::NewGListPane(nullptr, TestItem().Container()), nullptr);
+}
+
+TEST_F(GListPaneTest, WithoutMemoryThereIsNone) {
+    glistResRec record = Record();
+    Allocations::FailAfter const fail(0);
+    EXPECT_EQ(GListPane::NewGListPane(glog, &record), nullptr);
+    EXPECT_TRUE(fail.HasFailed());
+    EXPECT_EQ(CountGlogItems(glog), 0);
 }
 
 TEST_F(GListPaneTest, ReadsEveryKeyOfItsItem) {
@@ -411,6 +420,75 @@ TEST_F(GListPaneTest, InALayoutItFollowsTheLayout) {
     EXPECT_EQ(BoxOf(*list), before);
 }
 
+TEST_F(GListPaneTest, InALayoutAResizeStillComesBackIntoRange) {
+    CompoundPane *const group = new CompoundPane;
+    group->CompoundPaneInit(glog, 0);
+    group->SetUseLayout(true);
+    GListPane *const list = Filled(100);
+    group->Add(list, -1);
+    list->ScrollToPage(20);
+    list->Resize({0, 0});
+    EXPECT_EQ(list->GetScrollPos(), 100 - list->NumFullyDisplayedLines());
+}
+
+TEST_F(GListPaneTest, ALayoutThatItIsInBeforeItIsMadeHasTheSayOverItsBox) {
+    class List : public GListPane {
+    public:
+        void Make(glogRec *owner, CompoundPane *group, glistResRec record) {
+            GlogPaneInit(owner, 0);
+            group->Add(this, -1);
+            InitGListPane(owner, &record, 0);
+        }
+    };
+    CompoundPane *const group = new CompoundPane;
+    group->CompoundPaneInit(glog, 0);
+    group->SetUseLayout(true);
+    List *const list = new List;
+    list->Make(glog, group, Record());
+    EXPECT_FALSE(BoxOf(*list) == ListBox());
+    EXPECT_EQ(list->GetResInfo().bounds, ListBox());
+}
+
+TEST_F(GListPaneTest, AListOfDialogStyleThatFollowsItsEdgesIsDrawnAnewAndASmallOneWhereItChanged) {
+    struct {
+        int style;
+        Rect before;
+        std::vector<Rect> drawn;
+    } const cases[] = {
+        {glistResRec::kDialogStyle, {20, 30, 120, 230}, {{20, 30, 190, 308}}},
+        {glistResRec::kSmallStyle, {20, 30, 120, 230}, {{20, 230, 120, 308}, {120, 30, 190, 308}}},
+        {glistResRec::kSmallStyle, {20, 30, 195, 308}, {{190, 30, 195, 308}}},
+        {glistResRec::kDialogStyle, {20, 30, 195, 308}, {{20, 30, 195, 308}}},
+        {glistResRec::kSmallStyle, {20, 30, 190, 308}, {}},
+        {glistResRec::kDialogStyle, {20, 30, 190, 308}, {{20, 30, 190, 308}}},
+    };
+    for (auto const &c : cases) {
+        glistResRec record = Record();
+        record.style = c.style;
+        record.autoEdge = glistResRec::kBothFollow;
+        record.edgeH = 12;
+        record.edgeV = 10;
+        GListPane *const list = NewList(record);
+        Show();
+        Rect box = c.before;
+        list->SetBox(&box);
+        EXPECT_EQ(InvalidatedBy([&] { list->Resize({0, 0}); }), c.drawn) << c.style << " " << c.before;
+        delete list;
+    }
+}
+
+TEST_F(GListPaneTest, WithoutAWindowItFollowsNoEdges) {
+    glistResRec record = Record();
+    record.autoEdge = glistResRec::kBothFollow;
+    GListPane *const list = NewList(record);
+    Rect box = ListBox();
+    list->SetBox(&box);
+    list->SetGlog(nullptr);
+    list->Resize({0, 0});
+    EXPECT_EQ(BoxOf(*list), ListBox());
+    delete list;
+}
+
 TEST_F(GListPaneTest, AnEdgeBeyondSixteenBitsIsTheNearestOne) {
     glistResRec record = Record();
     record.autoEdge = glistResRec::kBothFollow;
@@ -449,28 +527,73 @@ TEST_F(GListPaneTest, SelectedRowsAreDrawnAnewWithTheWindowsActivation) {
     EXPECT_EQ(RowsDrawnBy([&] { desktop.Play("activate on"); }), (Log{"1*"}));
 }
 
+TEST_F(GListPaneTest, TheOneSelectedRowIsDrawnAnewWithTheWindowsActivation) {
+    GListPane *const list = Filled(5);
+    list->SetSelRange(2, 2);
+    Show();
+    EXPECT_EQ(RowsDrawnBy([&] { desktop.Play("activate off"); }), (Log{"2"}));
+    EXPECT_EQ(RowsDrawnBy([&] { desktop.Play("activate on"); }), (Log{"2*"}));
+}
+
+TEST_F(GListPaneTest, AHiddenListIsActivatedWithoutBeingDrawn) {
+    GListPane *const list = Filled(5);
+    list->SetSelRange(2, 2);
+    Show();
+    list->Hide();
+    EXPECT_TRUE(Only("InvalRect", Traced(*list, [&] { list->Deactivate(); })).empty());
+    EXPECT_FALSE(list->IsActive());
+    EXPECT_TRUE(Only("InvalRect", Traced(*list, [&] { list->Activate(); })).empty());
+    EXPECT_TRUE(list->IsActive());
+}
+
+namespace {
+
+// Notes what becomes of its inactive selection, and whether the list counts as active then.
+class InactiveList : public GListPane {
+public:
+    InactiveList(glogRec *owner, glistResRec *record) { InitGListPane(owner, record, 0); }
+    void InvalInactiveSelectionDisplay() override {
+        log.push_back(IsActive() ? "invalidate active" : "invalidate");
+        Prepare();
+        VelaDrawing::InvalRect(&kInactiveMark);
+    }
+    void DrawInactiveSelection() override { log.push_back("draw"); }
+
+    static Rect const kInactiveMark;
+    Log log;
+};
+
+Rect const InactiveList::kInactiveMark = {21, 200, 25, 210};
+
+} // namespace
+
+TEST_F(GListPaneTest, TheInactiveDisplayIsInvalidatedBeforeTheRowsOnTheWayInAndAfterThemOnTheWayOut) {
+    glistResRec record = Record();
+    InactiveList *const list = new InactiveList(glog, &record);
+    Equipped(list, 5);
+    list->SetSelRange(2, 2);
+    Show();
+    Rect const row = RowBox(*list, 2);
+    Lines const rowThenMark = Traced(*list, [&] {
+        VelaDrawing::InvalRect(&row);
+        VelaDrawing::InvalRect(&InactiveList::kInactiveMark);
+    });
+    EXPECT_EQ(Only("InvalRect", Traced(*list, [&] { list->Deactivate(); })), rowThenMark);
+    EXPECT_EQ(Only("InvalRect", Traced(*list, [&] { list->Activate(); })),
+              Lines(rowThenMark.rbegin(), rowThenMark.rend()));
+}
+
 TEST_F(GListPaneTest, TellsOfTheInactiveDisplayBetweenTheTwoStates) {
-    class InactiveList : public GListPane {
-    public:
-        explicit InactiveList(glogRec *owner, glistResRec *record) { InitGListPane(owner, record, 0); }
-        void InvalInactiveSelectionDisplay() override { log.push_back("invalidate"); }
-        void DrawInactiveSelection() override { log.push_back("draw"); }
-        Log log;
-    };
     glistResRec record = Record();
     InactiveList *const list = new InactiveList(glog, &record);
     Show();
     list->log.clear();
     desktop.Play("activate off");
-    list->Inval();
-    UpdateGlog(glog);
-    EXPECT_EQ(list->log, (Log{"invalidate", "draw"}));
+    EXPECT_EQ(list->log, (Log{"invalidate active", "draw"}));
     list->Deactivate();
     EXPECT_EQ(list->log.size(), 2u) << "it is not active any more";
     desktop.Play("activate on");
-    list->Inval();
-    UpdateGlog(glog);
-    EXPECT_EQ(list->log, (Log{"invalidate", "draw", "invalidate"}));
+    EXPECT_EQ(list->log, (Log{"invalidate active", "draw", "invalidate"}));
     list->Hide();
     list->Deactivate();
     EXPECT_EQ(list->log.size(), 3u) << "it is hidden";

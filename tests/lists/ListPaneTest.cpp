@@ -54,10 +54,10 @@ protected:
         return list;
     }
     // How far the area is scrolled.
-    static int Scrolled(NotingList &list) {
+    static Point Scrolled(NotingList &list) {
         Point place = {kView.top, kView.left};
         list.LocalOffset(&place);
-        return place.v;
+        return place;
     }
     static Rect AreaOf(NotingList &list) { return list.Get(0)->GetBounds(); }
     Numbers DrawnBy(NotingList &list, std::function<void()> const &action) {
@@ -90,11 +90,25 @@ TEST_F(ListPaneTest, IsEmptyAtFirst) {
 }
 
 TEST_F(ListPaneTest, WithoutLinesItsAreaFillsTheViewAndTheBarIsDead) {
-    NotingList *const list = NewList(16, 0);
+    NotingList *const list = NewList(16, 20);
+    ScrollBarPane *const across = new ScrollBarPane(glog, ScrollBarPane::kHorizontalBar, 0, 0);
+    Rect flat = {120, 30, 136, 230};
+    across->SetBox(&flat);
+    list->SetHScrollBar(across);
+    list->width = 500;
+    list->InvalListDimensions();
+    Show();
+    desktop.Play("wait 1\nclick 238 112\nclick 222 128");
+    ASSERT_EQ(Scrolled(*list), (Point{16, 16})) << "by an arrow of each bar";
+    list->width = 0;
+    list->SetNumLines(0);
     EXPECT_EQ(AreaOf(*list), (Rect{0, 0, 100, 200}));
     EXPECT_EQ(bar->GetRange(), 0);
-    Show();
-    EXPECT_EQ(list->Take(), Numbers());
+    EXPECT_EQ(across->GetRange(), 0);
+    EXPECT_EQ(Scrolled(*list), (Point{0, 0}));
+    EXPECT_EQ(DrawnBy(*list, [&] { list->Inval(); }), Numbers());
+    desktop.Play("wait 1\nclick 238 112\nclick 222 128");
+    EXPECT_EQ(Scrolled(*list), (Point{0, 0}));
 }
 
 TEST_F(ListPaneTest, ItsAreaHasRoomForAllLinesAndTheirWidth) {
@@ -156,27 +170,27 @@ TEST_F(ListPaneTest, AnArrowMovesALine) {
     NotingList *const list = NewList(24, 20);
     EXPECT_EQ(list->GetScrollDelta(), 24);
     bar->ScrollOneUnit(true);
-    EXPECT_EQ(Scrolled(*list), 24);
+    EXPECT_EQ(Scrolled(*list).v, 24);
     bar->ScrollPage(true);
-    EXPECT_EQ(Scrolled(*list), 114);
+    EXPECT_EQ(Scrolled(*list).v, 114);
 }
 
 TEST_F(ListPaneTest, AWheelNotchIsFivePixels) {
     NotingList *const list = NewList(16, 20);
     Show();
     desktop.Play("wheel 100 60 0 -3");
-    EXPECT_EQ(Scrolled(*list), 15);
+    EXPECT_EQ(Scrolled(*list).v, 15);
 }
 
 TEST_F(ListPaneTest, AtTheBottomMoreOrFewerLinesKeepItThere) {
     NotingList *const list = NewList(16, 20);
     list->SetVScrollPos(220);
     list->SetNumLines(30);
-    EXPECT_EQ(Scrolled(*list), 380);
+    EXPECT_EQ(Scrolled(*list).v, 380);
     list->SetNumLines(10);
-    EXPECT_EQ(Scrolled(*list), 60);
+    EXPECT_EQ(Scrolled(*list).v, 60);
     list->SetNumLines(2);
-    EXPECT_EQ(Scrolled(*list), 0);
+    EXPECT_EQ(Scrolled(*list).v, 0);
 }
 
 TEST_F(ListPaneTest, TheSameNumberIsNoChange) {

@@ -2,8 +2,10 @@
 #include "host/Icons.h"
 #include "host/NamedColors.h"
 #include "tests/ShapingCount.h"
+#include "tests/frame/Allocations.h"
 #include "tests/lists/ListTest.h"
 #include <algorithm>
+#include <limits>
 #include <map>
 
 namespace {
@@ -312,4 +314,64 @@ TEST_F(ListTest, WithoutColumnsADrawerOfTextsDrawsNothing) {
     list->Inval();
     Repainted();
     EXPECT_EQ(asked, 0);
+}
+
+TEST_F(ListTextDrawerTest, ARowMayBeDrawnWhereNoneShows) {
+    GListPane *const list = NewTextList(100);
+    Rect box = {20, 30, 20, 230}; // of no height
+    list->SetBox(&box);
+    ASSERT_LE(list->GetNumDisplayed(), 0);
+    Rect row = {60, 31, 76, 229};
+    for (int line : {0, 1, 5, std::numeric_limits<int>::max()})
+        EXPECT_EQ(
+            Only("DrawTextLayoutInRect", Traced(*list, [&] { texts->DrawLine(line, &row, false); })).size(),
+            3u)
+            << line;
+}
+
+TEST_F(ListTextDrawerTest, ANegativeRowIsNotDrawn) {
+    NewTextList(100);
+    asked = 0;
+    Rect row = {60, 31, 76, 229};
+    for (int line : {-1, std::numeric_limits<int>::min()})
+        texts->DrawLine(line, &row, false);
+    EXPECT_EQ(asked, 0);
+}
+
+// A dialog may ask for many rows and columns of nearly no size, of which none but a few have a text.
+TEST_F(ListTextDrawerTest, ManyRowsAndColumnsTakeNoMoreThanSoMuchMemory) {
+    glistResRec record = Record();
+    record.bounds = {0, 0, 4000, 200};
+    record.lineHeight = 1;
+    GListPane *const list = Equipped(NewList(record), 10000);
+    ListTextDrawer drawn(list, [](int, int, ListCell &cell) { cell.text = Text("x"); });
+    boost::shared_ptr<ColumnList> const columns = boost::make_shared<ColumnList>(static_cast<short>(2000));
+    columns->SetBothEdges(1999, 0, 100);
+    list->SetColumnList(columns);
+    Show();
+    ASSERT_GT(list->GetNumDisplayed(), 3000);
+    Rect row = {60, 31, 76, 229};
+    Allocations::Counter const counter;
+    EXPECT_EQ(Only("DrawTextLayoutInRect", Traced(*list, [&] { drawn.DrawLine(0, &row, false); })).size(),
+              1u);
+    EXPECT_LT(counter.Bytes(), 20000000);
+}
+
+// Rows share the layouts then, and each still shows its own text.
+TEST_F(ListTextDrawerTest, RowsThatShareWhatIsKeptShowTheirOwnTexts) {
+    glistResRec record = Record();
+    record.bounds = {0, 0, 199, 200};
+    record.lineHeight = 2;
+    GListPane *const list = Equipped(NewList(record), 200);
+    boost::shared_ptr<ColumnList> const columns = boost::make_shared<ColumnList>(static_cast<short>(32767));
+    columns->SetBothEdges(0, 0, 100);
+    list->SetColumnList(columns);
+    list->SetLineDrawer(new ListTextDrawer(list,
+                                           [](int line, int, ListCell &cell) {
+                                               cell.text = Text(("row" + std::to_string(line)).c_str());
+                                           }),
+                        true);
+    Show();
+    for (int row : {0, 1, 2, 50, 0})
+        EXPECT_NE(TextsOf(*list, row).front().find("\"row" + std::to_string(row) + "\""), std::string::npos);
 }

@@ -193,6 +193,34 @@ TEST_F(SelectStringPaneTest, SelectedInAWindowThatIsNotActiveItIsNotHighlighted)
     EXPECT_TRUE(Only("SetUserHiliteColorAsForeColor", DrawingOf(*pane)).empty());
 }
 
+TEST_F(SelectStringPaneTest, TheTextStandsOnItsBaseline) {
+    SelectStringPane *const pane = Make("Verse");
+    DrawingOf(*pane);
+    Point pen{0, 0};
+    VelaDrawing::GetPen(&pen);
+    SaveTextState const state;
+    SetFontData(GetIndVelaFont(2));
+    TarnQuickDrawText::FontInfo info;
+    tarn::GetFontInfo(info);
+    EXPECT_EQ(pen, (Point{static_cast<short>(20 + info.ascent), 30}));
+}
+
+TEST_F(SelectStringPaneTest, TheTextIsDrawnIntoTheBoxInItsOwnFont) {
+    SelectStringPane *const pane = Make("Verse");
+    Rect const box = BoxOf(*pane);
+    Lines const expected =
+        Only("DrawStringInRect", Traced(*pane, [&] {
+                 SaveTextState const state;
+                 SetFontData(GetIndVelaFont(2));
+                 VelaDrawing::RGBForeColor(kDialogActiveTextColor);
+                 DrawStringInRect(Text(" Verse "), box, TextSettings::kAlignLeft, TextSettings::kTruncateNone,
+                                  0, 0, 0, 0.0f, 1.0f, 1.0f, 0.0f);
+             }));
+    pane->Prepare();
+    SetFontData(GetIndVelaFont(8));
+    EXPECT_EQ(Only("DrawStringInRect", DrawingOf(*pane)), expected);
+}
+
 TEST_F(SelectStringPaneTest, TheTextMovesWithTheBox) {
     SelectStringPane *const pane = Make("Verse");
     auto const pen = [&] {
