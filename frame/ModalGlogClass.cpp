@@ -41,7 +41,7 @@ bool ModalGlogClass::ModalGlogInit(short resourceID) {
 short ModalGlogClass::ModalLoop(int *value, unsigned char arg, int a, int b) {
     WithCursorDispatchingDisabled const cursorStays;
     short item = kNoItem;
-    if (!isOpen)
+    if (!isOpen || GlogError(glog)) // the user may have closed it
         return item;
     if (!glog->IsVisible())
         ShowGlog(glog, kShowGlog);

@@ -49,7 +49,7 @@ void PositionGlog(glogRec *, Rect *, bool);
 // Closes the window and deletes the panes; the pointer is invalid afterwards. May be called from inside one
 // of its panes: what is still running ends first.
 void DisposeGlog(glogRec *);
-// Whether the glog cannot be used: it is null, or has been disposed of.
+// Whether the glog cannot be used: it is null, or has been disposed of, however long ago.
 bool GlogError(glogRec *);
 
 namespace LowLevelGlogOpening {

@@ -2,6 +2,7 @@
 #include "frame/ResourceReading.h"
 #include "host/GlogStyleSheet.h"
 #include "host/OSFont.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
@@ -175,8 +176,9 @@ void PopMPane::DrawGuts(OSRgn *updateRegion) {
 int PopMPane::HandleClick(EventRecordAdapter *event) {
     if (agent) {
         bool handled = false;
+        PaneWatch const watch(this);
         int const result = agent->HandleClick(this, event, handled);
-        if (handled)
+        if (handled || !watch.PaneExists())
             return result;
     }
     Prepare();

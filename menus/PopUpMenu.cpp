@@ -238,9 +238,11 @@ bool PopUpMenu::FindItemByName(UString const &name, int &item) {
 void PopUpMenu::ApplyDecoratorToItem(short item, boost::shared_ptr<MenuItemDecorator> const &decorator) {
     if (!Exists(item))
         return;
+    Watch const watch(*this);
     if (item == currentSelection)
         InvalPane();
-    menu.ApplyDecoratorToItem(item, decorator);
+    if (watch.MenuExists())
+        menu.ApplyDecoratorToItem(item, decorator);
 }
 
 // The current item

@@ -8,8 +8,8 @@ struct glogRec;
 // come to. One client may serve several bars and tells them apart by the pointer. The client is not the
 // bar's, and must be taken from it by SetClient before it goes away.
 //
-// In Scroll, ScrollTo and DoneScrolling the client may do anything, also take itself from the bar or delete
-// the bar. The other calls must leave both where they are.
+// In every call but GetThumbRatio, which must leave both where they are, the client may do anything, also
+// take itself from the bar or delete the bar: it hears no more then.
 class ScrollBarClient {
 public:
     virtual ~ScrollBarClient();

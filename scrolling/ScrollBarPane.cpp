@@ -256,20 +256,14 @@ void ScrollBarPane::SetActiveInBackground() { activeInBackground = true; }
 
 void ScrollBarPane::ScrollOneUnit(bool forward) { Scroll(forward ? 1 : -1); }
 
-void ScrollBarPane::Scroll(int units) {
-    if (client)
-        ScrollOnce(true, units);
-}
+void ScrollBarPane::Scroll(int units) { ScrollOnce(true, units); }
 
-void ScrollBarPane::ScrollPage(bool forward) {
-    if (client)
-        ScrollOnce(false, forward ? 1 : -1);
-}
+void ScrollBarPane::ScrollPage(bool forward) { ScrollOnce(false, forward ? 1 : -1); }
 
 void ScrollBarPane::ScrollOnce(bool byUnit, int times) {
-    client->InhibitAutoScroll(GetGlog());
     int amount = 0, multiplier = 0;
-    client->StartScrolling(this, byUnit, amount, multiplier);
+    if (!TellStart(byUnit, amount, multiplier))
+        return;
     amount = Saturated(static_cast<long long>(std::max(amount, 1)) * times);
     if (TellScroll(amount, multiplier))
         EndScrolling();
@@ -277,24 +271,42 @@ void ScrollBarPane::ScrollOnce(bool byUnit, int times) {
 
 // The client hears of the end without another announcement.
 void ScrollBarPane::ScrollToEnd(bool toEnd) {
-    if (!client)
-        return;
+    PaneWatch const watch(this);
     int target = 0;
     if (toEnd) {
-        client->InhibitAutoScroll(GetGlog());
+        if (!Announce())
+            return;
         target = client->GetMaxScrollValue(this);
     }
-    client->InhibitAutoScroll(GetGlog());
-    PaneWatch const watch(this);
+    if (!watch.PaneExists() || !Announce())
+        return;
     client->ScrollTo(this, target);
     if (watch.PaneExists() && client)
         client->DoneScrolling(this);
 }
 
-// Whether bar and client are still there: the client may do away with either.
-bool ScrollBarPane::TellScroll(int amount, int &multiplier) {
+// The client
+
+bool ScrollBarPane::Announce() {
+    if (!client)
+        return false;
     PaneWatch const watch(this);
     client->InhibitAutoScroll(GetGlog());
+    return watch.PaneExists() && client;
+}
+
+bool ScrollBarPane::TellStart(bool byUnit, int &amount, int &multiplier) {
+    if (!Announce())
+        return false;
+    PaneWatch const watch(this);
+    client->StartScrolling(this, byUnit, amount, multiplier);
+    return watch.PaneExists() && client;
+}
+
+bool ScrollBarPane::TellScroll(int amount, int &multiplier) {
+    if (!Announce())
+        return false;
+    PaneWatch const watch(this);
     client->Scroll(this, amount, multiplier);
     return watch.PaneExists() && client;
 }
@@ -306,16 +318,18 @@ CustomEventHandler *ScrollBarPane::CanHandleCustomEvent(UIEvent *event) {
 // Gestures
 
 void ScrollBarPane::BeginScrolling(bool byPage, ScrollDirection direction) {
-    if (!client)
+    int amount = 0, multiplier = 0;
+    if (!TellStart(!byPage, amount, multiplier))
         return;
-    client->InhibitAutoScroll(GetGlog());
-    scrollAmount = 0;
-    scrollMultiplier = 0;
-    client->StartScrolling(this, !byPage, scrollAmount, scrollMultiplier);
-    scrollAmount = std::max(scrollAmount, 1);
+    scrollAmount = std::max(amount, 1);
+    scrollMultiplier = multiplier;
     if (!Step(direction == kTowardStart ? -scrollAmount : scrollAmount))
         return;
-    repeatDelay = byPage ? client->GetPageScrollDelay() : client->GetArrowScrollDelay();
+    PaneWatch const watch(this);
+    int const delay = byPage ? client->GetPageScrollDelay() : client->GetArrowScrollDelay();
+    if (!watch.PaneExists())
+        return;
+    repeatDelay = delay;
     nextRepeatTick = CurrentTick() + 3LL * repeatDelay;
 }
 
@@ -344,8 +358,6 @@ bool ScrollBarPane::Step(int amount) {
 }
 
 void ScrollBarPane::EndScrolling() {
-    if (!client)
-        return; // it went away while it was scrolled
-    client->InhibitAutoScroll(GetGlog());
-    client->DoneScrolling(this);
+    if (Announce())
+        client->DoneScrolling(this);
 }

@@ -107,6 +107,10 @@ private:
     // By units, negative toward the start; nothing without a client.
     void Scroll(int units);
     void ScrollOnce(bool byUnit, int times);
+    // Calls of the client. The first announces one that will move it, as the other two do by themselves. All
+    // answer whether bar and client are still there: the client may do away with either.
+    bool Announce();
+    bool TellStart(bool byUnit, int &amount, int &multiplier);
     bool TellScroll(int amount, int &multiplier);
 
     // A gesture's begin, its repeats, each of which comes to nothing before its time, and its end.

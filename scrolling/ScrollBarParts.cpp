@@ -60,7 +60,7 @@ public:
     void MouseTaskEnd() override { bar->EndScrolling(); }
 
 private:
-    int PositionAt(Point const &) const;
+    bool FindPosition(Point const &, int &position) const;
 
     ThumbPane *thumb;
     ScrollBarPane *bar;
@@ -72,29 +72,31 @@ void ScrollBarPane::ThumbScrollMouseTask::MouseTaskBegin() {
     grabOffset = along.Place(GetStartPoint()) - along.Start(thumb->GetThumbRect());
 }
 
-// The thumb's length is asked for anew each time: the client may change it meanwhile.
-int ScrollBarPane::ThumbScrollMouseTask::PositionAt(Point const &where) const {
+// The thumb's length is asked for anew each time: the client may change it meanwhile. False when the client
+// has done away with the bar.
+bool ScrollBarPane::ThumbScrollMouseTask::FindPosition(Point const &where, int &position) const {
     SingleAxis const along = thumb->Along();
     Rect const thumbRect = thumb->GetThumbRect(), bounds = thumb->GetBounds();
     int const room = along.Length(bounds) - along.Length(thumbRect);
+    PaneWatch const watch(bar);
     int const greatest = bar->client->GetMaxScrollValue(bar);
+    if (!watch.PaneExists())
+        return false;
     int const offset = along.Place(where) - along.Start(bounds) - grabOffset;
     int const travel = std::max(std::min(offset, room), 0);
-    if (room == 0)
-        return 0;
-    int const position = Truncated(static_cast<double>(travel) / room * greatest);
-    return std::max(std::min(position, greatest), 0);
+    int const wanted = room == 0 ? 0 : Truncated(static_cast<double>(travel) / room * greatest);
+    position = std::max(std::min(wanted, greatest), 0);
+    return true;
 }
 
 // How far away the mouse is across the bar does not matter.
 void ScrollBarPane::ThumbScrollMouseTask::MouseTaskContinue(Point const &where) {
-    if (!bar->client)
-        return; // it went away while it was scrolled
-    int const newPosition = PositionAt(where);
-    if (newPosition == bar->position)
+    int newPosition = 0;
+    if (!bar->client || !FindPosition(where, newPosition)) // it went away while it was scrolled
+        return;
+    if (newPosition == bar->position || !bar->Announce())
         return;
     PaneWatch const watch(bar);
-    bar->client->InhibitAutoScroll(bar->GetGlog());
     bar->client->ScrollTo(bar, newPosition);
     if (watch.PaneExists())
         UpdateGlog(bar->GetGlog());

@@ -48,8 +48,7 @@ ScrollGrid::ScrollGrid(glogRec *owner, short id, ScrollBarPane *bar)
     , supressGridUpdate(false)
     , supressSBarUpdate(false)
     , alwaysUpdateScrollbar(true)
-    , slaved(false)
-    , scrollbar(nullptr) {
+    , slaved(false) {
     GridInit(owner, id);
     SetScrollbar(bar);
 }
@@ -214,8 +213,10 @@ void ScrollGrid::InvalidateUncovered(Rect const &oldBox) {
     Prepare();
     VelaDrawing::InvalRgn(uncovered);
     supressGridUpdate = true;
+    PaneWatch const watch(this);
     UpdateScrollInfo();
-    supressGridUpdate = false;
+    if (watch.PaneExists())
+        supressGridUpdate = false;
 }
 
 void ScrollGrid::SetSupressGridUpdate(bool suppress) { supressGridUpdate = suppress; }
@@ -230,14 +231,16 @@ void ScrollGrid::SetScrollbar(ScrollBarPane *bar) {
     if (!bar)
         return;
     bar->SetClient(this);
-    UpdateScrollInfo();
-    DependUpon(bar);
+    PaneWatch const watch(this);
+    UpdateScrollInfo(); // which may draw, and so do away with the grid or the bar
+    if (watch.PaneExists() && scrollbar.Get() == bar)
+        DependUpon(bar);
 }
 
 void ScrollGrid::LetGoOfScrollbar() {
     if (!scrollbar)
         return;
-    Provider<ScrollBarPane_Listener> &provider = *scrollbar;
+    Provider<ScrollBarPane_Listener> &provider = *scrollbar.Get();
     if (provider.HasDependents())
         provider.RemoveDependent(this);
     scrollbar->SetClient(nullptr);
@@ -286,20 +289,26 @@ CustomEventHandler *ScrollGrid::CanHandleCustomEvent(UIEvent *event) {
 // Guards
 
 WithScrollGridSuppressGridUpdate::WithScrollGridSuppressGridUpdate(ScrollGrid *grid_, bool suppress)
-    : grid(grid_)
-    , before(grid->GetSupressGridUpdate()) {
+    : before(grid_->GetSupressGridUpdate()) {
+    grid = grid_;
     grid->SetSupressGridUpdate(suppress);
 }
 
-WithScrollGridSuppressGridUpdate::~WithScrollGridSuppressGridUpdate() { grid->SetSupressGridUpdate(before); }
+WithScrollGridSuppressGridUpdate::~WithScrollGridSuppressGridUpdate() {
+    if (grid)
+        grid->SetSupressGridUpdate(before);
+}
 
 WithScrollGridSuppressSBarUpdate::WithScrollGridSuppressSBarUpdate(ScrollGrid *grid_, bool suppress)
-    : grid(grid_)
-    , before(grid->GetSupressSBarUpdate()) {
+    : before(grid_->GetSupressSBarUpdate()) {
+    grid = grid_;
     grid->SetSupressSBarUpdate(suppress);
 }
 
-WithScrollGridSuppressSBarUpdate::~WithScrollGridSuppressSBarUpdate() { grid->SetSupressSBarUpdate(before); }
+WithScrollGridSuppressSBarUpdate::~WithScrollGridSuppressSBarUpdate() {
+    if (grid)
+        grid->SetSupressSBarUpdate(before);
+}
 
 WithScrollGridSuppressUpdates::WithScrollGridSuppressUpdates(ScrollGrid *grid, bool suppress)
     : gridUpdate(grid, suppress)

@@ -3,6 +3,7 @@
 // What has scrolled a little is moved as pixels, and only what comes into view is drawn. A scroll bar, which
 // is not the grid's, may show and move the position.
 #pragma once
+#include "host/PanePtr.h"
 #include "scrolling/Grid.h"
 #include "scrolling/ScrollBarClient.h"
 #include "scrolling/ScrollBarPane.h"
@@ -48,7 +49,7 @@ public:
 
     // Takes a bar as its own, or null, shows the position on it, and leaves the former one without a client.
     void SetScrollbar(ScrollBarPane *);
-    ScrollBarPane *GetTheScrollbar() { return scrollbar; }
+    ScrollBarPane *GetTheScrollbar() { return scrollbar.Get(); }
     // The bar's box; without a bar these do nothing.
     void GetScrollbarBounds(Rect *);
     void SetScrollbarBounds(Rect *);
@@ -107,10 +108,10 @@ private:
     bool supressSBarUpdate;
     bool alwaysUpdateScrollbar;
     bool slaved;
-    ScrollBarPane *scrollbar; // not owned
+    PanePtr<ScrollBarPane> scrollbar; // not owned
 };
 
-// Set a flag of the grid for a block, and put back what it was.
+// Set a flag of the grid for a block, and put back what it was, unless the grid has gone.
 class WithScrollGridSuppressGridUpdate {
 public:
     WithScrollGridSuppressGridUpdate(ScrollGrid *, bool suppress);
@@ -119,7 +120,7 @@ public:
     WithScrollGridSuppressGridUpdate &operator=(WithScrollGridSuppressGridUpdate const &) = delete;
 
 private:
-    ScrollGrid *grid;
+    PanePtr<ScrollGrid> grid;
     bool before;
 };
 
@@ -132,7 +133,7 @@ public:
     WithScrollGridSuppressSBarUpdate &operator=(WithScrollGridSuppressSBarUpdate const &) = delete;
 
 private:
-    ScrollGrid *grid;
+    PanePtr<ScrollGrid> grid;
     bool before;
 };
 

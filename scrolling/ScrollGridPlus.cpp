@@ -102,14 +102,19 @@ void ScrollGridPlus::LocalOffset(Point *p) {
 }
 
 void ScrollGridPlus::UpdateScrollInfo() {
+    PaneWatch const watch(this);
     bool const suppressed = GetSupressGridUpdate();
     SetSupressGridUpdate(true);
     ScrollGrid::UpdateScrollInfo();
+    if (!watch.PaneExists())
+        return;
     SetSupressGridUpdate(suppressed);
 
     int const greatest = GetMaxLateralScroll();
     if (stickToEnd)
         KeepDistanceFromEnd(greatest);
+    if (!watch.PaneExists())
+        return;
     if (greatest == 0 || lateralScrollOffset > greatest)
         LateralScrollTo(greatest);
     else if (lateralScrollbar)
@@ -117,13 +122,15 @@ void ScrollGridPlus::UpdateScrollInfo() {
 }
 
 void ScrollGridPlus::KeepDistanceFromEnd(int greatest) {
+    PaneWatch const watch(this);
     int const distance = maxLateralScroll - lateralScrollOffset;
     if (distance >= 0) {
         int const wanted = std::max(greatest - distance, 0);
         if (wanted != lateralScrollOffset)
             LateralScrollTo(wanted);
     }
-    maxLateralScroll = greatest;
+    if (watch.PaneExists())
+        maxLateralScroll = greatest;
 }
 
 CustomEventHandler *ScrollGridPlus::CanHandleCustomEvent(UIEvent *event) {

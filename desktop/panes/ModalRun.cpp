@@ -1,6 +1,4 @@
 #include "desktop/panes/ModalRun.h"
-#include "desktop/Desktop.h"
-#include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/EventRecords.h"
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/HostCall.h"
@@ -8,7 +6,6 @@
 #include "desktop/panes/PortKeeper.h"
 #include "desktop/windows/EventLoop.h"
 #include "host/GlogPane.h"
-#include <algorithm>
 #include <vector>
 
 namespace {
@@ -140,16 +137,11 @@ void ModalRun::Cancel(InputEvent const &event) {
         Hit(cancelItem, kCancelled);
 }
 
-// Between two runs of a dialog its item may have disposed of it.
-static bool IsOpen(glogRec const *record) {
-    std::vector<Glog *> const &glogs = DesktopRep::Of(*Desktop::Current()).Glogs();
-    return std::find(glogs.begin(), glogs.end(), record) != glogs.end();
-}
-
 void DoModalGlog(glogRec *record, short *item, int *value, GlogFilterHook filter, void *self, bool, int,
                  int confirm, int cancel, bool, RunIdleChores chores) {
     *item = kNothing;
     *value = 0;
-    if (EventLoop::Open() && IsOpen(record))
+    // Between two runs of a dialog its item may have disposed of it.
+    if (EventLoop::Open() && !GlogError(record))
         ModalRun(Glog::From(record), filter, self, confirm, cancel, chores).Run(item, value);
 }

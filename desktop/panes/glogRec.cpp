@@ -3,6 +3,8 @@
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/PaneAccess.h"
 #include "host/GlogPane.h"
+#include <algorithm>
+#include <vector>
 
 void UpdateGlog(glogRec *glog) {
     if (glog)
@@ -48,16 +50,21 @@ void PositionGlog(glogRec *glog, Rect *place, bool redrawNow) {
         UpdateGlog(glog);
 }
 
-// A glog that is gone already is none of the desktop's: it is compared, and not looked into.
-void DisposeGlog(glogRec *glog) {
+// A glog that is gone already is none of the desktop's: it is compared, and not looked into. Null for that.
+static Glog *Known(glogRec const *glog) {
     if (!Desktop::Current())
-        return;
-    for (Glog *known : DesktopRep::Of(*Desktop::Current()).Glogs()) {
-        if (known == glog) {
-            DesktopRep::Of(*Desktop::Current()).Dispose(known);
-            return;
-        }
-    }
+        return nullptr;
+    std::vector<Glog *> const &glogs = DesktopRep::Of(*Desktop::Current()).Glogs();
+    auto const found = std::find(glogs.begin(), glogs.end(), glog);
+    return found == glogs.end() ? nullptr : *found;
 }
 
-bool GlogError(glogRec *glog) { return glog == nullptr || Glog::From(glog).disposed; }
+void DisposeGlog(glogRec *glog) {
+    if (Glog *const known = Known(glog))
+        DesktopRep::Of(*Desktop::Current()).Dispose(known);
+}
+
+bool GlogError(glogRec *glog) {
+    Glog const *const known = Known(glog);
+    return !known || known->disposed;
+}

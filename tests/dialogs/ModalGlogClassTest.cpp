@@ -50,10 +50,14 @@ private:
 class Places : public ModalGlogClass {
 public:
     static void Expect() {
-        ExpectInOrder(kAfterDestructor,
-                      static_cast<char (ModalGlogClass::*)(short, int)>(&Places::HandleItem),
-                      static_cast<char (ModalGlogClass::*)()>(&Places::ReadError));
+        ExpectInOrder(
+            kAfterDestructor, static_cast<char (ModalGlogClass::*)(short, int)>(&Places::HandleItem),
+            static_cast<char (ModalGlogClass::*)()>(&Places::ReadError), &Places::ModalFilter, &Places::Read);
     }
+
+private:
+    char ModalFilter(EventRecordAdapter *, short *, int *) override { return false; }
+    char Read() override { return true; }
 };
 
 class ModalGlogClassTest : public DialogTest {
@@ -326,6 +330,17 @@ TEST_F(ModalGlogClassTest, ADialogThatIsDisposedOfEndsTheLoop) {
     dialog.refusals = 1;
     dialog.onRead = [&] { DisposeGlog(dialog.GlogP()); };
     EXPECT_EQ(Loop(dialog, kOK), -1);
+}
+
+TEST_F(ModalGlogClassTest, ADialogThatIsClosedBeforeItsLoopRunsIsAnsweredAtOnce) {
+    TestDialog dialog;
+    dialog.ModalGlogInit(700);
+    ShowGlog(dialog.GlogP(), kShowGlog);
+    DisposeGlog(dialog.GlogP());
+    EXPECT_TRUE(dialog.ReadError());
+    EXPECT_EQ(Loop(dialog, ""), -1);
+    EXPECT_EQ(value, 99);
+    EXPECT_EQ(dialog.asked, "");
 }
 
 TEST_F(ModalGlogClassTest, TheEndOfTheProgramEndsTheLoop) {

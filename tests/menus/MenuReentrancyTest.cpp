@@ -184,6 +184,22 @@ TEST_F(MenuReentrancy, AListenerThatThrowsChangesNothing) {
     EXPECT_EQ(pane->GetSelectedItem(), 2);
 }
 
+TEST_F(MenuReentrancy, AnAgentDeletesThePaneAndLeavesItTheClick) {
+    class Deleting : public PopMPane::Agent {
+        int HandleClick(PopMPane *clicked, EventRecordAdapter *, bool &handled) override {
+            delete clicked;
+            handled = false;
+            return 5;
+        }
+    } agent;
+    Show();
+    PaneWatch const watch(pane);
+    pane->SetAgent(&agent);
+    EXPECT_EQ(ResultOfClick("click 60 20"), 5);
+    EXPECT_FALSE(watch.PaneExists());
+    EXPECT_EQ(MenuTracker::Open(), nullptr);
+}
+
 TEST_F(MenuReentrancy, AListenerDeletesThePaneOutsideOfAnyMenu) {
     Show();
     ActingEar ear(pane);

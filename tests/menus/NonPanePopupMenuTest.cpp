@@ -91,6 +91,59 @@ TEST_F(NonPanePopup, GivesTheSubmenuThatWasChosenFrom) {
     EXPECT_EQ(chosenItem, 1);
 }
 
+TEST_F(NonPanePopup, OfAStoredSubmenuItGivesTheMenuThatTheItemOpens) {
+    Store("<menu id='500'><item text='a'/><item text='down' submenu='501'/></menu>"
+          "<menu id='501'><item text='x'/><item text='further' submenu='502'/></menu>"
+          "<menu id='502'><item text='y'/><item text='z'/></menu>");
+    ShowWindow();
+    NonPanePopupMenu stored(500, true, true);
+    desktop.Script("menu 2/1");
+    SetPortToGlog(glog);
+    EXPECT_TRUE(stored.RunPopup(kPlace, chosenID, chosenItem));
+    EXPECT_EQ(chosenID, 501);
+    EXPECT_EQ(chosenItem, 1);
+    desktop.Script("menu 2/2/2");
+    SetPortToGlog(glog);
+    EXPECT_TRUE(stored.RunPopup(kPlace, chosenID, chosenItem));
+    EXPECT_EQ(chosenID, 501) << "however far below the choice was made";
+    EXPECT_EQ(chosenItem, 2);
+    EXPECT_EQ(stored.GetSelectedItem(), 2);
+}
+
+TEST_F(NonPanePopup, GivesItsOwnMenuForItsOwnItems) {
+    ShowWindow();
+    Add(menu, {"a", "b"});
+    OSMenuHandle handle;
+    desktop.Script("menu 2");
+    SetPortToGlog(glog);
+    EXPECT_TRUE(menu.RunPopup(kPlace, handle, chosenItem));
+    EXPECT_TRUE(handle == menu.GetMenuHandle());
+    EXPECT_EQ(chosenItem, 2);
+}
+
+TEST_F(NonPanePopup, RepaintsNothingWhenAnotherItemIsSelected) {
+    class Counting : public NonPanePopupMenu {
+    public:
+        Counting()
+            : NonPanePopupMenu(true) {}
+        int repaints = 0;
+        std::vector<short> changes;
+
+    protected:
+        void InvalPane() override { ++repaints; }
+        void MenuChanged(short item) override { changes.push_back(item); }
+    } counting;
+    ShowWindow();
+    Add(counting, {"a", "b"});
+    counting.SelectItem(2);
+    EXPECT_EQ(counting.GetSelectedItem(), 2);
+    desktop.Script("menu 1");
+    SetPortToGlog(glog);
+    counting.RunPopup(kPlace, chosenID, chosenItem);
+    EXPECT_EQ(counting.changes, (std::vector<short>{1, 2, 1}));
+    EXPECT_EQ(counting.repaints, 0);
+}
+
 TEST_F(NonPanePopup, AnEmptyMenuDoesNotOpen) {
     ShowWindow();
     EXPECT_FALSE(Run(""));

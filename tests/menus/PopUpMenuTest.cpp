@@ -85,6 +85,20 @@ TEST_F(PopUpMenuTest, KeepsTheLowByteOfItsFlags) {
     EXPECT_EQ(made.GetMenuID(), 137);
 }
 
+TEST_F(PopUpMenuTest, WhoHearsOfTheFirstSelectionFindsAllFlags) {
+    class Looking : public RecordingMenu {
+    public:
+        short flagsAtChange = 0;
+
+    protected:
+        void MenuChanged(short) override { flagsAtChange = GetFlags(); }
+    } made;
+    Store("<menu id='500'><item text='a'/></menu>");
+    made.InitializeMenu(0x1234, 500);
+    EXPECT_EQ(made.flagsAtChange, 0x1234);
+    EXPECT_EQ(made.GetFlags(), 0x34);
+}
+
 TEST_F(PopUpMenuTest, TakesACopyOrTheSharedMenu) {
     Store("<menu id='500'><item text='a'/></menu>");
     RecordingMenu own(true, true), shared(true, false);
@@ -121,6 +135,24 @@ TEST_F(PopUpMenuTest, SetMenuLeavesASharedMenuAlone) {
     shared.SetMenu(other, true);
     EXPECT_EQ(OSMenuHandle::GetSingletonMenu(500).NumMenuItems(), 1);
     EXPECT_EQ(shared.CountItems(), 0);
+}
+
+TEST_F(PopUpMenuTest, SetInPlaceOfAnInvalidMenuTheSelectionStays) {
+    RecordingMenu none;
+    none.SelectItem(4);
+    OSMenuHandle other = OSMenuHandle::CreateNewHierarchicalMenu();
+    none.SetMenu(other, true);
+    EXPECT_EQ(none.GetCurrentSelection(), 4);
+    none.SetMenu(other, true);
+    EXPECT_EQ(none.GetCurrentSelection(), 0);
+}
+
+TEST_F(PopUpMenuTest, SetToAnInvalidMenuItIsInvalid) {
+    Add(menu, {"a"});
+    menu.SetMenu(OSMenuHandle(), false);
+    EXPECT_FALSE(menu.GetMenuHandle().IsValid());
+    EXPECT_EQ(menu.GetMenuID(), 0);
+    EXPECT_EQ(menu.CountItems(), 0);
 }
 
 TEST_F(PopUpMenuTest, SetMenuTakesItsOwnMenuToo) {
@@ -161,6 +193,29 @@ TEST_F(PopUpMenuTest, ADashIsASeparatorOrAText) {
     EXPECT_TRUE(menu.ItemIsEnabled(3));
     menu.AddItem(Text("--"), PopUpMenu::kDashIsSeparator);
     EXPECT_EQ(NameIn(menu, 4), "--");
+}
+
+TEST_F(PopUpMenuTest, ADashThatIsTheFirstItemSelectsItselfToo) {
+    menu.AddItem(Text("-"), PopUpMenu::kDashIsSeparator);
+    EXPECT_EQ(menu.Calls(), "changed 1");
+    RecordingMenu other;
+    other.InitializeMenu(0, 137);
+    other.InsertItem(1, Text("-"), PopUpMenu::kDashIsSeparator);
+    EXPECT_EQ(other.Calls(), "changed 1");
+}
+
+TEST_F(PopUpMenuTest, OrdinaryItemsHaveTheAttributeOfTextsThatAreTakenAsTheyStand) {
+    menu.AddItem(Text("a"), PopUpMenu::kDashIsSeparator);
+    menu.InsertItem(1, Text("b"), PopUpMenu::kDashIsText);
+    menu.AddSeparator();
+    menu.InsertSeparator(4);
+    auto const attributes = [this](int item) {
+        return MenuAccess::Of(menu.GetMenuHandle())->Find(item)->attributes;
+    };
+    EXPECT_EQ(attributes(1), 0x40);
+    EXPECT_EQ(attributes(2), 0x40);
+    EXPECT_EQ(attributes(3), 0);
+    EXPECT_EQ(attributes(4), 0);
 }
 
 TEST_F(PopUpMenuTest, ASeparatorThatIsAddedIsNeverSelected) {
@@ -293,6 +348,21 @@ TEST_F(PopUpMenuTest, TellsHowTheCurrentItemIsDrawn) {
     EXPECT_EQ(icon, 0);
 }
 
+TEST_F(PopUpMenuTest, ASubclassMaySayThatNoSelectionChangesAnything) {
+    class Steadfast : public RecordingMenu {
+    protected:
+        bool NewSelectionRequiresAction(short) override { return false; }
+    } steadfast;
+    steadfast.InitializeMenu(0, 137);
+    Add(steadfast, {"a", "b"});
+    steadfast.SelectItem(2);
+    steadfast.SetSelectedItem(1);
+    EXPECT_EQ(steadfast.GetCurrentSelection(), 0);
+    steadfast.DeleteAllItems();
+    EXPECT_EQ(steadfast.CountItems(), 0);
+    EXPECT_EQ(steadfast.Calls(), "");
+}
+
 // Deleting
 
 TEST_F(PopUpMenuTest, WithoutTheSelectedLastItemTheFirstIsSelected) {
@@ -363,6 +433,18 @@ TEST_F(PopUpMenuTest, DeletingAllItemsDropsTheSubmenusToo) {
     EXPECT_FALSE(menu.FindSubMenuItem(submenu, item));
     menu.DeleteAllItems();
     EXPECT_EQ(menu.Calls(), "");
+}
+
+TEST_F(PopUpMenuTest, WithoutAMenuDeletingAllItemsStillDropsTheSubmenus) {
+    RecordingMenu none;
+    OSMenuHandle parent = OSMenuHandle::CreateNewHierarchicalMenu();
+    OSMenuHandle submenu = none.AppendNewEmptyHierarchicalMenu(Text("sub"), parent);
+    int item = 0;
+    ASSERT_TRUE(none.FindSubMenuItem(submenu, item));
+    none.DeleteAllItems();
+    EXPECT_FALSE(none.FindSubMenuItem(submenu, item));
+    EXPECT_TRUE(submenu.IsValid()) << "other handles keep it";
+    EXPECT_EQ(none.Calls(), "");
 }
 
 // Submenus
@@ -501,6 +583,45 @@ TEST_F(PopUpMenuTest, AChoiceFromAStoredSubmenuSelectsTheItemThatLeadsThere) {
     EXPECT_EQ(stored.GetLastPopupResult(), 502 << 16 | 2);
 }
 
+TEST_F(PopUpMenuTest, AChoiceFromAMenuThatAProgramHasInstalledSelectsItsItem) {
+    ShowWindow();
+    Add(menu, {"a", "down", "b"});
+    OSMenuHandle first = OSMenuHandle::CreateNewHierarchicalMenu(), second, third;
+    second = OSMenuHandle::CreateNewHierarchicalMenu();
+    third = OSMenuHandle::CreateNewHierarchicalMenu();
+    menu.GetMenuHandle().SetMenuItemHierarchicalID(2, first.GetMenuID());
+    for (OSMenuHandle *below : {&first, &second, &third}) {
+        below->AppendItem(Text("choose"));
+        below->AppendItem(Text("further"));
+        below->InsertMenuBeforeMenuID(-1);
+    }
+    first.SetMenuItemHierarchicalID(2, second.GetMenuID());
+    second.SetMenuItemHierarchicalID(2, third.GetMenuID());
+    EXPECT_EQ(Do(menu, "menu 2/1"), 2);
+    EXPECT_TRUE(menu.chosenMenu == first);
+    menu.SelectItem(1);
+    EXPECT_EQ(Do(menu, "menu 2/2/1"), 2);
+    EXPECT_TRUE(menu.chosenMenu == first) << "the one that the item opens";
+    // Only stored menus are looked into further than that.
+    menu.SelectItem(3);
+    EXPECT_EQ(Do(menu, "menu 2/2/2/1"), 3) << "the selection stays";
+    EXPECT_FALSE(menu.chosenMenu.IsValid());
+    EXPECT_EQ(menu.chosenItem, 1);
+    for (OSMenuHandle *below : {&first, &second, &third})
+        below->RemoveFromMenuList();
+}
+
+TEST_F(PopUpMenuTest, AChoiceThatNoItemStandsForLeavesTheSelection) {
+    ShowWindow();
+    Add(menu, {"a", "b"});
+    OSMenuHandle other = OSMenuHandle::CreateNewHierarchicalMenu();
+    other.AppendItem(Text("x"));
+    Later const change(0.2, [&] { menu.SetMenu(other, false); });
+    menu.Calls();
+    EXPECT_EQ(Do(menu, "wait 0.5\nmenu 2"), 1);
+    EXPECT_EQ(menu.Calls(), "about, activity, selected 2, done");
+}
+
 TEST_F(PopUpMenuTest, OfTwoItemsThatLeadThereTheLastIsSelected) {
     Store("<menu id='500'><item text='one' submenu='501'/><item text='two' submenu='501'/></menu>"
           "<menu id='501'><item text='x'/></menu>");
@@ -549,6 +670,28 @@ TEST_F(PopUpMenuTest, DoesNotMarkWhenItIsToldNotTo) {
     Later const again(0.1, [&] { marked = MenuTracker::Open()->Panels()[0]->Items().Find(1)->checked; });
     Do(flagged, "wait 1\nmenu 0");
     EXPECT_FALSE(marked);
+}
+
+TEST_F(PopUpMenuTest, DoesNotMarkAnItemThatOpensASubmenu) {
+    ShowWindow();
+    Add(menu, {"a", "sub"});
+    OSMenuHandle submenu = OSMenuHandle::CreateNewHierarchicalMenu();
+    menu.GetMenuHandle().SetMenuItemHierarchicalID(2, submenu.GetMenuID());
+    menu.SelectItem(2);
+    bool marked = true;
+    Later const look(0.1, [&] { marked = MenuTracker::Open()->Panels()[0]->Items().Find(2)->checked; });
+    Do(menu, "wait 1\nmenu 0");
+    EXPECT_FALSE(marked);
+}
+
+TEST_F(PopUpMenuTest, AMarkOfTheProgramsOwnGoesWithThatOfTheCurrentItem) {
+    ShowWindow();
+    Add(menu, {"a", "b"});
+    menu.SetItemCheck(1, true);
+    menu.SetItemCheck(2, true);
+    Do(menu, "menu 0");
+    EXPECT_FALSE(MenuAccess::Of(menu.GetMenuHandle())->Find(1)->checked);
+    EXPECT_TRUE(MenuAccess::Of(menu.GetMenuHandle())->Find(2)->checked);
 }
 
 TEST_F(PopUpMenuTest, AMarkThatOpeningHasSetIsGoneAfterwards) {

@@ -21,10 +21,13 @@ public:
     void InhibitAutoScroll(glogRec *announced) override {
         announcedGlog = announced;
         Note("inhibit");
+        Call(onInhibit);
     }
     int GetMaxScrollValue(ScrollBarPane *) override {
         Note("greatest?");
-        return greatest;
+        int const answer = greatest;
+        Call(onGreatest);
+        return answer;
     }
     void ScrollTo(ScrollBarPane *bar, int target) override {
         Note("to " + std::to_string(target));
@@ -39,6 +42,7 @@ public:
         Note(byUnit ? "start by unit" : "start by page");
         amount = byUnit ? unit : page;
         multiplier = firstMultiplier;
+        Call(onStart);
     }
     void Scroll(ScrollBarPane *bar, int &amount, int &multiplier) override {
         Note("scroll " + std::to_string(amount) + " x " + std::to_string(multiplier));
@@ -50,10 +54,14 @@ public:
         Call(onScroll);
     }
     int GetArrowScrollDelay() override {
-        return arrowDelay ? arrowDelay : ScrollBarClient::GetArrowScrollDelay();
+        int const answer = arrowDelay ? arrowDelay : ScrollBarClient::GetArrowScrollDelay();
+        Call(onDelay);
+        return answer;
     }
     int GetPageScrollDelay() override {
-        return pageDelay ? pageDelay : ScrollBarClient::GetPageScrollDelay();
+        int const answer = pageDelay ? pageDelay : ScrollBarClient::GetPageScrollDelay();
+        Call(onDelay);
+        return answer;
     }
     void DoneScrolling(ScrollBarPane *) override {
         Note("done");
@@ -72,7 +80,7 @@ public:
     int acceleration = 0;              // added to the multiplier by each step
     int arrowDelay = 0, pageDelay = 0; // ticks; 0: the default
     bool setsBar = true;
-    std::function<void()> onScroll, onScrollTo, onDone;
+    std::function<void()> onInhibit, onGreatest, onStart, onScroll, onScrollTo, onDelay, onDone;
     std::vector<std::string> log;
     std::vector<Step> steps;
     std::vector<int> targets;

@@ -8,7 +8,7 @@
 namespace {
 
 // Where a client is called in the middle of things.
-enum Moment { kScroll, kScrollTo, kDone };
+enum Moment { kInhibit, kGreatest, kStart, kScroll, kScrollTo, kDelay, kDone };
 
 class ScrollBarReentrancy : public ScrollBarTest {
 protected:
@@ -25,10 +25,11 @@ protected:
     }
 
     void At(Moment moment, std::function<void()> const &action) {
-        std::function<void()> &slot = moment == kScroll     ? own->onScroll
-                                      : moment == kScrollTo ? own->onScrollTo
-                                                            : own->onDone;
-        slot = action;
+        // In the order of the moments.
+        std::function<void()> *const slots[] = {&own->onInhibit, &own->onGreatest, &own->onStart,
+                                                &own->onScroll,  &own->onScrollTo, &own->onDelay,
+                                                &own->onDone};
+        *slots[moment] = action;
     }
     // The client goes away as clients have to: no bar holds on to it.
     void DropClient() {
@@ -53,6 +54,17 @@ Gesture const kGestures[] = {
     {kScroll, "press 28 110\nwait 0.5\nrelease"},
     {kScroll, "wheel 28 70 0 -1"},
     {kScrollTo, "press 28 70\nmove 28 91\nmove 28 80\nwait 0.5\nrelease"},
+    {kInhibit, "press 28 18\nwait 0.5\nrelease"},
+    {kInhibit, "press 28 110\nwait 0.5\nrelease"},
+    {kInhibit, "press 28 70\nmove 28 91\nmove 28 80\nrelease"},
+    {kInhibit, "press 28 70\nrelease"}, // at the end alone
+    {kInhibit, "wheel 28 70 0 -1"},
+    {kGreatest, "press 28 70\nmove 28 91\nmove 28 80\nrelease"},
+    {kStart, "press 28 18\nwait 0.5\nrelease"},
+    {kStart, "press 28 110\nwait 0.5\nrelease"},
+    {kStart, "wheel 28 70 0 -1"},
+    {kDelay, "press 28 18\nwait 0.5\nrelease"},
+    {kDelay, "press 28 110\nwait 0.5\nrelease"},
     {kDone, "press 28 18\nwait 0.5\nrelease"},
     {kDone, "press 28 110\nwait 0.5\nrelease"},
     {kDone, "press 28 70\nmove 28 91\nrelease"},
@@ -138,22 +150,80 @@ TEST_P(DuringGesture, TheClientMayScrollTheBarFurther) {
     EXPECT_GE(depth, 1);
 }
 
-TEST_F(ScrollBarReentrancy, ACommandMayEndInTheBarsDeath) {
-    At(kScroll, [this] { delete bar; });
-    bar->ScrollPage(true);
+TEST_P(DuringGesture, AClientThatLetsGoOfTheBarHearsNoMore) {
+    std::size_t heard = 0;
+    At(GetParam().moment, [this, &heard] {
+        bar->SetClient(nullptr);
+        heard = own->log.size();
+    });
+    desktop.Play(GetParam().script);
+    EXPECT_EQ(own->log.size(), heard);
+    EXPECT_EQ(bar->GetClient(), nullptr);
+}
+
+namespace {
+
+struct Command {
+    Moment moment;
+    void (ScrollBarPane::*run)(bool);
+};
+
+// Every command that comes by the moment.
+Command const kCommands[] = {
+    {kInhibit, &ScrollBarPane::ScrollOneUnit}, {kInhibit, &ScrollBarPane::ScrollPage},
+    {kInhibit, &ScrollBarPane::ScrollToEnd},   {kGreatest, &ScrollBarPane::ScrollToEnd},
+    {kStart, &ScrollBarPane::ScrollOneUnit},   {kStart, &ScrollBarPane::ScrollPage},
+    {kScroll, &ScrollBarPane::ScrollOneUnit},  {kScroll, &ScrollBarPane::ScrollPage},
+    {kScrollTo, &ScrollBarPane::ScrollToEnd},  {kDone, &ScrollBarPane::ScrollOneUnit},
+    {kDone, &ScrollBarPane::ScrollPage},       {kDone, &ScrollBarPane::ScrollToEnd},
+};
+
+class DuringCommand : public ScrollBarReentrancy, public testing::WithParamInterface<Command> {
+protected:
+    void Run() { (bar->*GetParam().run)(true); }
+};
+
+INSTANTIATE_TEST_SUITE_P(OfEachKind, DuringCommand, testing::ValuesIn(kCommands));
+
+} // namespace
+
+TEST_P(DuringCommand, TheClientMayDeleteTheBar) {
+    At(GetParam().moment, [this] { delete bar; });
+    Run();
     EXPECT_FALSE(watch.PaneExists());
 }
 
-TEST_F(ScrollBarReentrancy, AJumpToTheEndMayEndInTheBarsDeath) {
-    At(kScrollTo, [this] { delete bar; });
-    bar->ScrollToEnd(true);
-    EXPECT_FALSE(watch.PaneExists());
-}
-
-TEST_F(ScrollBarReentrancy, AJumpToTheEndMayEndInTheClientsDeath) {
-    At(kScrollTo, [this] { DropClient(); });
-    bar->ScrollToEnd(true);
+TEST_P(DuringCommand, TheClientMayDeleteItself) {
+    At(GetParam().moment, [this] { DropClient(); });
+    Run();
     EXPECT_EQ(own, nullptr);
+    EXPECT_TRUE(watch.PaneExists());
+}
+
+TEST_P(DuringCommand, TheClientMayDeleteItselfAndTheBar) {
+    At(GetParam().moment, [this] {
+        delete bar;
+        own.reset();
+    });
+    Run();
+    EXPECT_FALSE(watch.PaneExists());
+}
+
+TEST_F(ScrollBarReentrancy, AJumpToTheStartMayEndWhenItIsAnnounced) {
+    At(kInhibit, [this] { DropClient(); });
+    bar->ScrollToEnd(false);
+    EXPECT_EQ(own, nullptr);
+}
+
+TEST_F(ScrollBarReentrancy, AClientThatLetsGoAtTheSecondAnnouncementIsNotScrolled) {
+    int announcements = 0;
+    At(kInhibit, [this, &announcements] {
+        if (++announcements == 2)
+            bar->SetClient(nullptr);
+    });
+    desktop.Play("press 28 130\nwait 0.5\nrelease");
+    EXPECT_EQ(announcements, 2);
+    EXPECT_TRUE(own->steps.empty());
 }
 
 TEST_F(ScrollBarReentrancy, AMouseThatLeavesAnArrowOfWhichTheBarIsDeletedEndsThePress) {

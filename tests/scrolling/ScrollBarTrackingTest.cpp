@@ -419,6 +419,21 @@ TEST_F(ScrollBarTracking, ADragIsShownAtEachMove) {
     EXPECT_GT(presented[1], 0u);
 }
 
+TEST_F(ScrollBarTracking, EveryPlaceThatTheMouseReportsIsSent) {
+    // A thousand places in a second, down and up the trough again and again.
+    int const kPlaces = 1000;
+    std::string script = "press 28 75\n";
+    int v = 75, step = 1;
+    for (int i = 0; i < kPlaces; ++i) {
+        v += step;
+        if (v == 110 || v == 40)
+            step = -step;
+        script += "wait 0.001\nmove 28 " + std::to_string(v) + "\n";
+    }
+    desktop.Play(script + "release");
+    EXPECT_EQ(client.targets.size(), static_cast<std::size_t>(kPlaces));
+}
+
 // The thumb's start belongs to the thumb, and the place before it to the trough.
 TEST_F(ScrollBarTracking, TheThumbBeginsAndEndsWhereItIsDrawn) {
     desktop.Play("click 28 67\nclick 28 82");

@@ -1,7 +1,9 @@
 #include "scrolling/ScrollGridPlus.h"
+#include "host/PaneWatch.h"
 #include "tests/PaneTest.h"
 #include "tests/VirtualPlace.h"
 #include "tests/desktop/ProbePane.h"
+#include <functional>
 #include <limits>
 #include <utility>
 #include <vector>
@@ -273,22 +275,111 @@ TEST_F(ScrollGridPlusTest, TheWheelCallsWhatASubclassMakesOfScrolling) {
     EXPECT_EQ(counting->distances, std::vector<int>{6});
 }
 
-TEST_F(ScrollGridPlusTest, IsLeftAloneWhenItGoesAwayWhileItsWindowIsDrawn) {
-    class Deleting : public ProbePane {
-    public:
-        using ProbePane::ProbePane;
-        GlogPane *victim = nullptr;
+namespace {
 
-    protected:
-        void DrawGuts(OSRgn *) override { delete std::exchange(victim, nullptr); }
-    };
-    Fill(20);
-    Deleting *const last = new Deleting(glog, {176, 0, 196, 20}, calls, "deleting");
-    Show();
-    last->victim = grid;
-    last->Inval();
+// Deletes another pane, once, when it is drawn.
+class Deleting : public ProbePane {
+public:
+    using ProbePane::ProbePane;
+    GlogPane *victim = nullptr;
+
+protected:
+    void DrawGuts(OSRgn *) override { delete std::exchange(victim, nullptr); }
+};
+
+class ScrollGridThatGoes : public ScrollGridPlusTest {
+protected:
+    ScrollGridThatGoes() {
+        Fill(20);
+        Show();
+    }
+
+    // Whether the grid, or what is named instead, has gone in the middle of the action.
+    bool GoesIn(std::function<void()> const &action, GlogPane *victim = nullptr) {
+        PaneWatch const watch(victim ? victim : grid);
+        last->victim = victim ? victim : grid;
+        last->Inval();
+        action();
+        return !watch.PaneExists();
+    }
+
+    Deleting *last = new Deleting(glog, {176, 0, 196, 20}, calls, "deleting");
+};
+
+} // namespace
+
+TEST_F(ScrollGridThatGoes, IsLeftAloneWhenItGoesAwayWhileItsWindowIsDrawn) {
+    EXPECT_TRUE(GoesIn([this] { grid->ScrollTo(nullptr, 10); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoInALateralMove) {
+    EXPECT_TRUE(GoesIn([this] { grid->LateralScrollTo(10); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoWhenItIsBroughtBackIntoView) {
+    grid->SetScrollOffset(1000);
+    EXPECT_TRUE(GoesIn([this] { grid->UpdateScrollInfo(); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoWhenItIsBroughtBackIntoViewAcross) {
+    grid->SetLateralScrollOffset(1000);
+    EXPECT_TRUE(GoesIn([this] { grid->UpdateScrollInfo(); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoWhenItKeepsItsDistanceFromTheEnd) {
+    grid->LateralScrollTo(200);
+    grid->SetStickToEnd(true);
+    GlogPane *const wider = new ProbePane(glog, {0, 0, 20, 400}, calls, "wider");
+    EXPECT_TRUE(GoesIn([=] { grid->Add(wider, -1); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoWhenAMemberIsAdded) {
+    GlogPane *const member = new ProbePane(glog, {0, 0, 20, 300}, calls, "added");
+    grid->SetScrollOffset(1000);
+    EXPECT_TRUE(GoesIn([=] { EXPECT_EQ(grid->Add(member, -1), 20); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoWhenAMemberIsDeleted) {
+    grid->SetScrollOffset(1000);
+    EXPECT_TRUE(GoesIn([this] { grid->Del(3); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoInAResize) {
+    grid->SetScrollOffset(1000);
+    EXPECT_TRUE(GoesIn([this] { grid->Resize({0, 0}); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoInAResizeByItsContainer) {
+    grid->SetScrollOffset(1000);
+    EXPECT_TRUE(GoesIn([this] { grid->AutoResize(10, 10); }));
+}
+
+TEST_F(ScrollGridThatGoes, MayGoWhenItTakesABar) {
+    grid->SetScrollOffset(1000);
+    EXPECT_TRUE(GoesIn([this] { grid->SetScrollbar(main); }));
+    EXPECT_EQ(main->GetClient(), nullptr);
+}
+
+TEST_F(ScrollGridThatGoes, MayGoUnderItsGuards) {
+    EXPECT_TRUE(GoesIn([this] {
+        WithScrollGridSuppressUpdates const both(grid, true);
+        grid->ScrollTo(nullptr, 10);
+    }));
+}
+
+TEST_F(ScrollGridThatGoes, ItsBarMayGoWhenItIsTaken) {
+    grid->SetScrollOffset(1000);
+    EXPECT_TRUE(GoesIn([this] { grid->SetScrollbar(main); }, main));
+    EXPECT_EQ(grid->GetTheScrollbar(), nullptr);
     grid->ScrollTo(nullptr, 10);
-    EXPECT_EQ(last->victim, nullptr) << "the grid is gone";
+    EXPECT_EQ(grid->GetScrollOffset(), 10);
+}
+
+TEST_F(ScrollGridThatGoes, ItsBarsMayGoInTheMiddleOfAMove) {
+    EXPECT_TRUE(GoesIn([this] { grid->ScrollTo(nullptr, 10); }, main));
+    EXPECT_TRUE(GoesIn([this] { grid->LateralScrollTo(10); }, lateral));
+    EXPECT_EQ(grid->GetScrollOffset(), 10);
+    EXPECT_EQ(grid->GetLateralScrollOffset(), 10);
 }
 
 TEST_F(ScrollGridPlusTest, AHorizontalGridExchangesTheWheelsAxes) {
