@@ -37,27 +37,29 @@ static Hint const kHints[] = {
     {SDL_HINT_NO_SIGNAL_HANDLERS, "0"},
 };
 
-static unsigned char const kSendEventRequest = 25; // its number in the X protocol
+// Their numbers in the X protocol.
+static unsigned char const kSendEventRequest = 25, kTranslateCoordinatesRequest = 40;
 
-// SDL wakes its own wait by sending an event to a window, over a second connection to the server. When that
-// window is closed at the same moment, the server refuses the event, and Xlib's own handler would end the
-// program.
+// SDL wakes its own wait by sending an event to a window, over a second connection to the server, and asks
+// where the window manager's frame lies when it hears that the window in it has moved. When window or frame
+// go at the same moment, the server refuses that, and Xlib's own handler would end the program.
 //
 // SDL has a handler too, which leaves full screens at any error and hands it on to the one that it found.
 // When it closes its connections it has put that one back already. So there is one of ours on either side of
 // it.
 static XErrorHandler theHandlerBeforeSdl = nullptr, theHandlerOfSdl = nullptr;
 
-static bool IsLateWakeUp(XErrorEvent const *error) {
-    return error->error_code == BadWindow && error->request_code == kSendEventRequest;
+static bool IsForAWindowThatIsGone(XErrorEvent const *error) {
+    return error->error_code == BadWindow &&
+           (error->request_code == kSendEventRequest || error->request_code == kTranslateCoordinatesRequest);
 }
 
 static int HandleBehindSdl(Display *display, XErrorEvent *error) {
-    return IsLateWakeUp(error) ? 0 : theHandlerBeforeSdl(display, error);
+    return IsForAWindowThatIsGone(error) ? 0 : theHandlerBeforeSdl(display, error);
 }
 
 static int HandleBeforeSdl(Display *display, XErrorEvent *error) {
-    return IsLateWakeUp(error) ? 0 : theHandlerOfSdl(display, error);
+    return IsForAWindowThatIsGone(error) ? 0 : theHandlerOfSdl(display, error);
 }
 
 static std::runtime_error NoDisplay(std::string const &reason) {

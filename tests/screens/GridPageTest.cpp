@@ -1,11 +1,16 @@
 // What scrolling the gallery's thousand rows draws.
 #include "desktop/SimulatedDesktop.h"
+#include "desktop/drawing/Surface.h"
+#include "desktop/panes/Glog.h"
 #include "host/glogRec.h"
 #include "scrolling/ScrollBarPane.h"
 #include "tests/screens/GalleryPages.h"
 #include "tools/gallery/Gallery.h"
 #include <algorithm>
+#include <cstdint>
 #include <gtest/gtest.h>
+#include <string>
+#include <vector>
 
 namespace {
 
@@ -104,6 +109,20 @@ TEST_F(GridPage, AClickOnARowDrawsItAndTheOneThatWasChosenBefore) {
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 9"), 1);
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 9, row 9 of 1000"), 1);
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 2"), 0);
+}
+
+TEST_F(GridPage, EveryLineIsRedrawnAsTheWholeIs) {
+    desktop.Play("wheel 500 300 -5 -7\nwait 1\n");
+    Glog &glog = Glog::From(gallery.Window());
+    Surface &picture = *glog.Pixels();
+    short const width = static_cast<short>(glog.Width());
+    for (short v = 0; v < glog.Height(); ++v) {
+        std::vector<std::uint32_t> const before(picture.Row(v), picture.Row(v) + width);
+        std::fill(picture.Row(v), picture.Row(v) + width, 0xFFFF00FFu); // a colour that nothing has
+        glog.DamageWindowRect({v, 0, static_cast<short>(v + 1), width});
+        glog.Update();
+        ASSERT_TRUE(std::equal(before.begin(), before.end(), picture.Row(v))) << "line " << v;
+    }
 }
 
 TEST_F(GridPage, AWindowThatGrowsShowsMoreRows) {

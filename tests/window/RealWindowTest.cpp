@@ -186,6 +186,12 @@ TEST_F(RealWindow, AnEventForOneThatWasJustClosedDoesNotEndTheProgram) {
     window->SetTitle("still here");
 }
 
+TEST_F(RealWindow, AQuestionWhereOneLiesThatWasJustClosedDoesNotEndTheProgram) {
+    Window window = Open(At(200, 150, 300, 200));
+    Screen().LookForAWindowThatIsGone();
+    window->SetTitle("still here");
+}
+
 TEST_F(RealWindow, TheTerminationSignalQuits) {
     Window window = Open(At(200, 150, 300, 200));
     std::system(("(sleep 0.3; kill -TERM " + std::to_string(getpid()) + ") &").c_str());

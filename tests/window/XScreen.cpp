@@ -4,6 +4,7 @@
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
 #include <X11/extensions/Xfixes.h>
+#include <map>
 #include <stdexcept>
 
 static int const kDeepColourDepth = 24;
@@ -16,6 +17,21 @@ struct XScreen::Connection {
             throw std::runtime_error("the X server does not answer");
     }
     ~Connection() { XCloseDisplay(display); }
+
+    Window WindowThatIsGone() const {
+        Window const window = XCreateSimpleWindow(display, DefaultRootWindow(display), 0, 0, 1, 1, 0, 0, 0);
+        XDestroyWindow(display, window);
+        return window;
+    }
+    // As 0xRRGGBB.
+    std::uint32_t ColourOf(unsigned long pixel) const {
+        XColor colour = {};
+        colour.pixel = pixel;
+        XQueryColor(display, DefaultColormap(display, DefaultScreen(display)), &colour);
+        return (static_cast<std::uint32_t>(colour.red >> 8) << 16) |
+               (static_cast<std::uint32_t>(colour.green >> 8) << 8) | (colour.blue >> 8);
+    }
+
     Display *display;
 };
 
@@ -36,24 +52,51 @@ static void FinishRequestsOfSdl() {
         }
 }
 
-std::uint32_t XScreen::PixelAt(int x, int y) const {
+std::uint32_t XScreen::PixelAt(int x, int y) const { return PixelsIn(x, y, 1, 1).front(); }
+
+std::vector<std::uint32_t> XScreen::PixelsIn(int x, int y, int width, int height) const {
     FinishRequestsOfSdl();
     Display *display = connection->display;
-    XImage *image = XGetImage(display, DefaultRootWindow(display), x, y, 1, 1, AllPlanes, ZPixmap);
+    XImage *image = XGetImage(display, DefaultRootWindow(display), x, y, static_cast<unsigned>(width),
+                              static_cast<unsigned>(height), AllPlanes, ZPixmap);
     if (image == nullptr)
         throw std::runtime_error("the X server gives no picture of its screen");
-    XColor colour = {};
-    colour.pixel = XGetPixel(image, 0, 0);
+    std::vector<std::uint32_t> pixels;
+    pixels.reserve(static_cast<std::size_t>(width) * static_cast<std::size_t>(height));
+    // Asking for a colour takes time, and neighbours are mostly of one.
+    std::map<unsigned long, std::uint32_t> colours;
+    auto latest = colours.end();
+    for (int row = 0; row < height; ++row) {
+        for (int column = 0; column < width; ++column) {
+            unsigned long const value = XGetPixel(image, column, row);
+            if (latest == colours.end() || latest->first != value)
+                latest = colours.find(value);
+            if (latest == colours.end())
+                latest = colours.emplace(value, connection->ColourOf(value)).first;
+            pixels.push_back(latest->second);
+        }
+    }
     XDestroyImage(image);
-    XQueryColor(display, DefaultColormap(display, DefaultScreen(display)), &colour);
-    return (static_cast<std::uint32_t>(colour.red >> 8) << 16) |
-           (static_cast<std::uint32_t>(colour.green >> 8) << 8) | (colour.blue >> 8);
+    return pixels;
+}
+
+void XScreen::PointAt(int x, int y) const {
+    Display *display = connection->display;
+    XWarpPointer(display, None, DefaultRootWindow(display), 0, 0, 0, 0, x, y);
+    XSync(display, False);
+}
+
+void XScreen::LookForAWindowThatIsGone() const {
+    int x, y;
+    Window child;
+    Display *display = connection->display;
+    XTranslateCoordinates(display, connection->WindowThatIsGone(), DefaultRootWindow(display), 0, 0, &x, &y,
+                          &child);
 }
 
 void XScreen::SendToAWindowThatIsGone() const {
     Display *display = connection->display;
-    Window window = XCreateSimpleWindow(display, DefaultRootWindow(display), 0, 0, 1, 1, 0, 0, 0);
-    XDestroyWindow(display, window);
+    Window window = connection->WindowThatIsGone();
     XEvent event = {};
     event.xclient.type = ClientMessage;
     event.xclient.window = window;

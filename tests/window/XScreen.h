@@ -2,6 +2,7 @@
 #pragma once
 #include <cstdint>
 #include <memory>
+#include <vector>
 
 class XScreen {
 public:
@@ -12,10 +13,15 @@ public:
 
     // The colour at the place of the screen, as 0xRRGGBB, when all that SDL's windows have sent is there.
     std::uint32_t PixelAt(int x, int y) const;
-    // Bits of each of the colours red, green and blue that the screen can show.
-    // Sends an event to a window that there is not, as happens when one closes at that moment; returns when
-    // the server has refused it.
+    // The same for a rectangle of the screen, row by row.
+    std::vector<std::uint32_t> PixelsIn(int x, int y, int width, int height) const;
+    // Moves the mouse to the place of the screen; returns when it is there.
+    void PointAt(int x, int y) const;
+    // Sends an event to a window that there is not, and asks where it lies, as happens when one closes at
+    // that moment; return when the server has refused it.
     void SendToAWindowThatIsGone() const;
+    void LookForAWindowThatIsGone() const;
+    // Bits of each of the colours red, green and blue that the screen can show.
     int ColourBits() const;
 
     struct PointerPicture {

@@ -1,16 +1,12 @@
 // The slider that a zoom button pops up in a window of its own, by a real mouse.
-#include "desktop/Desktop.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
 #include "graphics/ZoomPopUpPane.h"
 #include "host/glogRec.h"
+#include "tests/window/RealDesktop.h"
 #include "tests/window/XScreen.h"
-#include <atomic>
-#include <cstdlib>
 #include <functional>
-#include <gtest/gtest.h>
 #include <string>
-#include <thread>
 #include <vector>
 
 namespace {
@@ -38,44 +34,19 @@ public:
     std::function<void()> onIdle;
 };
 
-class RealZoomSlider : public testing::Test {
+class RealZoomSlider : public RealDesktop {
 protected:
     RealZoomSlider()
-        : desktop(DesktopOptions().Scale(1))
-        , glog(desktop.NewGlog(GlogOptions().Size(300, 200)))
+        : glog(desktop.NewGlog(GlogOptions().Size(300, 200)))
         , client(new Zoomed)
         , pane(new ZoomPopUpPane(glog, client)) {
         pane->Offset({kButtonV - 6, kButtonH - 6});
-        Rect place{kTop, kLeft, kTop + 200, kLeft + 300};
-        PositionGlog(glog, &place, false);
-        ShowGlog(glog, kShowGlog);
-        Settle();
-    }
-
-    // Handles what comes until the window is where it belongs.
-    void Settle() {
-        for (int i = 0; i < 100; ++i) {
-            desktop.ProcessEvents(0.05);
-            Point const content = Glog::From(glog).Window()->ScreenPlace();
-            if (content.h == kLeft && content.v == kTop && Glog::From(glog).IsActive())
-                return;
-        }
-        FAIL() << "the window has not come to its place";
+        ShowAt(glog, {kTop, kLeft, kTop + 200, kLeft + 300});
     }
 
     // Takes the steps of xdotool to their end, and what follows from them.
     void Run(std::string const &steps) {
-        std::atomic<bool> done{false};
-        int status = -1;
-        std::thread hand([&] {
-            status = std::system(("xdotool " + steps).c_str());
-            done = true;
-        });
-        while (!done)
-            desktop.ProcessEvents(0.05);
-        hand.join();
-        desktop.ProcessEvents(0.2);
-        EXPECT_EQ(status, 0);
+        Beside([&] { Do(steps + '\n'); });
     }
     // A step to so many pixels beside the middle of the button.
     static std::string To(int right, int down = 0) {
@@ -84,7 +55,6 @@ protected:
     }
     bool SliderIsUp() { return DesktopRep::Of(desktop).Glogs().size() == 2; }
 
-    Desktop desktop;
     glogRec *glog;
     Zoomed *client;
     ZoomPopUpPane *pane;

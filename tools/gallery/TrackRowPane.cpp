@@ -5,6 +5,7 @@
 #include "host/GlogStyleSheet.h"
 #include "host/Icons.h"
 #include "host/NamedColors.h"
+#include "host/OSRgn.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
 #include "text/LabelPane.h"
@@ -25,6 +26,7 @@ short const kBarWidth = 40;
 int const kBarsPerLine = 4; // a line stands after so many bars
 short const kClipTop = (TrackRowPane::kHeight - kClipHeight) / 2, kClipsLeft = 188;
 short const kBaseline = 16;
+short const kCheckDrop = 1;
 short const kCheckLeft = 8, kCheckTop = 5, kCheckTextLeft = 26, kCheckBaseline = 15;
 short const kCountLeft = 128;
 short const kCountFont = 1;
@@ -136,6 +138,20 @@ void TrackRowPane::SetChosen(bool on) {
 
 // Three bars in five have one.
 bool TrackRowPane::HasClip(int bar) const { return Scattered(number, bar) % 5 < 3; }
+
+// The check box and its label are drawn a pixel lower than where they count on being drawn: those that lie
+// just above of what is redrawn, reach into it.
+void TrackRowPane::DrawGuts(OSRgn *updateRegion) {
+    if (!updateRegion) {
+        CompoundPane::DrawGuts(updateRegion);
+        return;
+    }
+    OSRgn above(*updateRegion);
+    above.Offset(0, -kCheckDrop);
+    TempRgn const reached;
+    VelaDrawing::UnionRgn(updateRegion, &above, reached);
+    CompoundPane::DrawGuts(reached);
+}
 
 void TrackRowPane::DrawBackgroundGuts(OSRgn *updateRegion) {
     SaveColors const colors;

@@ -26,6 +26,7 @@ public:
 
 protected:
     int HandleClick(EventRecordAdapter *) override;
+    void DrawGuts(OSRgn *updateRegion) override;
     void DrawBackgroundGuts(OSRgn *updateRegion) override;
 
 private:
