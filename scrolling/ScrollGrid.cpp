@@ -91,7 +91,10 @@ int ScrollGrid::ScrollGuts(int position) {
     scrollOffset = Clamped(position, greatest);
     int const moved = scrollOffset - old;
     if (moved != 0) {
+        PaneWatch const watch(this); // members that hear of it, and whatever is drawn, may do away with it
         PanePositionChanged();
+        if (!watch.PaneExists())
+            return moved;
         if (UseScrollRect(moved)) {
             Prepare();
             Rect box;
@@ -104,7 +107,6 @@ int ScrollGrid::ScrollGuts(int position) {
         }
         if (slaved)
             return moved;
-        PaneWatch const watch(this);
         UpdateGlog(GetGlog());
         if (!watch.PaneExists())
             return moved;
@@ -124,7 +126,7 @@ void ScrollGrid::MovePixels(Rect const &box, SingleAxis axis, int distance) {
 char ScrollGrid::UseScrollRect(int distance) {
     OSPort *port = nullptr;
     VelaDrawing::GetPort(&port);
-    return port == GetGlog()->GetPort() && 2 * std::llabs(distance) < BoxLength(Along());
+    return GetGlog() && port == GetGlog()->GetPort() && 2 * std::llabs(distance) < BoxLength(Along());
 }
 
 bool ScrollGrid::CanScroll(int direction) {

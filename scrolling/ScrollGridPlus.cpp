@@ -73,12 +73,15 @@ void ScrollGridPlus::LateralScrollGuts(int position) {
     maxLateralScroll = greatest;
     lateralScrollOffset = std::max(std::min(position, greatest), 0);
     if (lateralScrollOffset != old) {
+        PaneWatch const watch(this);
         PanePositionChanged();
+        if (!watch.PaneExists())
+            return;
         if (!GetSupressGridUpdate()) {
             Rect box;
             GetScrollBox(&box);
-            MovePixels(box, Across(), lateralScrollOffset - old);
-            PaneWatch const watch(this);
+            if (GetGlog())
+                MovePixels(box, Across(), lateralScrollOffset - old);
             UpdateGlog(GetGlog());
             if (!watch.PaneExists())
                 return;

@@ -1,5 +1,6 @@
 #include "scrolling/ScrollPane.h"
 #include "host/CustomEventHandler.h"
+#include "host/PaneWatch.h"
 #include "host/UIEvent.h"
 #include "scrolling/Truncation.h"
 #include "scrolling/WheelAxis.h"
@@ -115,11 +116,15 @@ void ScrollPane::LocalOffset(Point *p) {
 // Sizes
 
 void ScrollPane::SetBox(Rect *box) {
+    PaneWatch const watch(this); // subpanes that hear of it may do away with it
     GlogPane::SetBox(box);
+    if (!watch.PaneExists())
+        return;
     virtualHeight = std::max(virtualHeight, box->bottom - box->top);
     virtualWidth = std::max(virtualWidth, box->right - box->left);
     SetVScrollPos(vScrollPos);
-    SetHScrollPos(hScrollPos);
+    if (watch.PaneExists())
+        SetHScrollPos(hScrollPos);
 }
 
 void ScrollPane::SetVirtualHeight(int size) {

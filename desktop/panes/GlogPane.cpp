@@ -119,10 +119,11 @@ void GlogPane::SetBox(Rect *box) {
     PaneAccess::ForgetReach(*this);
     if (CanUpdateLayoutRect())
         LayoutIsNowInvalid();
-    PanePositionChanged();
     short const dh = static_cast<short>((box->right - box->left) - (old.right - old.left));
     short const dv = static_cast<short>((box->bottom - box->top) - (old.bottom - old.top));
-    if (dh != 0 || dv != 0)
+    PaneWatch const watch(this); // subpanes that hear of it may do away with it
+    PanePositionChanged();
+    if (watch.PaneExists() && (dh != 0 || dv != 0))
         PaneAccess::ResizeSubpanes(*this, {dv, dh});
 }
 

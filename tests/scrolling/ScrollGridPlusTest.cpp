@@ -5,6 +5,7 @@
 #include "tests/desktop/ProbePane.h"
 #include <functional>
 #include <limits>
+#include <memory>
 #include <utility>
 #include <vector>
 
@@ -287,6 +288,17 @@ protected:
     void DrawGuts(OSRgn *) override { delete std::exchange(victim, nullptr); }
 };
 
+// Does something when it hears that it has moved.
+class Moving : public ProbePane {
+public:
+    using ProbePane::ProbePane;
+    std::function<void()> onMove;
+    void PanePositionChanged() override {
+        if (onMove)
+            std::exchange(onMove, nullptr)();
+    }
+};
+
 class ScrollGridThatGoes : public ScrollGridPlusTest {
 protected:
     ScrollGridThatGoes() {
@@ -365,6 +377,67 @@ TEST_F(ScrollGridThatGoes, MayGoUnderItsGuards) {
         WithScrollGridSuppressUpdates const both(grid, true);
         grid->ScrollTo(nullptr, 10);
     }));
+}
+
+TEST_F(ScrollGridThatGoes, AMemberThatHearsOfAMoveMayDeleteIt) {
+    for (bool lateral : {false, true}) {
+        ScrollGridPlus *const fresh = new ScrollGridPlus(glog, 6, nullptr, nullptr);
+        Moving *const member = new Moving(glog, {0, 0, 300, 300}, calls, "member");
+        fresh->Add(member, -1);
+        PaneWatch const watch(fresh);
+        member->onMove = [=] { delete fresh; };
+        if (lateral)
+            fresh->LateralScrollTo(10);
+        else
+            fresh->ScrollTo(nullptr, 10);
+        EXPECT_FALSE(watch.PaneExists()) << lateral;
+    }
+}
+
+TEST_F(ScrollGridThatGoes, AMemberThatHearsOfAMoveMayDeleteOthersOrItself) {
+    Moving *const member = new Moving(glog, {0, 0, 20, 300}, calls, "member");
+    grid->Add(member, 5);
+    member->onMove = [=] {
+        grid->Del(7);
+        grid->Del(3);
+        grid->Del(grid->Find(member));
+    };
+    grid->ScrollTo(nullptr, 10);
+    EXPECT_EQ(grid->NumSubpanes(), 18);
+    EXPECT_EQ(grid->GetScrollOffset(), 10);
+}
+
+TEST_F(ScrollGridThatGoes, MembersMayGoInTheMiddleOfAMove) {
+    EXPECT_TRUE(GoesIn([this] { grid->ScrollTo(nullptr, 10); }, grid->Get(2)));
+    EXPECT_TRUE(GoesIn([this] { grid->LateralScrollTo(10); }, grid->Get(3)));
+    EXPECT_EQ(grid->NumSubpanes(), 18);
+}
+
+TEST_F(ScrollGridThatGoes, AListenerOfItsBarMayDeleteMembersAndIt) {
+    class Mourner : public ScrollBarPane_Listener {
+    public:
+        std::function<void()> onDeath;
+
+    private:
+        void ScrollBarPaneDying() override { onDeath(); }
+    } mourner;
+    mourner.DependUpon(main);
+    PaneWatch const watch(grid);
+    mourner.onDeath = [this] {
+        grid->Del(2);
+        delete grid;
+    };
+    delete main;
+    EXPECT_FALSE(watch.PaneExists());
+}
+
+TEST_F(ScrollGridPlusTest, WithoutAGlogItMovesAndDrawsNothing) {
+    std::unique_ptr<ScrollGridPlus> const loose(new ScrollGridPlus(nullptr, 5, nullptr, nullptr));
+    loose->SetScrollOffset(5);
+    loose->SetLateralScrollOffset(7);
+    loose->UpdateScrollInfo();
+    EXPECT_EQ(loose->GetScrollOffset(), 0);
+    EXPECT_EQ(loose->GetLateralScrollOffset(), 0);
 }
 
 TEST_F(ScrollGridThatGoes, ItsBarMayGoWhenItIsTaken) {

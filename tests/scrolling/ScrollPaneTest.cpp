@@ -1,9 +1,11 @@
 #include "scrolling/ScrollPane.h"
+#include "host/PaneWatch.h"
 #include "host/UIEvent.h"
 #include "tests/PaneTest.h"
 #include "tests/VirtualPlace.h"
 #include "tests/desktop/ProbePane.h"
 #include <limits>
+#include <utility>
 
 namespace {
 
@@ -287,6 +289,22 @@ TEST_F(ScrollPaneTest, AnotherBoxBringsThePositionsBackIntoTheArea) {
     EXPECT_EQ(v->GetPosition(), 300);
     EXPECT_EQ(v->GetRange(), 300);
     EXPECT_EQ(h->GetRange(), 700);
+}
+
+TEST_F(ScrollPaneTest, ASubpaneThatHearsOfANewBoxMayDeleteIt) {
+    class Deleting : public ProbePane {
+    public:
+        using ProbePane::ProbePane;
+        void PanePositionChanged() override { delete std::exchange(victim, nullptr); }
+        GlogPane *victim = nullptr;
+    };
+    Deleting *const inside = new Deleting(glog, {0, 0, 20, 20}, calls, "inside");
+    pane->Add(inside, -1);
+    inside->victim = pane;
+    PaneWatch const watch(pane);
+    Rect box = {20, 30, 90, 130};
+    pane->SetBox(&box);
+    EXPECT_FALSE(watch.PaneExists());
 }
 
 TEST_F(ScrollPaneTest, TheTopStaysWhenTheHeightChanges) {
