@@ -1,16 +1,14 @@
 // An outline that follows a real mouse over a real window.
 #include "host/DragRect.h"
-#include "desktop/Desktop.h"
-#include "desktop/panes/Glog.h"
 #include "host/EventRecordAdapter.h"
 #include "host/GlogPane.h"
 #include "host/NamedColors.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
+#include "tests/window/RealDesktop.h"
 #include "tests/window/XScreen.h"
 #include <cstdlib>
 #include <functional>
-#include <gtest/gtest.h>
 #include <string>
 #include <thread>
 #include <vector>
@@ -62,23 +60,13 @@ private:
     }
 };
 
-class RealDrag : public testing::Test {
+class RealDrag : public RealDesktop {
 protected:
     RealDrag()
-        : desktop(DesktopOptions().Scale(1))
-        , glog(desktop.NewGlog(GlogOptions().Size(kWidth, kHeight)))
+        : glog(desktop.NewGlog(GlogOptions().Size(kWidth, kHeight)))
         , pane(new StripedPane(glog)) {
-        Rect place = {kTop, kLeft, kTop + kHeight, kLeft + kWidth};
-        PositionGlog(glog, &place, false);
-        ShowGlog(glog, kShowGlog);
-        for (int i = 0; i < 100 && !IsInPlace(); ++i)
-            desktop.ProcessEvents(0.05);
-        EXPECT_TRUE(IsInPlace()) << "the window has not come to its place";
+        ShowAt(glog, {kTop, kLeft, kTop + kHeight, kLeft + kWidth});
         desktop.ProcessEvents(0.2);
-    }
-    bool IsInPlace() {
-        Point const content = Glog::From(glog).Window()->ScreenPlace();
-        return content.h == kLeft && content.v == kTop && Glog::From(glog).IsActive();
     }
 
     static std::string To(int h, int v) {
@@ -109,7 +97,6 @@ protected:
                static_cast<std::uint32_t>(kDialogActiveTextColor.blue >> 8);
     }
 
-    Desktop desktop;
     glogRec *glog;
     StripedPane *pane;
     XScreen screen;

@@ -1,14 +1,12 @@
 // Pop-up menus in windows of their own, by a real mouse and real keys.
-#include "desktop/Desktop.h"
 #include "desktop/menus/MenuTracker.h"
-#include "desktop/panes/Glog.h"
 #include "host/GlogPane.h"
 #include "host/OSMenuHandle.h"
 #include "host/glogRec.h"
+#include "tests/window/RealDesktop.h"
 #include "tests/window/XScreen.h"
 #include <chrono>
 #include <cstdlib>
-#include <gtest/gtest.h>
 #include <string>
 #include <thread>
 // Last, since it defines common words.
@@ -67,27 +65,12 @@ private:
     Display *display;
 };
 
-class RealMenu : public testing::Test {
+class RealMenu : public RealDesktop {
 protected:
     RealMenu()
-        : desktop(DesktopOptions().Scale(1))
-        , glog(desktop.NewGlog(GlogOptions().Size(300, 200)))
+        : glog(desktop.NewGlog(GlogOptions().Size(300, 200)))
         , probe(new MenuProbe(glog)) {
-        Rect place{kTop, kLeft, kTop + 200, kLeft + 300};
-        PositionGlog(glog, &place, false);
-        ShowGlog(glog, kShowGlog);
-        Settle();
-    }
-
-    // Handles what comes until the window is where it belongs.
-    void Settle() {
-        for (int i = 0; i < 100; ++i) {
-            desktop.ProcessEvents(0.05);
-            Point const content = Glog::From(glog).Window()->ScreenPlace();
-            if (content.h == kLeft && content.v == kTop && Glog::From(glog).IsActive())
-                return;
-        }
-        FAIL() << "the window has not come to its place";
+        ShowAt(glog, {kTop, kLeft, kTop + 200, kLeft + 300});
     }
 
     // The steps of xdotool while the program runs; what the menu answered, -1 if it has not been open.
@@ -114,7 +97,6 @@ protected:
                                 static_cast<unsigned>(item));
     }
 
-    Desktop desktop;
     glogRec *glog;
     MenuProbe *probe;
     int status = -1;
