@@ -508,6 +508,27 @@ TEST_F(GListPaneClickTest, WithControlAClickIsFirstThatOfTheSecondaryButton) {
     EXPECT_EQ(list->asked, 2);
 }
 
+TEST_F(GListPaneClickTest, AListThatTheSecondaryButtonTakesOutOfItsWindowIsNotClearedByIt) {
+    class Leaving : public GListPane {
+    public:
+        Leaving(glogRec *owner, glistResRec record) { InitGListPane(owner, &record, 0); }
+        int HandleSecondaryButtonClick(EventRecordAdapter *) override {
+            SetGlog(nullptr);
+            return 0;
+        }
+    };
+    Leaving *const list = new Leaving(glog, Record());
+    Equipped(list, 5);
+    list->SetSelRange(1, 1);
+    Show();
+    EventRecordAdapter event;
+    event.where = {110, 50};
+    event.modifiers = 0x1000;
+    EXPECT_EQ((list->*&Opened<GListPane>::HandleClick)(&event), kNoRowHit);
+    EXPECT_EQ(SelectedRows(*list), Rows{1});
+    delete list;
+}
+
 TEST_F(GListPaneClickTest, AlsoAListWithoutSelectionByTheMouseHearsOfTheSecondaryButton) {
     SecondaryList *const list = new SecondaryList(glog, Record(kListSelectByCode), 7);
     Equipped(list, 5);

@@ -1,6 +1,7 @@
 // A row that is dragged to another place.
 #include "host/CIdleChore.h"
 #include "host/OSPort.h"
+#include "host/Services.h"
 #include "tests/lists/ListTest.h"
 
 namespace {
@@ -250,16 +251,21 @@ TEST_F(GListPaneMovingTest, AListThatGoesWhileItsRowIsDraggedAnswersThatNothingM
 
 TEST_F(GListPaneMovingTest, ARowThatGoesBeforeItIsDraggedStays) {
     GListPane *const list = Movable(6);
-    int answer = kNotAsked;
+    double before = 0, after = 0;
     listener.onCall = [&](std::string const &call) {
-        if (call == "done") {
+        if (call.find("click") != 0)
+            return;
+        listener.onCall = [&](std::string const &) { // when it has deselected
             listener.onCall = nullptr;
             list->SetNumItems(2);
-        }
+        };
+        before = TarnSystemTime::GetCurrentEventTime();
+        result = list->MoveItem(pressed);
+        after = TarnSystemTime::GetCurrentEventTime();
     };
-    desktop.Script("move 100 110\nrelease");
-    answer = list->MoveItem({kRow2, 100});
-    EXPECT_EQ(answer, -1);
+    EXPECT_EQ(Dragged(kRow2, 110, "wait 3\n"), -1);
+    EXPECT_EQ(list->GetNumItems(), 2);
+    EXPECT_EQ(after, before) << "nor is it dragged at all";
 }
 
 // Its place has a number below 0 then, which no row has.

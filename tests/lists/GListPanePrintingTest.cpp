@@ -196,6 +196,15 @@ TEST_F(GListPanePrintingTest, BeginningTakesTheShapeOfThePage) {
     EXPECT_FALSE(Printed(*list, kEnd, 1));
 }
 
+// Also a place that scrolling would not come to.
+TEST_F(GListPanePrintingTest, TheEndBringsBackThePlaceAsItWas) {
+    GListPane *const list = Printable(100);
+    list->ScrollToPage(20);
+    Printed(*list, kBegin, 1);
+    Printed(*list, kEnd, 1);
+    EXPECT_EQ(list->GetScrollPos(), 133);
+}
+
 TEST_F(GListPanePrintingTest, BeginningAtAPageSaysWhetherItHasRows) {
     GListPane *const list = Printable(100);
     EXPECT_TRUE(Printed(*list, kBegin, 2));
@@ -314,6 +323,27 @@ TEST(GListPaneWithoutADesktop, HasNoPageFormatAndPrintsNothing) {
     EXPECT_EQ(list.GetBounds(), box);
     EXPECT_EQ(list.GetLineHeight(), 16);
     EXPECT_EQ(list.GetNumDisplayed(), rows);
+}
+
+// Kept: lists look as on paper from the beginning on, also where there is none.
+TEST(GListPaneWithoutADesktop, DrawsAsOnPaperUntilTheEnd) {
+    GListPane list;
+    list.SaveSetup();
+    SimulatedDesktop desktop;
+    glogRec *const glog = desktop.NewGlog(GlogOptions().Size(320, 200));
+    glistResRec record = {
+        glistResRec::kType, {20, 30, 120, 230}, 0, kListSelectOne, 16, 0, 0, 0, 0, false, 0, 0};
+    GListPane *const other = GListPane::NewGListPane(glog, &record);
+    SaveColorRec const paper = {{0, 0, 0}, {0xFFFF, 0xFFFF, 0xFFFF}};
+    SaveColorRec colors;
+    other->Prepare();
+    other->SetupColors();
+    GetColors(&colors);
+    EXPECT_EQ(colors, paper);
+    list.RestoreSetup();
+    other->SetupColors();
+    GetColors(&colors);
+    EXPECT_FALSE(colors == paper);
 }
 
 // Misuse

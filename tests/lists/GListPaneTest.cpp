@@ -596,6 +596,7 @@ TEST_F(GListPaneTest, TellsOfTheInactiveDisplayBetweenTheTwoStates) {
     EXPECT_EQ(list->log, (Log{"invalidate active", "draw", "invalidate"}));
     list->Hide();
     list->Deactivate();
+    list->Activate();
     EXPECT_EQ(list->log.size(), 3u) << "it is hidden";
 }
 

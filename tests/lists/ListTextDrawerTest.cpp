@@ -317,16 +317,19 @@ TEST_F(ListTest, WithoutColumnsADrawerOfTextsDrawsNothing) {
 }
 
 TEST_F(ListTextDrawerTest, ARowMayBeDrawnWhereNoneShows) {
-    GListPane *const list = NewTextList(100);
-    Rect box = {20, 30, 20, 230}; // of no height
-    list->SetBox(&box);
-    ASSERT_LE(list->GetNumDisplayed(), 0);
+    glistResRec record = Record();
+    record.firstLineOffset = 1000;
+    GListPane *const list = Equipped(NewList(record), 100);
+    ASSERT_LT(list->GetNumDisplayed(), -1);
+    Show();
     Rect row = {60, 31, 76, 229};
-    for (int line : {0, 1, 5, std::numeric_limits<int>::max()})
+    for (int line : {0, 1, 5, std::numeric_limits<int>::max()}) {
+        ListTextDrawer drawn(list, [](int, int, ListCell &cell) { cell.text = Text("x"); });
         EXPECT_EQ(
-            Only("DrawTextLayoutInRect", Traced(*list, [&] { texts->DrawLine(line, &row, false); })).size(),
+            Only("DrawTextLayoutInRect", Traced(*list, [&] { drawn.DrawLine(line, &row, false); })).size(),
             3u)
             << line;
+    }
 }
 
 TEST_F(ListTextDrawerTest, ANegativeRowIsNotDrawn) {
