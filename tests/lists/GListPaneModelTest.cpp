@@ -48,6 +48,21 @@ TEST_F(GListPaneModelTest, CountsRowsThatShowInPartAndAsAWhole) {
     EXPECT_EQ(list->NumFullyDisplayedLines(), 6);
 }
 
+TEST_F(GListPaneModelTest, ARowOfWhichAPixelShowsCounts) {
+    struct {
+        short height;
+        int displayed, whole;
+    } const cases[] = {{1, 0, 0},  {2, 0, 0},  {3, 1, 0},  {17, 1, 0},
+                       {18, 1, 1}, {19, 2, 1}, {98, 6, 6}, {99, 7, 6}};
+    for (auto const &c : cases) {
+        glistResRec record = Record();
+        record.bounds.bottom = static_cast<short>(kTop + c.height);
+        GListPane *const list = NewList(record);
+        EXPECT_EQ(list->GetNumDisplayed(), c.displayed) << c.height;
+        EXPECT_EQ(list->NumFullyDisplayedLines(), c.whole) << c.height;
+    }
+}
+
 TEST_F(GListPaneModelTest, ASmallListHasNoFrame) {
     glistResRec record = Record();
     record.style = glistResRec::kSmallStyle;

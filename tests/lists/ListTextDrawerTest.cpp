@@ -204,6 +204,13 @@ TEST_F(ListTextDrawerTest, ASelectedRowOfASmallListIsHighlightedAsAWhole) {
     EXPECT_TRUE(Only("PaintRect", Traced(*list, [&] { list->UpdateListLine(2); })).empty());
 }
 
+TEST_F(ListTextDrawerTest, TextsOfAHighlightedRowHaveTheColorOfTheOthers) {
+    GListPane *const list = NewTextList(100, glistResRec::kSmallStyle);
+    Lines const before = TextsOf(*list, 1);
+    list->SetSelRange(1, 1);
+    EXPECT_EQ(TextsOf(*list, 1), before);
+}
+
 TEST_F(ListTextDrawerTest, OfTheDialogStyleTheListHighlightsAlone) {
     GListPane *const list = NewTextList(100);
     list->SetSelRange(1, 1);

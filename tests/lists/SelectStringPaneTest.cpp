@@ -104,6 +104,28 @@ TEST_F(SelectStringPaneTest, AShorterTextRepaintsWhereTheLongerOneWas) {
         EXPECT_EQ(r, before);
 }
 
+TEST_F(SelectStringPaneTest, WhatALongerTextCoveredIsDrawnAgain) {
+    class Covered : public GlogPane {
+    public:
+        explicit Covered(glogRec *owner) { GlogPaneInit(owner, 0); }
+        int drawn = 0;
+
+    private:
+        void DrawGuts(OSRgn *) override { ++drawn; }
+    };
+    SelectStringPane *const pane = Make("A longer verse");
+    Rect end = BoxOf(*pane);
+    end.left = static_cast<short>(end.right - 5);
+    Covered *const covered = new Covered(glog);
+    covered->SetBox(&end);
+    Repainted();
+    covered->drawn = 0;
+    pane->SetText(Text("Verse"));
+    ASSERT_LT(BoxOf(*pane).right, end.left);
+    UpdateGlog(glog);
+    EXPECT_EQ(covered->drawn, 1);
+}
+
 TEST_F(SelectStringPaneTest, TheOldTextIsErasedAtOnce) {
     SelectStringPane *const pane = Make("Verse");
     desktop.TakeDrawing();
