@@ -230,9 +230,9 @@ private:
         WidenOneColumn();
     }
 
-    // The column of a list that was given none is as wide as the list, until the program has other columns.
+    // The column of a list that was given none is as wide as the list.
     void WidenOneColumn() {
-        if (!oneColumn || GetColumnList() != oneColumn.get())
+        if (!oneColumn)
             return;
         int const width = Pixel16(std::max(GetBounds().right - GetBounds().left, 0));
         if (width == oneColumn->GetWidth(0))
