@@ -190,6 +190,15 @@ TEST_F(GlogTest, AGlogMayBeDisposedOfByItsOwnPane) {
     EXPECT_FALSE(hit);
 }
 
+TEST_F(GlogTest, AGlogIsInErrorOnceItIsDisposedOfAndForGood) {
+    glogRec *const other = desktop.NewGlog(GlogOptions());
+    EXPECT_FALSE(GlogError(other));
+    DisposeGlog(other);
+    EXPECT_TRUE(GlogError(other)) << "it is gone, and not looked into";
+    EXPECT_TRUE(GlogError(nullptr));
+    EXPECT_FALSE(GlogError(glog));
+}
+
 TEST_F(GlogTest, OutsideOfAnyHandlerDisposalIsImmediate) {
     NewPane();
     Show();
