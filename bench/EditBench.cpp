@@ -103,9 +103,7 @@ void BreakALineAndJoinIt(benchmark::State &state) {
 }
 BENCHMARK(BreakALineAndJoinIt)->Arg(kLines)->Arg(1000000);
 
-// One line, as in a dialog.
-void TypeInAField(benchmark::State &state) {
-    EditPage page(0, Utf::FromUnits(u"Overhead left"));
+void TypeIn(EditPage &page, benchmark::State &state) {
     for (auto _ : state) {
         page.Type(u'x');
         state.PauseTiming();
@@ -114,7 +112,39 @@ void TypeInAField(benchmark::State &state) {
         state.ResumeTiming();
     }
 }
+
+// One line, as in a dialog.
+void TypeInAField(benchmark::State &state) {
+    EditPage page(0, Utf::FromUnits(u"Overhead left"));
+    TypeIn(page, state);
+}
 BENCHMARK(TypeInAField);
+
+// One line after a paste that went on beyond what a line takes, but for one unit: at its end.
+void TypeInAFullField(benchmark::State &state) {
+    unsigned int const kMostButOne = 32766;
+    std::u16string text = Lines(kMostButOne / kLineUnits + 1);
+    text.resize(kMostButOne);
+    EditPage page(0, Utf::FromUnits(text));
+    page.pane->editor->SetSelection(kMostButOne, kMostButOne);
+    TypeIn(page, state);
+}
+BENCHMARK(TypeInAFullField)->Unit(benchmark::kMillisecond);
+
+// The insertion point steps to and fro there.
+void StepInAFullField(benchmark::State &state) {
+    EditPage page(0, Utf::FromUnits(Lines(kLines)));
+    for (auto _ : state) {
+        for (bool toTheRight : {true, false}) {
+            KeyEvent event;
+            event.what = EventKinds::kKeyDown;
+            event.message = static_cast<unsigned long long>(toTheRight ? KeyCodes::kRight : KeyCodes::kLeft);
+            page.pane->editor->HandleEvent(&event);
+            UpdateGlog(page.glog);
+        }
+    }
+}
+BENCHMARK(StepInAFullField)->Unit(benchmark::kMillisecond);
 
 // From the text to the first picture. The counter: how many times the text's own memory everything takes that
 // is made for it.

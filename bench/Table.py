@@ -97,6 +97,8 @@ AMOUNTS = (
     Amount("memory of one row among them, each", "List/bytes of one/iterations:3", "B", 1, 0.01, "perRow"),
     Amount("line broken in 1,000,000, and joined", "BreakALineAndJoinIt/1000000", "ms", 1e6, 2, "cpu_time"),
     Amount("letter typed in a field", "TypeInAField", "us", 1e3, None, "cpu_time"),
+    Amount("letter typed in a full one", "TypeInAFullField", "ms", 1e6, 100, "cpu_time"),
+    Amount("step to and fro in it", "StepInAFullField", "ms", 1e6, 10, "cpu_time"),
     Amount("text of 10 MB to its first frame", "OpenTenMillionUnits", "ms", 1e6, 500),
     Amount("memory of it, times the text", "OpenTenMillionUnits", "", 1, 6, "timesTheText"),
     Amount("drag step in a cube, at 2x", "Panner/drag step", "us", 1e3, 1000, "cpu_time"),

@@ -93,7 +93,8 @@ public:
     // Belongs to the engine; answers for the text as it is at each call.
     virtual OS::TextEditLayoutInfo const &GetLayoutInfo() const = 0;
 
-    // Replaces the whole text. Not by the user, so TextEditListener_TextChanged is not sent.
+    // Replaces the whole text. One line takes 32,767 units, as much as the user may enter too; what is longer
+    // is cut between two characters. Not by the user, so TextEditListener_TextChanged is not sent.
     virtual void SetText(UString const &) = 0;
     virtual UString GetText() const = 0;
     // An active engine shows its insertion point and takes keys.

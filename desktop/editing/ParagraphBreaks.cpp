@@ -23,10 +23,7 @@ std::size_t CutOf(std::u16string_view text, std::size_t longest) {
     for (std::size_t at = longest; at > farthest; --at)
         if (text[at - 1] == ' ' && !GoesOn(text, at))
             return at;
-    for (std::size_t at = longest; at > farthest; --at)
-        if (!GoesOn(text, at))
-            return at;
-    return longest;
+    return ParagraphBreaks::Fitting(text, longest);
 }
 
 // Where text is cut that has no break: its length if it is not.
@@ -42,6 +39,15 @@ std::size_t LengthOfOpen(std::u16string_view text) {
 
 bool ParagraphBreaks::IsBreak(char16_t c) {
     return (c >= '\n' && c <= '\r') || c == kNextLine || c == kLineSeparator || c == kParagraphSeparator;
+}
+
+std::size_t ParagraphBreaks::Fitting(std::u16string_view text, std::size_t room) {
+    if (text.size() <= room)
+        return text.size();
+    for (std::size_t at = room; at > 0 && at + kFarthestBack > room; --at)
+        if (!GoesOn(text, at))
+            return at;
+    return room > kFarthestBack ? room : 0;
 }
 
 std::size_t ParagraphBreaks::BreakLength(std::u16string_view paragraph) {

@@ -18,6 +18,9 @@ bool IsBreak(char16_t);
 // The units of each paragraph, what ends it included. A text that ends with a break has an empty paragraph
 // behind it if it is the end of all text.
 std::vector<std::uint32_t> Split(std::u16string_view, bool atEndOfText);
+// How many of the first units are taken where there is room for so many only: some fewer, so that no
+// character is torn apart.
+std::size_t Fitting(std::u16string_view, std::size_t room);
 // How many units at the paragraph's end are its break: 0 to 2.
 std::size_t BreakLength(std::u16string_view paragraph);
 

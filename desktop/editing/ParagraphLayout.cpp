@@ -3,7 +3,7 @@
 #include "desktop/type/ShapedText.h"
 #include <algorithm>
 #include <cmath>
-#include <limits>
+#include <numeric>
 #include <pango/pangocairo.h>
 
 namespace {
@@ -60,6 +60,14 @@ bool RunsToLeft(PangoLayoutLine const &line, int byte) {
     return false;
 }
 
+// A line that is scrolled through stands where it is read from, whatever its alignment: so its beginning is
+// what shows first, and all of it can be reached.
+int LeftOfLine(ParagraphLayout::Line const &line, ParagraphLayout::Room const &room) {
+    if (!room.wraps && line.width > room.width)
+        return line.rightToLeft ? room.width - line.width : 0;
+    return ShapedText::LineStart(line.width, room.width, room.alignment, line.rightToLeft);
+}
+
 PangoLogAttr const *AttributesOf(PangoLayout *layout, std::size_t &count) {
     int all = 0;
     PangoLogAttr const *const attributes = pango_layout_get_log_attrs_readonly(layout, &all);
@@ -69,13 +77,14 @@ PangoLogAttr const *AttributesOf(PangoLayout *layout, std::size_t &count) {
 
 } // namespace
 
-ParagraphLayout::ParagraphLayout(std::u16string_view units, StyleRuns::List const &runs, Room const &room)
+ParagraphLayout::ParagraphLayout(std::u16string_view units, StyleRuns::List const &given, Room const &room)
     : text(units) {
+    StyleRuns::List runs = given;
     Make(runs, room);
-    if (pango_layout_get_unknown_glyphs_count(layout) != 0 && FontLibrary::Instance().AddSystemFonts()) {
-        g_object_unref(layout);
+    if (pango_layout_get_unknown_glyphs_count(layout) != 0 && FontLibrary::Instance().AddSystemFonts())
         Make(runs, room);
-    }
+    while (!room.wraps && MakeSmaller(runs))
+        Make(runs, room);
     MeasureLines(runs, room);
     generation = FontLibrary::Instance().Generation();
 }
@@ -85,6 +94,8 @@ ParagraphLayout::~ParagraphLayout() { g_object_unref(layout); }
 bool ParagraphLayout::IsCurrent() const { return generation == FontLibrary::Instance().Generation(); }
 
 void ParagraphLayout::Make(StyleRuns::List const &runs, Room const &room) {
+    if (layout)
+        g_object_unref(layout);
     for (StyleRuns::Run const &run : runs)
         FontLibrary::Instance().Description(run.style.Font());
     layout = FontLibrary::Instance().NewLayout(runs.front().style.Font());
@@ -101,6 +112,27 @@ void ParagraphLayout::Make(StyleRuns::List const &runs, Room const &room) {
         pango_layout_set_wrap(layout, PANGO_WRAP_WORD_CHAR);
     }
     pango_layout_set_text(layout, text.Utf8().data(), static_cast<int>(text.Utf8().size()));
+}
+
+// A line that goes on beyond where places can be told is set in smaller letters. False when it need not or
+// cannot be.
+bool ParagraphLayout::MakeSmaller(StyleRuns::List &runs) const {
+    long long width = 0; // of more glyphs than Pango adds up
+    for (GSList const *node = PangoLine(0)->runs; node; node = node->next) {
+        PangoGlyphString const &glyphs = *static_cast<PangoGlyphItem const *>(node->data)->glyphs;
+        for (int i = 0; i < glyphs.num_glyphs; ++i)
+            width += glyphs.glyphs[i].geometry.width;
+    }
+    width /= PANGO_SCALE;
+    bool smaller = false;
+    for (StyleRuns::Run &run : runs) {
+        long long const size = run.style.Font().size;
+        run.style.style.size = static_cast<short>(
+            width > kFarthest ? std::max<long long>(size * kFarthest / width, FontSpec::kSmallestSize)
+                              : size);
+        smaller = smaller || run.style.style.size < size;
+    }
+    return smaller;
 }
 
 // Lines are as high as their fonts, also where other fonts stand in for characters that these lack: so a
@@ -128,7 +160,7 @@ void ParagraphLayout::MeasureLines(StyleRuns::List const &runs, Room const &room
         PangoRectangle ink, logical;
         pango_layout_line_get_extents(pangoLine, &ink, &logical);
         line.width = std::max(Pixels(logical.width), 0);
-        line.left = ShapedText::LineStart(line.width, room.width, room.alignment, line.rightToLeft);
+        line.left = LeftOfLine(line, room);
         line.top = top;
         line.height = std::max(ascent + descent, 1);
         line.baseline = top + ascent;
@@ -253,18 +285,70 @@ std::size_t ParagraphLayout::After(std::size_t unit) const {
     return text.UnitOfCharacter(character);
 }
 
+// Pango has a call for this, which takes a time that grows with the square of the line.
 bool ParagraphLayout::Step(std::size_t &unit, bool toTheRight) const {
-    int byte = 0, trailing = 0;
-    pango_layout_move_cursor_visually(layout, TRUE, text.ByteOf(unit), 0, toTheRight ? 1 : -1, &byte,
-                                      &trailing);
-    if (byte < 0 || byte == std::numeric_limits<int>::max())
+    std::size_t const index = LineAtUnit(unit);
+    Line const &line = lines[index];
+    std::vector<int> places = PlacesIn(index);
+    if (index + 1 < lines.size())
+        places.pop_back(); // it is the next line's first
+    std::size_t const first = text.CharacterOf(line.start);
+    std::size_t const here = text.CharacterOf(unit) - first;
+    std::size_t next = here;
+    for (std::size_t i = 0; i < places.size(); ++i) {
+        bool const beyond = toTheRight ? places[i] > places[here] : places[i] < places[here];
+        bool const nearer =
+            next == here || (toTheRight ? places[i] < places[next] : places[i] > places[next]);
+        if (beyond && nearer && IsStop(first + i))
+            next = i;
+    }
+    if (next != here) {
+        unit = text.UnitOfCharacter(first + next);
+        return true;
+    }
+    bool const onward = toTheRight != line.rightToLeft;
+    if (onward ? index + 1 == lines.size() : index == 0)
         return false;
-    std::size_t const next =
-        text.UnitOfCharacter(text.CharacterOf(text.UnitOfByte(byte)) + static_cast<std::size_t>(trailing));
-    if (next == unit)
-        return false;
-    unit = next;
+    unit = onward ? lines[index + 1].start : Before(line.start);
     return true;
+}
+
+// Where an insertion point stands before each character of the line, and behind the last: as LeftOf has it,
+// but in Pango's units and in equal parts of what several characters make up.
+std::vector<int> ParagraphLayout::PlacesIn(std::size_t index) const {
+    struct Edges {
+        int before, behind;
+        bool toLeft;
+    };
+    Line const &line = lines[index];
+    std::size_t const first = text.CharacterOf(line.start);
+    std::vector<Edges> edges(text.CharacterOf(line.end) - first, Edges{0, 0, false});
+    std::vector<int> widths;
+    int left = 0;
+    for (GSList const *node = PangoLine(index)->runs; node; node = node->next) {
+        PangoGlyphItem const &run = *static_cast<PangoGlyphItem const *>(node->data);
+        PangoItem const &item = *run.item;
+        widths.resize(static_cast<std::size_t>(item.num_chars));
+        pango_glyph_string_get_logical_widths(run.glyphs, text.Utf8().data() + item.offset, item.length,
+                                              item.analysis.level, widths.data());
+        bool const toLeft = item.analysis.level % 2 != 0;
+        int const right = std::accumulate(widths.begin(), widths.end(), left);
+        int place = toLeft ? right : left;
+        std::size_t character = text.CharacterOf(text.UnitOfByte(item.offset)) - first;
+        for (int width : widths) {
+            int const behind = toLeft ? place - width : place + width;
+            edges[character++] = {place, behind, toLeft};
+            place = behind;
+        }
+        left = right;
+    }
+    int const start = line.rightToLeft ? left : 0, end = left - start;
+    std::vector<int> places(1, start);
+    for (std::size_t i = 0; i < edges.size(); ++i) {
+        bool const goesOn = edges[i].toLeft == line.rightToLeft;
+        places.push_back(goesOn ? edges[i].behind : i + 1 < edges.size() ? edges[i + 1].before : end);
+    }
+    return places;
 }
 
 std::size_t ParagraphLayout::WordStartBefore(std::size_t unit) const {

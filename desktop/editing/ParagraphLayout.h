@@ -75,9 +75,11 @@ public:
 
 private:
     void Make(StyleRuns::List const &, Room const &);
+    bool MakeSmaller(StyleRuns::List &) const;
     void MeasureLines(StyleRuns::List const &, Room const &);
     PangoLayoutLine *PangoLine(std::size_t line) const;
     bool IsStop(std::size_t character) const;
+    std::vector<int> PlacesIn(std::size_t line) const;
 
     ShownText text;
     PangoLayout *layout = nullptr;

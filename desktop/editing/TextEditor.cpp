@@ -1,6 +1,7 @@
 #include "desktop/editing/TextEditor.h"
 #include "desktop/drawing/Colors.h"
 #include "desktop/editing/KeyEvent.h"
+#include "desktop/editing/ParagraphBreaks.h"
 #include "desktop/editing/TextFocus.h"
 #include "desktop/resources/Utf.h"
 #include <algorithm>
@@ -60,7 +61,8 @@ void TextEditor::SetText(UString const &text) {
     composing = false;
     hasTypingStyle = false;
     history.Clear();
-    std::u16string_view const units = Utf::View(text);
+    std::u16string_view const given = Utf::View(text);
+    std::u16string_view const units = given.substr(0, ParagraphBreaks::Fitting(given, MostUnits()));
     TextFragment whole;
     whole.units = units;
     whole.looks = document.Styles().Slice(0, 0);
@@ -196,6 +198,7 @@ void TextEditor::SetSelection(unsigned int start, unsigned int end) {
     EndComposing();
     history.Seal();
     keepsWantedH = false;
+    hasTypingStyle = false;
     std::size_t const size = document.Size();
     Select({std::min<std::size_t>(start, size), std::min<std::size_t>(std::max(start, end), size)});
 }

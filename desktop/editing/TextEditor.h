@@ -99,9 +99,11 @@ private:
     void ReplaceText(std::size_t start, std::size_t end, TextFragment const &);
     void ReplaceByUser(std::size_t start, std::size_t end, std::u16string_view, EditHistory::Kind);
     void Type(std::u16string_view);
-    std::u16string Fitted(std::u16string_view) const;
+    std::size_t MostUnits() const;
+    std::u16string Fitted(std::u16string_view, std::size_t replaced) const;
     EditStyle InsertionStyle() const;
     TextFragment LookingAs(std::u16string_view, EditStyle const &) const;
+    TextFragment AsItMayLook(TextFragment const &) const;
     void Record(std::size_t start, std::size_t end, std::u16string_view, EditHistory::Kind);
     EditStep TakeBack(EditStep const &);
     void ShowStep(EditSelection const &);
@@ -136,6 +138,8 @@ private:
     void FollowCaret();
     void LayOut();
     void KeepTextInSight();
+    void ScrollAcross(int left);
+    void ScrollAcrossTo(int h);
     void LayOutVisible();
     void KeepTop(ParagraphChange const &);
     std::size_t LastVisible() const;
@@ -188,7 +192,8 @@ private:
     EditStyle composedStyle;
     EditSelection composedFrom;
 
-    // What is shown begins so many pixels below the top of a paragraph, and right of the text's left.
+    // What is shown begins so many pixels below the top of a paragraph, and right of the box's left: left of
+    // it where a text is read from the right.
     std::size_t topParagraph = 0;
     int topOffset = 0;
     int scrollLeft = 0;

@@ -8,8 +8,9 @@
 
 namespace {
 
-// Positions are told in 32 bits.
-std::size_t const kMostUnits = std::numeric_limits<int>::max();
+// Positions are told in 32 bits. A line that does not break is laid out as a whole for each key, and the
+// fields that it stands in select no more than this when they select all.
+std::size_t const kMostUnits = std::numeric_limits<int>::max(), kMostUnitsOfLine = 32767;
 // So many changed paragraphs are laid out at once, to see whether the others have to move.
 std::size_t const kMostMeasured = 4;
 
@@ -27,22 +28,31 @@ void TextEditor::BroadcastTextChanged() {
         BroadcastChange(TextChangedMsg(), nullptr);
 }
 
-// As it goes into this text: line breaks of every kind as line feeds, or as spaces where there is one line.
-std::u16string TextEditor::Fitted(std::u16string_view text) const {
+std::size_t TextEditor::MostUnits() const { return HasSeveralLines() ? kMostUnits : kMostUnitsOfLine; }
+
+// As it goes into this text in the place of so many units: line breaks of every kind as line feeds, or as
+// spaces where there is one line; and as much as there is room for.
+std::u16string TextEditor::Fitted(std::u16string_view text, std::size_t replaced) const {
     std::u16string fitted;
-    fitted.reserve(text.size());
-    std::size_t const room = kMostUnits - std::min(document.Size(), kMostUnits);
-    for (std::size_t i = 0; i < text.size() && fitted.size() < room; ++i) {
+    std::size_t const room = MostUnits() - std::min(document.Size() - replaced, MostUnits());
+    fitted.reserve(std::min(text.size(), room));
+    for (std::size_t i = 0; i < text.size() && fitted.size() <= room; ++i) {
         bool const breaks = ParagraphBreaks::IsBreak(text[i]);
         if (breaks && text[i] == '\r' && i + 1 < text.size() && text[i + 1] == '\n')
             continue;
         fitted += !breaks ? text[i] : HasSeveralLines() ? u'\n' : u' ';
     }
+    fitted.resize(ParagraphBreaks::Fitting(fitted, room));
     return fitted;
 }
 
 TextFragment TextEditor::LookingAs(std::u16string_view units, EditStyle const &style) const {
     return {std::u16string(units), StyleRuns::List(1, StyleRuns::Run{0, style})};
+}
+
+// What was there before, or has been begun, may have another look than all text has now.
+TextFragment TextEditor::AsItMayLook(TextFragment const &fragment) const {
+    return IsStyled() ? fragment : LookingAs(fragment.units, document.Styles().At(0));
 }
 
 // Changes the text and damages what looks different now; selection and history are the caller's.
@@ -106,8 +116,15 @@ void TextEditor::ReplaceByUser(std::size_t start, std::size_t end, std::u16strin
 void TextEditor::Type(std::u16string_view units) {
     if (IsReadOnly())
         return;
+    bool const composed = composing;
     RestoreComposed();
-    ReplaceByUser(selection.Start(), selection.End(), Fitted(units), EditHistory::kTyping);
+    std::u16string const typed = Fitted(units, selection.End() - selection.Start());
+    if (!typed.empty()) {
+        ReplaceByUser(selection.Start(), selection.End(), typed, EditHistory::kTyping);
+    } else if (composed) {
+        CaretChanged();
+        BroadcastTextChanged();
+    }
 }
 
 // Commands
@@ -129,7 +146,8 @@ void TextEditor::Paste() {
     if (IsReadOnly())
         return;
     EndComposing();
-    std::u16string const pasted = Fitted(Utf::View(Clipboard::Text()));
+    UString const text = Clipboard::Text();
+    std::u16string const pasted = Fitted(Utf::View(text), selection.End() - selection.Start());
     if (!pasted.empty())
         ReplaceByUser(selection.Start(), selection.End(), pasted, EditHistory::kOther);
 }
@@ -153,8 +171,7 @@ EditStep TextEditor::TakeBack(EditStep const &step) {
     std::size_t const end = step.start + step.length;
     EditStep reverse{step.start, document.FragmentOf(step.start, end), step.before.units.size(),
                      step.selectionBefore, step.selectionAfter};
-    ReplaceText(step.start, end,
-                IsStyled() ? step.before : LookingAs(step.before.units, document.Styles().At(0)));
+    ReplaceText(step.start, end, AsItMayLook(step.before));
     return reverse;
 }
 
@@ -209,8 +226,8 @@ void TextEditor::Compose(UString const &text, int caret) {
         markEnd = selection.End();
         composing = true;
     }
-    std::u16string const units = Fitted(Utf::View(text));
-    ReplaceText(markStart, markEnd, LookingAs(units, composedStyle));
+    std::u16string const units = Fitted(Utf::View(text), markEnd - markStart);
+    ReplaceText(markStart, markEnd, AsItMayLook(LookingAs(units, composedStyle)));
     markEnd = markStart + units.size();
     std::size_t at = 0;
     for (int i = 0; i < caret && at < units.size(); ++i)
@@ -227,7 +244,7 @@ void TextEditor::RestoreComposed() {
     if (!composing)
         return;
     composing = false;
-    ReplaceText(markStart, markEnd, composedOver);
+    ReplaceText(markStart, markEnd, AsItMayLook(composedOver));
     selection = composedFrom;
 }
 

@@ -79,8 +79,25 @@ void TextEditor::LayOut() {
 
 // A line that has become shorter, or has got more room, does not leave its end for nothing.
 void TextEditor::KeepTextInSight() {
-    if (scrollLeft > 0)
-        scrollLeft = std::clamp(scrollLeft, 0, std::max(flow.WidthOf(0) - RoomWidth(), 0));
+    if (scrollLeft != 0)
+        ScrollAcross(scrollLeft);
+}
+
+void TextEditor::ScrollAcross(int left) {
+    ParagraphLayout::Range const extent = flow.ExtentOf(0);
+    scrollLeft = std::clamp(left, extent.first, std::max(extent.second - RoomWidth(), 0));
+}
+
+// Where one goes back in the text, some of what stands before shows too.
+void TextEditor::ScrollAcrossTo(int h) {
+    int const room = RoomWidth(), before = room / 4;
+    bool const rightToLeft = flow.IsRightToLeft(0);
+    if (h < scrollLeft)
+        ScrollAcross(rightToLeft ? h : h - before);
+    else if (h > scrollLeft + room)
+        ScrollAcross(rightToLeft ? h - room + before : h - room);
+    else
+        ScrollAcross(scrollLeft);
 }
 
 // Scrolling
@@ -115,15 +132,8 @@ bool TextEditor::ScrollIntoView(std::size_t unit) {
             break;
         LayOutVisible();
     }
-    if (!HasSeveralLines()) {
-        int const room = RoomWidth();
-        if (place.h < scrollLeft)
-            scrollLeft = std::max(place.h - room / 4, 0); // with some of what stands before
-        else if (place.h > scrollLeft + room)
-            scrollLeft = place.h - room;
-        else
-            scrollLeft = std::clamp(scrollLeft, 0, std::max(flow.WidthOf(unit) - room, 0));
-    }
+    if (!HasSeveralLines())
+        ScrollAcrossTo(place.h);
     if (leftBefore != scrollLeft)
         DamageAll();
     return paragraphBefore != topParagraph || offsetBefore != topOffset || leftBefore != scrollLeft;

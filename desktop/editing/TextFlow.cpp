@@ -72,11 +72,12 @@ ParagraphLayout const &TextFlow::LayoutOf(std::size_t paragraph) {
     ParagraphIndex &paragraphs = document.Paragraphs();
     std::u16string const body = document.BodyOf(paragraph);
     std::size_t const start = paragraphs.StartOf(paragraph);
-    std::unique_ptr<ParagraphLayout> &layout = layouts[paragraph];
-    layout = std::make_unique<ParagraphLayout>(
+    std::unique_ptr<ParagraphLayout> made = std::make_unique<ParagraphLayout>(
         body, document.Styles().Slice(start, start + body.size()),
         ParagraphLayout::Room{width, document.HasSeveralLines(), alignment});
-    paragraphs.SetHeight(paragraph, static_cast<std::uint32_t>(layout->Height()), true);
+    paragraphs.SetHeight(paragraph, static_cast<std::uint32_t>(made->Height()), true);
+    std::unique_ptr<ParagraphLayout> &layout = layouts[paragraph];
+    layout = std::move(made);
     return *layout;
 }
 
@@ -203,11 +204,13 @@ std::size_t TextFlow::LineEnd(std::size_t unit) {
     return spot.start + std::max(layout.Before(end), layout.Lines()[line].start);
 }
 
-int TextFlow::WidthOf(std::size_t unit) {
-    int width = 0;
-    for (ParagraphLayout::Line const &line : LayoutOf(SpotOf(unit).paragraph).Lines())
-        width = std::max(width, line.left + line.width);
-    return width;
+ParagraphLayout::Range TextFlow::ExtentOf(std::size_t unit) {
+    ParagraphLayout::Range extent(0, 0);
+    for (ParagraphLayout::Line const &line : LayoutOf(SpotOf(unit).paragraph).Lines()) {
+        extent.first = std::min(extent.first, line.left);
+        extent.second = std::max(extent.second, line.left + line.width);
+    }
+    return extent;
 }
 
 bool TextFlow::IsRightToLeft(std::size_t unit) { return LayoutOf(SpotOf(unit).paragraph).IsRightToLeft(); }

@@ -52,8 +52,9 @@ public:
     std::size_t DeletionStart(std::size_t unit);
     std::size_t LineStart(std::size_t unit);
     std::size_t LineEnd(std::size_t unit);
-    // How wide the unit's paragraph is.
-    int WidthOf(std::size_t unit);
+    // From where to where the unit's paragraph goes. Where lines do not break, that may be on either side of
+    // the box.
+    ParagraphLayout::Range ExtentOf(std::size_t unit);
     // Whether the unit's paragraph is written from right to left.
     bool IsRightToLeft(std::size_t unit);
     // The paragraph of the unit, with what ends it.

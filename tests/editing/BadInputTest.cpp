@@ -134,3 +134,29 @@ TEST_F(EditorBadInput, AListenerMayChangeTheTextAgain) {
     EXPECT_EQ(Text(), u"no");
     EXPECT_EQ(Selection(), At(2));
 }
+
+TEST_F(EditorBadInput, AFamilyThatDoesNotExistIsThatOfDialogText) {
+    TextEditor &edit = Open(kStyled, u"mm");
+    edit.SetSelection(2, 2);
+    int const end = edit.CaretBox().left;
+    OS::TextStyle unknown;
+    unknown.family = OS::Font::FamilyID(static_cast<OS::Font::FixedFontFamily>(9999));
+    edit.SetSelection(0, 2);
+    edit.SetStyle(1, unknown);
+    edit.SetSelection(2, 2);
+    EXPECT_EQ(edit.CaretBox().left, end);
+    Play("type \"m\"");
+    EXPECT_EQ(Text(), u"mmm");
+    EXPECT_GT(edit.CaretBox().left, end);
+}
+
+TEST_F(EditorBadInput, AStyleForWhatIsTypedNextEndsWithAnotherSelectionOfTheSamePlace) {
+    TextEditor &edit = Open(kStyled, u"ab");
+    OS::TextStyle large;
+    large.size = 30;
+    edit.SetSelection(2, 2);
+    edit.SetStyle(4, large);
+    edit.SetSelection(2, 2);
+    Play("type \"c\"");
+    EXPECT_EQ(edit.GetNumberStyleRuns(), 1u);
+}

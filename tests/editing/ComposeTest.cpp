@@ -80,3 +80,36 @@ TEST_F(EditorCompose, NothingIsComposedInAReadOnlyText) {
     EXPECT_EQ(Text(), u"ab");
     EXPECT_FALSE(edit.GetMarkedRange());
 }
+
+TEST_F(EditorCompose, ALookOfAllTextThatIsSetMeanwhileIsTheOnlyOne) {
+    TextEditor &edit = Open(0, u"abcd");
+    edit.SetSelection(1, 3);
+    Play("compose \"n\"");
+    OS::TextStyle large;
+    large.size = 20;
+    edit.SetStyle(4, large);
+    Play("compose \"no\"");
+    EXPECT_EQ(edit.GetNumberStyleRuns(), 1u);
+    Play("compose \"\"");
+    EXPECT_EQ(Text(), u"abcd");
+    EXPECT_EQ(edit.GetNumberStyleRuns(), 1u);
+    EXPECT_EQ(StyleAt(1).size, 20);
+}
+
+TEST_F(EditorCompose, GivesTheLooksBackThatItStoodInThePlaceOf) {
+    TextEditor &edit = Open(kStyled, u"abcd");
+    OS::TextStyle large;
+    large.size = 20;
+    edit.SetSelection(2, 3);
+    edit.SetStyle(4, large);
+    edit.SetSelection(1, 4);
+    Play("compose \"n\"");
+    EXPECT_EQ(edit.GetNumberStyleRuns(), 1u);
+    Play("compose \"\"");
+    ASSERT_EQ(edit.GetNumberStyleRuns(), 3u);
+    unsigned int start = 0, end = 0;
+    OS::TextStyle style;
+    edit.GetNthStyleRun(1, start, end, style);
+    EXPECT_EQ(UnitRange(start, end), UnitRange(2, 3));
+    EXPECT_EQ(style.size, 20);
+}

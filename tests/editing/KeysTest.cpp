@@ -215,3 +215,47 @@ TEST_F(EditorKeys, AnInactiveTextTakesNoKeys) {
     Play("type \"b\"\nkey Backspace");
     EXPECT_EQ(Text(), u"a");
 }
+
+TEST_F(EditorKeys, UpAndDownWithShiftSelectFromWhereTheyBegan) {
+    Open(kSeveralLines, u"iiiiiiii\niiiiiiii\niiiiiiii").SetSelection(4, 4);
+    Play("key Down shift");
+    EXPECT_EQ(Selection(), UnitRange(4, 13));
+    Play("key Down shift");
+    EXPECT_EQ(Selection(), UnitRange(4, 22));
+    Play("key Up shift\nkey Up shift");
+    EXPECT_EQ(Selection(), At(4));
+    Play("key Up shift");
+    EXPECT_EQ(Selection(), UnitRange(0, 4));
+}
+
+TEST_F(EditorKeys, PagesWithShiftAreSelected) {
+    std::u16string text;
+    for (int i = 0; i < 100; ++i)
+        text += u"line\n";
+    TextEditor &edit = Open(kSeveralLines, text);
+    edit.SetSelection(7, 7);
+    Play("key PageDown shift");
+    EXPECT_EQ(Selection().first, 7u);
+    EXPECT_EQ(Selection().second % 5, 2u);
+    EXPECT_NEAR(Selection().second / 5, 200 / edit.GetScrollDelta(), 1);
+    Play("key PageUp shift");
+    EXPECT_EQ(Selection(), At(7));
+}
+
+TEST_F(EditorKeys, EveryPlaceOfABrokenParagraphIsSteppedThrough) {
+    std::u16string const hebrew = u"\u05E9\u05DC\u05D5\u05DD \u05E2\u05D5\u05DC\u05DD ";
+    for (std::u16string const &word : {std::u16string(u"some text "), hebrew}) {
+        delete pane;
+        std::u16string const text = word + word + word + word;
+        Open(kSeveralLines, text, {10, 10, 210, 70});
+        bool const toTheLeft = word == hebrew;
+        for (unsigned int unit = 1; unit <= text.size(); ++unit) {
+            Play(toTheLeft ? "key Left" : "key Right");
+            ASSERT_EQ(Selection(), At(unit));
+        }
+        for (unsigned int unit = static_cast<unsigned int>(text.size()); unit > 0; --unit) {
+            Play(toTheLeft ? "key Right" : "key Left");
+            ASSERT_EQ(Selection(), At(unit - 1));
+        }
+    }
+}

@@ -144,3 +144,31 @@ TEST_F(EditorMouse, ATextThatIsReplacedDuringADragLeavesASelectionWithinIt) {
         delete pane;
     }
 }
+
+TEST_F(EditorMouse, ADragBackwardsGoesOnByWordsAndByParagraphs) {
+    Open(kSeveralLines, u"one two three four\nfive\nsix seven");
+    std::string const word = PlaceOf(10), third = PlaceOf(28), first = PlaceOf(5);
+    Play("press " + word + "\nrelease\npress " + word + "\nmove " + first + "\nrelease");
+    EXPECT_EQ(Selection(), UnitRange(4, 13));
+    Play("wait 1\npress " + third + "\nrelease\npress " + third + "\nrelease\npress " + third + "\nmove " +
+         first + "\nrelease");
+    EXPECT_EQ(Selection(), UnitRange(0, 33));
+    Play("key Left shift");
+    EXPECT_EQ(Selection(), UnitRange(0, 33)) << "it was begun at the end and has come to the start";
+}
+
+TEST_F(EditorMouse, ATripleClickWithShiftSelectsOnToTheParagraphsEnd) {
+    Open(kSeveralLines, u"one two\nthree four\nfive").SetSelection(2, 2);
+    std::string const place = PlaceOf(10) + " shift";
+    Play("press " + place + "\nrelease\npress " + place + "\nrelease\npress " + place + "\nrelease");
+    EXPECT_EQ(Selection(), UnitRange(2, 19));
+}
+
+TEST_F(EditorMouse, HoldingTheMouseBesideALineScrollsAcross) {
+    TextEditor &edit = Open(0, std::u16string(100, u'm'), {10, 10, 30, 110});
+    unsigned int const before = edit.GetLayoutInfo().GetCharacterIndexForPoint(OS::Point(3, 8));
+    Play("press 30 20\nmove 150 20\nwait 1\nrelease");
+    EXPECT_EQ(before, 0u);
+    EXPECT_GT(edit.GetLayoutInfo().GetCharacterIndexForPoint(OS::Point(3, 8)), 5u);
+    EXPECT_GT(Selection().second, 15u);
+}

@@ -92,3 +92,22 @@ TEST_F(EditorUndo, TellsThatTheTextHasChanged) {
     Play("key z command\nkey z command");
     EXPECT_EQ(ear.changes, before + 1);
 }
+
+TEST_F(EditorUndo, MakingAgainRestoresLooksAndSelectionToo) {
+    TextEditor &edit = Open(kStyled, u"one two");
+    edit.SetSelection(4, 7);
+    OS::TextStyle big;
+    big.size = 20;
+    edit.SetStyle(4, big);
+    edit.SetSelection(0, 5);
+    Play("key Delete\nkey z command");
+    EXPECT_EQ(Selection(), UnitRange(0, 5));
+    EXPECT_NE(StyleAt(0).size, 20);
+    Play("key y command");
+    EXPECT_EQ(Text(), u"wo");
+    EXPECT_EQ(Selection(), At(0));
+    EXPECT_EQ(StyleAt(0).size, 20);
+    EXPECT_EQ(edit.GetNumberStyleRuns(), 1u);
+    Play("key z command");
+    EXPECT_EQ(edit.GetNumberStyleRuns(), 2u);
+}
