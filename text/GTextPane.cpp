@@ -37,7 +37,12 @@ public:
         : edit(edit_) {
         edit.GetSelection(start, end);
     }
-    ~WithSelectionKept() { edit.SetSelection(start, end); }
+    ~WithSelectionKept() {
+        try {
+            edit.SetSelection(start, end);
+        } catch (...) { // it is selected; only what is to be repainted for it was not found out
+        }
+    }
     WithSelectionKept(WithSelectionKept const &) = delete;
     WithSelectionKept &operator=(WithSelectionKept const &) = delete;
 

@@ -80,6 +80,8 @@ public:
     void Deactivate() override;
     // With true, BeginEditing goes out, also when the field is selected already; then the insertion point
     // shows. With false, EndEditing goes out if the field is selected, and TextPaneConfirmation in any case.
+    // But nobody is told of what a listener selects or deselects in answer to one of the three: the message
+    // that is under way says it already, and the two would never come to an end.
     void Select(bool) override;
     // The cancel key sends ResetValue. Every other key sends AutoSetActivityMsg first. 0 when the engine has
     // no use for the key.
@@ -117,7 +119,8 @@ public:
     // OS::TextEditListener: sends ValueChanged.
     void TextEditListener_TextChanged() override;
 
-    // The text. Setting another one sends nothing; while the mouse button is down it is drawn at once, since
+    // The text. One line takes 32,767 units, and what is longer is cut there, as what is typed and pasted is.
+    // Setting another one sends nothing; while the mouse button is down it is drawn at once, since
     // nothing is updated then. GetText needs the engine.
     void SetText(const UString &);
     UString GetText();

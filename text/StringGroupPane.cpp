@@ -5,6 +5,7 @@
 #include "host/PortSavers.h"
 #include "host/TextLayout.h"
 #include "host/VelaDrawing.h"
+#include "scrolling/Truncation.h"
 #include "text/FontIndex.h"
 #include <algorithm>
 
@@ -14,8 +15,6 @@ namespace {
 Rect const kNothing = {10000, 10000, -10000, -10000};
 int const kNoPane = -1;  // of a layout item
 int const kNoLimit = -1; // to a text's width
-
-short Short(int value) { return static_cast<short>(value); }
 
 } // namespace
 
@@ -29,7 +28,7 @@ StringGroupPane::~StringGroupPane() {}
 
 StringGroupPane *StringGroupPane::NewStringGroupPane(glogRec *owner, int id, GlogStyleSheet *sheet) {
     StringGroupPane *const pane = new StringGroupPane;
-    pane->GlogPaneInit(owner, Short(id));
+    pane->GlogPaneInit(owner, static_cast<short>(id));
     pane->GetFromXML(sheet);
     return pane;
 }
@@ -65,9 +64,9 @@ TarnQuickDrawText::FontInfo StringGroupPane::UseFont() const {
 // The origin is the start of the baseline, though DrawGuts only uses the box that follows from it.
 void StringGroupPane::SetTextBox(StringInfo &string, int index, Point origin,
                                  TarnQuickDrawText::FontInfo const &info) {
-    short const top = Short(origin.v - info.ascent);
-    string.box = {top, origin.h, Short(top + lineSpacing),
-                  Short(origin.h + LooseStringWidth(string.text, 0.0f, 1.0f))};
+    short const top = Pixel16(origin.v - info.ascent);
+    string.box = {top, origin.h, Pixel16(0LL + top + lineSpacing),
+                  Pixel16(0LL + origin.h + LooseStringWidth(string.text, 0.0f, 1.0f))};
     string.item = GlogLayout::MakeRectItem(string.box, kNoPane, index, GetLayoutRect()->GetName());
     AddLayoutSubItem(string.item);
 }
@@ -99,8 +98,8 @@ void StringGroupPane::SetBox(Rect *box) {
     int const dv = box->top - former.top, dh = box->left - former.left;
     for (StringInfo &string : strings) {
         Rect const &old = string.box;
-        string.box = {Short(old.top + dv), Short(old.left + dh), Short(old.bottom + dv),
-                      Short(old.right + dh)};
+        string.box = {Pixel16(old.top + dv), Pixel16(old.left + dh), Pixel16(old.bottom + dv),
+                      Pixel16(old.right + dh)};
     }
 }
 
@@ -114,7 +113,7 @@ void StringGroupPane::DrawGuts(OSRgn *) {
     VelaDrawing::RGBForeColor(kDialogActiveTextColor);
     for (StringInfo const &string : strings) {
         Rect const r = IsInLayout() ? string.item->GetBorderRect() : string.box;
-        Point const start = {Short(r.top + ascent / 2 + (r.bottom - r.top) / 2), r.left};
+        Point const start = {Pixel16(r.top + ascent / 2 + (r.bottom - r.top) / 2), r.left};
         DrawStringAtPoint(string.text, start, kNoLimit, TextSettings::kTruncateNone);
     }
 }

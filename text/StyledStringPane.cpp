@@ -5,6 +5,7 @@
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
 #include "host/glogRec.h"
+#include "scrolling/Truncation.h"
 #include "text/ItemSize.h"
 
 StyledStringPane::StyledStringPane(glogRec *owner, short id, bool keepRightDistance_)
@@ -27,9 +28,7 @@ StyledStringPane::StyledStringPane(glogRec *owner, short id, bool keepRightDista
 
 StyledStringPane::~StyledStringPane() { delete styledString; }
 
-short StyledStringPane::DistanceOf(short right) const {
-    return static_cast<short>(GetGlogWidth(glog) - right);
-}
+short StyledStringPane::DistanceOf(short right) const { return Pixel16(GetGlogWidth(glog) - right); }
 
 void StyledStringPane::AdoptStyledString(AutoPtr<StyledString> newString) {
     StyledString *const former = styledString;
@@ -52,7 +51,7 @@ void StyledStringPane::CalcBox() {
     if (keepRightDistance) {
         Rect box;
         GetBox(&box);
-        box.right = static_cast<short>(GetGlogWidth(glog) - rightDistance);
+        box.right = Pixel16(GetGlogWidth(glog) - rightDistance);
         SetBox(&box);
     }
     if (!styledString)
@@ -70,12 +69,12 @@ void StyledStringPane::SetBox(Rect *box) {
 // Drawing
 
 short StyledStringPane::TextLeft(Rect const &box) const {
-    int const width = styledString->GetWidth();
+    long long const width = styledString->GetWidth();
     switch (alignment) {
     case kRight:
-        return static_cast<short>(box.right - width);
+        return Pixel16(box.right - width);
     case kCentre:
-        return static_cast<short>((box.right + box.left - width) / 2);
+        return Pixel16((box.right + box.left - width) / 2);
     default:
         return box.left;
     }
@@ -91,7 +90,6 @@ void StyledStringPane::DrawGuts(OSRgn *) {
     if (!styledString)
         return;
     VelaDrawing::RGBForeColor(kDialogActiveTextColor);
-    short const baseline = static_cast<short>(box.top + topBorder + styledString->GetAscent());
-    VelaDrawing::MoveTo(TextLeft(box), baseline);
+    VelaDrawing::MoveTo(TextLeft(box), Pixel16(0LL + box.top + topBorder + styledString->GetAscent()));
     styledString->Draw();
 }

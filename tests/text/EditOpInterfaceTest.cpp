@@ -1,5 +1,6 @@
 #include "text/EditOpInterface.h"
 #include "desktop/windows/WindowSystem.h"
+#include "host/OSPort.h"
 #include "tests/VirtualPlace.h"
 #include "tests/text/TextFieldTest.h"
 
@@ -125,6 +126,32 @@ TEST_F(TextFieldTest, AShortcutOfAnEditCommandThatThePaneRefusesDoesNothing) {
     desktop.Windows().SetClipboardText("pasted");
     desktop.Play("key v command");
     EXPECT_EQ(pane->GetText(), UString());
+}
+
+TEST_F(EditOpInterfaceTest, WithoutAGlogOrACurrentItemTheFlagStays) {
+    OpenTextField *const pane = Make();
+    for (bool flag : {true, false}) {
+        bool commits = flag;
+        EXPECT_FALSE(EditOpInterface::DoEditOp(nullptr, CommandSpecifier(kEdit, 11), commits));
+        EXPECT_EQ(commits, flag);
+        EXPECT_EQ(glog->GetCurItem(), nullptr);
+        EXPECT_FALSE(Do(11, commits));
+        EXPECT_EQ(commits, flag);
+    }
+    EXPECT_EQ(pane->GetText(), UString());
+}
+
+TEST_F(EditOpInterfaceTest, ACommandIsDoneInThePortOfTheItem) {
+    MakeCurrent();
+    glogRec *const other = desktop.NewGlog(GlogOptions().Size(100, 100));
+    ShowGlog(other, kShowGlog);
+    for (short id : {12, 14}) {
+        SetPortToGlog(other);
+        ASSERT_EQ(&OSPort::Current(), other->GetPort());
+        bool commits = true;
+        Do(id, commits);
+        EXPECT_EQ(&OSPort::Current(), glog->GetPort()) << id;
+    }
 }
 
 } // namespace

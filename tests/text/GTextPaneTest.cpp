@@ -5,7 +5,10 @@
 #include "host/Services.h"
 #include "host/TarnError.h"
 #include "host/VelaDrawing.h"
+#include "tests/LibraryExports.h"
 #include "tests/VirtualPlace.h"
+#include "tests/buttons/ButtonGroupTest.h"
+#include "tests/frame/Allocations.h"
 #include "tests/text/TextFieldTest.h"
 #include <cstddef>
 #include <type_traits>
@@ -135,6 +138,12 @@ TEST_F(GTextPaneTest, ARectangleWithoutAGlogIsAFailure) {
     EXPECT_THROW(GTextPane::NewGTextPane(nullptr, 12, &rect, Text("Take"), nullptr), TarnError);
 }
 
+long long NumberAt(XMLLib::ContainerItem const &item, std::size_t index) {
+    boost::shared_ptr<XMLLib::SIntItem> const number =
+        boost::dynamic_pointer_cast<XMLLib::SIntItem>(item.GetNthItem(index));
+    return number ? number->Get() : -99;
+}
+
 TEST_F(GTextPaneTest, ARecordBecomesAnItemWithAllItsKeysInOrder) {
     gtextResRec record;
     record.bounds = {1, 2, 3, 4};
@@ -160,10 +169,36 @@ TEST_F(GTextPaneTest, ARecordBecomesAnItemWithAllItsKeysInOrder) {
     for (auto const &number : numbers)
         EXPECT_EQ(item->GetSIntItemValue(Text(number.key)), number.value) << number.key;
     EXPECT_EQ(item->GetUStringItemValue(Text("InitTextID")), Text("Init"));
-    boost::shared_ptr<XMLLib::SIntItem> const third =
-        boost::dynamic_pointer_cast<XMLLib::SIntItem>(item->GetNthItem(2));
-    ASSERT_TRUE(third);
-    EXPECT_EQ(third->Get(), 7);
+    EXPECT_EQ(NumberAt(*item, 2), 7);
+    EXPECT_EQ(NumberAt(*item, 3), 2);
+    EXPECT_EQ(NumberAt(*item, 4), -4);
+    EXPECT_EQ(NumberAt(*item, 14), -1);
+    EXPECT_EQ(NumberAt(*item, 15), 3);
+    boost::shared_ptr<XMLLib::UStringItem> const type = XMLLib::UStringFromItem(item->GetNthItem(0)),
+                                                 text = XMLLib::UStringFromItem(item->GetNthItem(16));
+    ASSERT_TRUE(type && text);
+    EXPECT_EQ(type->Get(), Text("GText"));
+    EXPECT_EQ(text->Get(), Text("Init"));
+    EXPECT_TRUE(XMLLib::ContainerFromItem(item->GetNthItem(1)));
+}
+
+TEST_F(GTextPaneTest, EachFlagOfARecordHasItsPlaceInTheItem) {
+    struct {
+        int flags, moreFlags;
+        std::size_t place;
+    } const cases[] = {{gtextResRec::kBoxIt, 0, 5},          {gtextResRec::kNoTabIn, 0, 6},
+                       {gtextResRec::kRetOnClick, 0, 7},     {gtextResRec::kRetOnModify, 0, 8},
+                       {gtextResRec::kMultiLine, 0, 9},      {0, gtextResRec::kReadOnly, 10},
+                       {gtextResRec::kAutoScroll, 0, 11},    {gtextResRec::kNotSelectable, 0, 12},
+                       {gtextResRec::kUseSavedColors, 0, 13}};
+    for (auto const &c : cases) {
+        gtextResRec record;
+        record.flags = static_cast<unsigned char>(c.flags);
+        record.moreFlags = static_cast<unsigned char>(c.moreFlags | 0xFE);
+        boost::shared_ptr<XMLLib::ContainerItem> const item = GTextPane::XMLResFrom_GTextResRec(record);
+        for (std::size_t i = 5; i <= 13; ++i)
+            EXPECT_EQ(NumberAt(*item, i), i == c.place) << c.place << ' ' << i;
+    }
 }
 
 // Selecting
@@ -468,10 +503,7 @@ TEST_F(GTextPaneTest, AStyleForAllEndsTheEditingAndKeepsTheSelection) {
     OS::TextStyle style;
     style.size = 17;
     pane->SetTextStyle(style);
-    Heard const heard = ear.Take();
-    ASSERT_GE(heard.size(), 2u);
-    EXPECT_EQ(heard[0], "End");
-    EXPECT_EQ(heard[1], "Confirmation");
+    EXPECT_EQ(ear.Take(), (Heard{"End", "Confirmation"}));
     EXPECT_EQ(SelectionOf(*pane), Units(1, 3));
     EXPECT_EQ(glog->GetCurItem(), nullptr);
     OS::TextStyle got;
@@ -485,9 +517,100 @@ TEST_F(GTextPaneTest, TheFontIsThatOfTheTable) {
     OS::TextStyle got;
     pane->GetStyle(7, got);
     EXPECT_EQ(got.size, GetIndVelaFont(9)->size);
+    EXPECT_EQ(pane->GetTextHeight(), Make(TestItem().Integer("FSRID", 9))->GetTextHeight());
     gcSetFontFSRID(pane, 7);
     EXPECT_EQ(pane->GetFontFSRID(), 7);
-    EXPECT_EQ(pane->GetTextHeight() > 0, true);
+    EXPECT_EQ(pane->GetTextHeight(), Make(TestItem().Integer("FSRID", 7))->GetTextHeight());
+}
+
+TEST_F(GTextPaneTest, IsReachedByItsProcedureVariables) {
+    OpenTextField *const pane = Make();
+    gcSetFontFSRID(pane, 0x70105);
+    EXPECT_EQ(pane->GetFontFSRID(), 5) << "the low byte of the low 16 bits";
+    gcSetModeGText(pane, 0x301);
+    EXPECT_EQ(pane->GetMode(), 1);
+    typedef void (*OfField)(GTextPane *, int);
+    std::map<std::string, Symbol> const exports = ExportsOfTheLibrary();
+    for (char const *name : {"gcSetFontFSRID", "gcSetModeGText"}) {
+        ASSERT_EQ(exports.count(name), 1u) << name;
+        char const type = exports.at(name).type;
+        EXPECT_TRUE(type == 'D' || type == 'B') << name << " is of type " << type;
+        Replaced<OfField> const replaced(Find<OfField>(name), [](GTextPane *, int) {});
+        gcSetFontFSRID(pane, 5);
+        gcSetModeGText(pane, 1);
+    }
+    {
+        Replaced<OfField> const font(Find<OfField>("gcSetFontFSRID"), [](GTextPane *, int) {});
+        gcSetFontFSRID(pane, 3);
+        EXPECT_EQ(pane->GetFontFSRID(), 5);
+    }
+    Replaced<OfField> const mode(Find<OfField>("gcSetModeGText"),
+                                 [](GTextPane *field, int number) { field->SetMode(number ? 5 : 2); });
+    gcSetModeGText(pane, 1);
+    EXPECT_EQ(pane->GetMode(), 5);
+}
+
+TEST_F(GTextPaneTest, TypingTurnsTheCheckBoxOnThatItIsBoundTo) {
+    OpenTextField *const pane = Make();
+    GroupItem item;
+    item.Button({60, 20}).Label({70, 38}, "First").Button({80, 20}).Label({90, 38}, "Second");
+    CheckBoxPane *const boxes = CheckBoxPane::NewCheckBoxPane(glog, item.Sheet());
+    boxes->SetAutoBinding(static_cast<Provider<AutoSetActivityListener> *>(pane), 1);
+    GroupListener listener;
+    listener.HangOn(boxes);
+    pane->Select(true);
+    EXPECT_FALSE(boxes->ReadOne(1));
+    desktop.Play("type \"a\"");
+    EXPECT_FALSE(boxes->ReadOne(0));
+    EXPECT_TRUE(boxes->ReadOne(1));
+    ASSERT_FALSE(listener.heard.empty());
+    EXPECT_EQ(listener.heard.front(), "1 on");
+    EXPECT_EQ(listener.sources.front(), boxes);
+}
+
+TEST_F(GTextPaneTest, ARunThatCoversNothingChangesNothing) {
+    StyleRunRec empty, beyond, backwards;
+    for (StyleRunRec *run : {&empty, &beyond, &backwards})
+        run->style.size = 30;
+    empty.start = empty.end = 0;
+    beyond.start = 900;
+    beyond.end = 950;
+    backwards.start = 3;
+    backwards.end = 1;
+    std::vector<StyleRunRec> const runs = {beyond, backwards, empty};
+    UString const text = Text("Bass");
+    OpenTextField *const pane = new OpenTextField;
+    TestItem item;
+    item.Box("BoundsRect", {20, 20, 36, 200});
+    ASSERT_EQ(pane->InitGTextPane(glog, item.Sheet(), &text, &runs), pane);
+    EXPECT_EQ(pane->GetNumberStyleRuns(), 1u);
+    Show();
+    glog->SetCurItem(pane);
+    pane->SetSelection(0, 0);
+    desktop.Play("type \"a\"\nkey End\ntype \"z\"");
+    EXPECT_EQ(pane->GetText(), Text("aBassz"));
+    EXPECT_EQ(pane->GetNumberStyleRuns(), 1u);
+}
+
+// Wherever memory runs out on the way, it is there again for what puts the selection back.
+TEST_F(GTextPaneTest, AStyleForAllKeepsTheSelectionAlsoWhenItFails) {
+    OpenTextField *const pane = Make(TestItem().String("InitTextID", "Bass"));
+    OS::TextStyle style;
+    int failures = 0;
+    for (long successes = 0; successes < 200; ++successes) {
+        style.size = static_cast<short>(10 + successes % 2);
+        pane->SetSelection(1, 3);
+        Allocations::FailAfter const failing(successes);
+        try {
+            pane->SetTextStyle(style);
+        } catch (std::bad_alloc const &) {
+            ++failures;
+        }
+        EXPECT_EQ(SelectionOf(*pane), Units(1, 3)) << successes;
+        if (!failing.HasFailed())
+            break;
+    }
+    EXPECT_GT(failures, 0);
 }
 
 // Neither of the others is asked to draw, and no pixel beyond the one is presented.
@@ -524,10 +647,7 @@ TEST_F(GTextPaneTest, ANewModeEndsTheEditingAndRepaints) {
     gcSetModeGText(pane, 0);
     EXPECT_EQ(ear.Take(), Heard());
     gcSetModeGText(pane, 1);
-    Heard const heard = ear.Take();
-    ASSERT_GE(heard.size(), 2u);
-    EXPECT_EQ(heard[0], "End");
-    EXPECT_EQ(heard[1], "Confirmation");
+    EXPECT_EQ(ear.Take(), (Heard{"End", "Confirmation"}));
     EXPECT_EQ(pane->GetMode(), 1);
     EXPECT_EQ(glog->GetCurItem(), nullptr);
     EXPECT_FALSE(Repainted().empty());
@@ -639,11 +759,6 @@ TEST_F(GTextPaneTest, ItsColoursAreTheThemesUnlessItHasItsOwn) {
     RGBColor const red = {0xFFFF, 0, 0}, blue = {0, 0, 0xFFFF};
     pane->SetColors(red, blue);
     EXPECT_EQ(fore(), Traced(*pane, [&] { VelaDrawing::RGBForeColor(red); }));
-}
-
-TEST_F(GTextPaneTest, ColoursOfItsOwnThatNobodyHasSetAreTheThemes) {
-    OpenTextField *const pane = Make(TestItem().Integer("UseSavedColors", 1));
-    EXPECT_FALSE(DrawingOf(*pane).empty());
 }
 
 // The engine's place

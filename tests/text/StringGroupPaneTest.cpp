@@ -1,4 +1,6 @@
 #include "text/StringGroupPane.h"
+#include "desktop/layout/LayoutEngine.h"
+#include "desktop/panes/PaneAccess.h"
 #include "host/CompoundPane.h"
 #include "host/NamedColors.h"
 #include "host/TextLayout.h"
@@ -161,5 +163,43 @@ TEST_F(StringGroupTest, InALayoutDrawsEachTextInTheItemOfItsOwn) {
     Rect given = {40, 50, 140, 250};
     pane->SetBox(&given);
     EXPECT_EQ(BoxOf(*pane), given);
-    EXPECT_EQ(Only("DrawStringAtPoint", DrawingOf(*pane)).size(), 2U);
+    std::vector<std::pair<char const *, Point>> places;
+    char const *const texts[] = {"Attack", "Release"};
+    for (std::size_t i = 0; i < 2; ++i) {
+        RCPtr<GlogLayoutRectItem> const part = PaneAccess::Rep(*pane).subItems[i];
+        places.emplace_back(texts[i], StartIn(part->GetBorderRect()));
+    }
+    EXPECT_FALSE(places[0].second == places[1].second);
+    EXPECT_EQ(Only("DrawStringAtPoint", DrawingOf(*pane)), Only("DrawStringAtPoint", DrawnAt(*pane, places)));
+}
+
+TEST_F(StringGroupTest, EachStringIsAPartOfItsOwnUnderThePanesName) {
+    StringGroupPane *const pane = NewPair();
+    ASSERT_EQ(pane->NumLayoutSubItems(), 2);
+    short const ascent = AscentOf(0);
+    struct {
+        Point origin;
+        char const *text;
+    } const strings[] = {{{30, 20}, "Attack"}, {{70, 24}, "Release"}};
+    for (int i = 0; i < 2; ++i) {
+        GlogLayoutRectItem &part = *PaneAccess::Rep(*pane).subItems[static_cast<std::size_t>(i)];
+        EXPECT_EQ(LayoutEngine::Rep(part).index, i);
+        EXPECT_EQ(std::string(part.GetName()), pane->GetLayoutRect()->GetName());
+        short const top = static_cast<short>(strings[i].origin.v - ascent), left = strings[i].origin.h;
+        EXPECT_EQ(part.GetBorderRect(), (Rect{top, left, static_cast<short>(top + kSpacing),
+                                              static_cast<short>(left + WidthOf(strings[i].text))}));
+    }
+}
+
+TEST_F(StringGroupTest, AnEmptyListHasNoParts) { EXPECT_EQ(New()->NumLayoutSubItems(), 0); }
+
+TEST_F(StringGroupTest, ALineSpacingBeyondSixteenBitsEndsThere) {
+    Add({"Attack", true, {30, 20}});
+    for (int const spacing : {2147483647, -2147483647 - 1}) {
+        TestItem odd;
+        odd.Integer("LineSpacing", spacing);
+        odd.Container()->AddItem(Text("TextList"), list);
+        Rect const box = BoxOf(*StringGroupPane::NewStringGroupPane(glog, 5, odd.Sheet()));
+        EXPECT_EQ(box.bottom, spacing > 0 ? 32767 : -10000) << "what uniting begins with";
+    }
 }

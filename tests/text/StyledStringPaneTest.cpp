@@ -259,3 +259,36 @@ TEST_F(StyledStringTest, InALayoutIsAsWideAsItsTextAndAsHighAsTheSheetSays) {
     Show();
     EXPECT_EQ(pane->GetLayoutRect()->GetItemRect(), (Rect{0, 0, 18, static_cast<short>(WidthOf("Level"))}));
 }
+
+TEST_F(StyledStringTest, AnOffsetBeyondSixteenBitsIsTheLargest) {
+    GiveSheet(0, 2147483647);
+    StyledStringPane *const pane = New({10, 20, 40, 200});
+    pane->AdoptStyledStringItem(Part("Level"));
+    EXPECT_EQ(Only("MoveTo", DrawingOf(*pane)), Pen(*pane, 20, 32767));
+}
+
+TEST_F(StyledStringTest, BeginsWithBlackOnWhite) {
+    StyledStringPane *const pane = New({10, 20, 40, 200});
+    pane->SetEraseBackground(true);
+    Lines const drawn = DrawingOf(*pane);
+    ASSERT_GE(drawn.size(), 2U);
+    EXPECT_EQ(Only("ClearColors", drawn).size(), 1U);
+    EXPECT_EQ(Only("ClearColors", {drawn.front()}).size(), 1U) << drawn.front();
+}
+
+TEST_F(StyledStringTest, WithoutALineSpacingIsAsHighAsItsBoxInALayout) {
+    GiveSheet(0, 0);
+    CompoundPane *const column = new CompoundPane;
+    column->CompoundPaneInit(glog, 1);
+    Rect all = {0, 0, 200, 300}, high = {0, 0, 50, 100};
+    column->SetBox(&all);
+    column->SetUseLayout(true);
+    StyledStringPane *const pane = new StyledStringPane(glog, 3, false);
+    pane->SetBox(&high);
+    pane->GetLayoutRect()->SetAttribute(GlogLayoutItem::kHeight, 80, GlogLayoutItem::kPixels, UString());
+    column->Add(pane, -1);
+    pane->AdoptStyledStringItem(Part("Level"));
+    Show();
+    Rect const place = pane->GetLayoutRect()->GetItemRect();
+    EXPECT_EQ(place.bottom - place.top, 50) << "a height of 0 takes the one before away";
+}

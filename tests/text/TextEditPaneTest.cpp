@@ -1,6 +1,7 @@
 #include "text/TextEditPane.h"
 #include "host/PaneWatch.h"
 #include "tests/PaneTest.h"
+#include <limits>
 
 namespace {
 
@@ -58,7 +59,14 @@ TEST_F(TextEditPaneTest, KeysGoToItsEngineWhileItIsEditing) {
 TEST_F(TextEditPaneTest, TellsThatItsTextHasScrolledByItself) {
     pane->BeginEditing();
     desktop.Play("type \"a text that is wider than the pane\"");
-    EXPECT_GT(ear.scrolls, 0);
+    int const scrolls = ear.scrolls;
+    EXPECT_GT(scrolls, 0);
+    desktop.Play("key Left");
+    EXPECT_EQ(ear.scrolls, scrolls) << "nothing had to be scrolled";
+    desktop.Play("key Home");
+    EXPECT_EQ(ear.scrolls, scrolls + 1);
+    desktop.Play("key End");
+    EXPECT_EQ(ear.scrolls, scrolls + 2);
 }
 
 TEST_F(TextEditPaneTest, ItsFractionIsWhatIsLeftOfWholePixels) {
@@ -139,6 +147,73 @@ TEST_F(TextEditPaneTest, AListenerMayDeleteIt) {
     pane->BeginEditing();
     desktop.Play("type \"ab\"");
     EXPECT_FALSE(watch.PaneExists());
+}
+
+TEST_F(TextEditPaneTest, ANegativeHeightLiesAboveAndBothOnTheOtherCorner) {
+    pane->SetFractionalBounds(PlaneRect(10, 20, 8, -2.5));
+    EXPECT_EQ(BoxOf(*pane), (Rect{17, 10, 20, 18}));
+    EXPECT_EQ(pane->GetFractionalOffset().first.y, 3.0);
+    EXPECT_EQ(pane->GetFractionalOffset().second.height, -5.5);
+    EXPECT_TRUE(Same(pane->GetFractionalBounds(), PlaneRect(10, 20, 8, -2.5)));
+    pane->SetFractionalBounds(PlaneRect(10.5, 20.25, -4, -6.5));
+    EXPECT_EQ(BoxOf(*pane), (Rect{13, 6, 21, 11}));
+    EXPECT_TRUE(Same(pane->GetFractionalBounds(), PlaneRect(10.5, 20.25, -4, -6.5)));
+}
+
+TEST_F(TextEditPaneTest, BoundsThatAreNoneAreHarmless) {
+    double const nan = std::numeric_limits<double>::quiet_NaN(),
+                 far = std::numeric_limits<double>::infinity();
+    for (double const odd : {nan, far, -far, 1e300, -1e300}) {
+        pane->SetFractionalBounds(PlaneRect(odd, odd, odd, odd));
+        pane->SetFractionalBounds(PlaneRect(10, 10, odd, 20));
+        pane->SetFractionalBounds(PlaneRect(odd, 10, 20, 20));
+        UpdateGlog(glog);
+    }
+    pane->SetFractionalBounds(PlaneRect(10, 20, 30, 40));
+    EXPECT_EQ(BoxOf(*pane), (Rect{20, 10, 60, 40}));
+    EXPECT_TRUE(Same(pane->GetTextEdit().GetBounds(), PlaneRect(10, 20, 30, 40)));
+}
+
+TEST_F(TextEditPaneTest, AListenerMayDeleteItWhenItHasScrolled) {
+    class Deleting : public TextEditPane_Listener {
+    public:
+        void TextEditPane_Autoscrolled(TextEditPane &pane) override { delete &pane; }
+    };
+    Deleting deleting;
+    deleting.DependUpon(pane);
+    PaneWatch const watch(pane);
+    pane->BeginEditing();
+    desktop.Play("type \"a text that is wider than the pane\"");
+    EXPECT_FALSE(watch.PaneExists());
+}
+
+// What a window tells its panes when it closes.
+class Closing : public DependentCastMessenger<TarnOSWindow::OSWindow_PlatformWindowListener> {
+public:
+    explicit Closing(glogRec &window_)
+        : window(window_) {}
+    void BroadcastChange(TarnOSWindow::OSWindow_PlatformWindowListener *listener) override {
+        listener->PlatformWindow_Closing(window);
+    }
+
+private:
+    glogRec &window;
+};
+
+TEST_F(TextEditPaneTest, LeavesAWindowThatClosesAndComesBackWithTheOneThatOpens) {
+    glogRec *const late = desktop.NewGlog(GlogOptions().Size(200, 100));
+    TextEditPane *const other = new TextEditPane(late, 8, 0);
+    Rect box = {10, 10, 30, 110};
+    other->SetBox(&box);
+    late->BroadcastChange(Closing(*late), nullptr);
+    EXPECT_EQ(other->GetGlog(), nullptr);
+    ShowGlog(late, kShowGlog);
+    EXPECT_EQ(other->GetGlog(), late);
+    UpdateGlog(late);
+    desktop.TakePresented(late);
+    other->GetTextEdit().SetText(Text("a"));
+    UpdateGlog(late);
+    EXPECT_FALSE(desktop.TakePresented(late).empty()) << "its engine has no window";
 }
 
 } // namespace
