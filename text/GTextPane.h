@@ -205,6 +205,7 @@ private:
     void TellActivity();
     void BeginEngine();
     void EndEngine();
+    void DrawEngine();
 
     short itemKind;
     Rect bounds;                  // "BoundsRect"

@@ -78,7 +78,20 @@ void GTextPane::_Draw_(OSRgn *region, char) {
     if (mode == kBlank)
         VelaDrawing::EraseRect(&box);
     else
+        DrawEngine();
+}
+
+// A frame round a field without "BoxIt" lies where its text does, whose ground must not cover it.
+void GTextPane::DrawEngine() {
+    short const kFrame = 1; // pixels
+    if (boxIt || !textWell || drawingHelper) {
         textEdit->Draw(OSPort::Current());
+        return;
+    }
+    Rect within = GetDrawRectangle();
+    VelaDrawing::InsetRect(&within, kFrame, kFrame);
+    WithClipRect const clip(within);
+    textEdit->Draw(OSPort::Current());
 }
 
 void GTextPane::DrawTextWell(Rect &box) {
@@ -99,5 +112,5 @@ void GTextPane::UpdateTextEdit() {
     Prepare();
     Rect const box = TextBox();
     VelaDrawing::ClipRect(&box);
-    textEdit->Draw(OSPort::Current());
+    DrawEngine();
 }

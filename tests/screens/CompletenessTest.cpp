@@ -51,6 +51,16 @@ void CollectTypes(XmlNode const &node, Names &types) {
         CollectTypes(child, types);
 }
 
+// The keys that items of the type have.
+void CollectKeys(XmlNode const &node, std::string const &type, Names &keys) {
+    bool const itself = node.name == "Item" && *node.Attribute("type") == type;
+    for (XmlNode const &child : node.children) {
+        if (itself)
+            keys.insert(child.name);
+        CollectKeys(child, type, keys);
+    }
+}
+
 // Of the class and its bases, as the compiler spells them.
 void CollectClasses(std::type_info const &type, Names &classes) {
     classes.insert(type.name());
@@ -92,6 +102,17 @@ TEST(Completeness, EveryTypeOfItemIsShown) {
     for (std::string const &type : ItemRegistry::Instance().Names())
         if (!shown.count(type))
             missing.insert(type);
+    EXPECT_EQ(missing, Names());
+}
+
+TEST(Completeness, ThePageOfTextFieldsHasEveryKeyOfThem) {
+    Names shown, missing;
+    for (PageFile const &page : GalleryFiles().Pages())
+        if (page.name == "text-fields")
+            CollectKeys(XmlFile::Read(page.path).Root(), "TextField", shown);
+    for (KeySchema const &key : ItemRegistry::Instance().Find("TextField")->keys.Keys())
+        if (!shown.count(key.name))
+            missing.insert(key.name);
     EXPECT_EQ(missing, Names());
 }
 

@@ -132,6 +132,11 @@ Press const kPresses[] = {
     {"text", "insertion-point", "click 200 26\nwait 0.6\n"},
     {"text", "typed", "click 60 88\ntype \"Take 12\"\nwait 0.6\n"},
     {"text", "too-long", "click 60 88\ntype \"A name that is longer than its field\"\nwait 0.6\n"},
+    {"text", "too-long-at-the-right",
+     "click 60 56\nkey a command\ntype \"A name that is longer than its field\"\nkey Home\nwait 0.6\n"},
+    {"text", "too-long-and-left",
+     "click 60 56\nkey a command\ntype \"A name that is longer than its field\"\nclick 60 124\nkey a "
+     "command\ntype \"00:03:27:11.4052 and so on, and on\"\nkey Return\n"},
     {"text", "composed", "click 60 88\ntype \"ab\"\ncompose \"\u00E9\u00E8\u00EA\" 2\nwait 0.6\n"},
     {"text", "large-selected", "doubleclick 170 124\n"},
     {"text", "bare-edited", "doubleclick 30 160\n"},

@@ -1,4 +1,5 @@
 #include "text/GTextPane.h"
+#include "desktop/drawing/Surface.h"
 #include "host/CompoundPane.h"
 #include "host/NamedColors.h"
 #include "host/OSRgn.h"
@@ -703,6 +704,22 @@ TEST_F(GTextPaneTest, TheWellIsFramedByEitherFlagButByBoxItInEditableModeOnly) {
     EXPECT_TRUE(Only("FrameTextWell", DrawingOf(*boxed)).empty());
     boxed->SetBoxAndFrame(true, true);
     EXPECT_EQ(Only("FrameTextWell", DrawingOf(*boxed)).size(), 1u);
+}
+
+TEST_F(GTextPaneTest, AWellWithoutBoxItIsNotCoveredByTheText) {
+    OpenTextField *const pane = Make(TestItem().String("InitTextID", "Bass").Integer("TextWell", 1));
+    Surface const &picture = *desktop.Picture(glog);
+    std::uint32_t const ground = picture.Row(28)[150];
+    auto const edges = [&] {
+        return std::vector<std::uint32_t>{picture.Row(20)[150], picture.Row(35)[150], picture.Row(28)[20],
+                                          picture.Row(28)[199]};
+    };
+    std::vector<std::uint32_t> const framed = edges();
+    for (std::uint32_t const edge : framed)
+        EXPECT_NE(edge, ground);
+    pane->Select(true);
+    UpdateGlog(glog);
+    EXPECT_EQ(edges(), framed);
 }
 
 TEST_F(GTextPaneTest, ABlankFieldErasesWithinItsWell) {
