@@ -1,12 +1,16 @@
 #include "desktop/editing/ShownText.h"
 #include "desktop/editing/ParagraphBreaks.h"
 #include <algorithm>
+#include <unicode/uchar.h>
 #include <unicode/utf16.h>
 #include <unicode/utf8.h>
 
 namespace {
 
 constexpr char32_t kReplacement = 0xFFFD;
+// No script puts as many marks on a letter. Shaping them takes a time that grows with the square of their
+// number.
+constexpr int kMostMarks = 30;
 
 bool IsPlain(char16_t c) { return (c >= 0x20 && c < 0x7F) || c == '\t'; }
 
@@ -16,6 +20,8 @@ char32_t Shown(UChar32 c) {
         return ' ';
     return control || U_IS_SURROGATE(c) ? kReplacement : static_cast<char32_t>(c);
 }
+
+bool IsMark(UChar32 c) { return (U_GET_GC_MASK(c) & U_GC_M_MASK) != 0; }
 
 std::size_t FirstAt(std::vector<std::uint32_t> const &places, std::uint32_t place) {
     return static_cast<std::size_t>(std::lower_bound(places.begin(), places.end(), place) - places.begin());
@@ -32,11 +38,13 @@ ShownText::ShownText(std::u16string_view text)
     }
     bytes.reserve(text.size() + 1);
     characters.reserve(text.size() + 1);
+    int marks = 0; // one behind the other
     for (std::size_t i = 0; i < text.size();) {
         std::size_t const start = i;
         UChar32 c;
         U16_NEXT(text.data(), i, text.size(), c);
-        Add(i - start, Shown(c));
+        marks = IsMark(c) ? marks + 1 : 0;
+        Add(i - start, marks > kMostMarks ? kReplacement : Shown(c));
     }
     Add(1, 0); // the end
     utf8.pop_back();

@@ -6,8 +6,9 @@
 #include <string_view>
 #include <vector>
 
-// UTF-8, and which of its bytes and characters stand for which of the paragraph's units. Lone surrogates and
-// control characters are shown as U+FFFD, line breaks within the paragraph as spaces.
+// UTF-8, and which of its bytes and characters stand for which of the paragraph's units. Lone surrogates,
+// control characters, and more marks on a letter than any script has are shown as U+FFFD, line breaks within
+// the paragraph as spaces.
 class ShownText {
 public:
     explicit ShownText(std::u16string_view);

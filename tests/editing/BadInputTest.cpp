@@ -160,3 +160,13 @@ TEST_F(EditorBadInput, AStyleForWhatIsTypedNextEndsWithAnotherSelectionOfTheSame
     Play("type \"c\"");
     EXPECT_EQ(edit.GetNumberStyleRuns(), 1u);
 }
+
+TEST_F(EditorBadInput, MoreMarksThanALetterHasStandBesideIt) {
+    Open(0, u'a' + std::u16string(40, u'\u0301') + u'b');
+    for (unsigned int place : {31u, 32u, 33u}) {
+        Play("key Right");
+        EXPECT_EQ(Selection(), At(place));
+    }
+    Play("key End\nkey Left\nkey Left\nkey Backspace");
+    EXPECT_TRUE(Text() == u'a' + std::u16string(39, u'\u0301') + u'b');
+}

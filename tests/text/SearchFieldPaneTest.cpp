@@ -385,4 +385,101 @@ TEST_F(SearchFieldPaneTest, AsTheCurrentItemItPassesTheKeyboardOnToItsText) {
     EXPECT_EQ(ear.Take(), (Heard{"Text a", "Text a"}));
 }
 
+// What passes the field by
+
+class TextEar : public TextPaneListener, public AutoSetActivityListener {
+public:
+    explicit TextEar(GTextPane &pane) {
+        TextPaneListener::DependUpon(&pane);
+        AutoSetActivityListener::DependUpon(&pane);
+    }
+    void ResetValue(GTextPane *) override { ++calls; }
+    void ValueChanged(GTextPane *) override { ++calls; }
+    void EndEditing(GTextPane *) override { ++calls; }
+    void ListenToActivity(Provider<AutoSetActivityListener> *) override { ++calls; }
+    int calls = 0;
+};
+
+TEST_F(SearchFieldPaneTest, TheTextSeesNothingOfArrowsAndEscape) {
+    OpenSearchField *const pane = Make();
+    Click(*pane);
+    desktop.Play("type \"ab\"\nkey Left");
+    TextEar ear(TextOf(*pane));
+    desktop.Play("key Up\nkey Down shift\nkey Escape");
+    EXPECT_EQ(ear.calls, 0);
+    EXPECT_TRUE(TextOf(*pane).IsSelected());
+}
+
+TEST_F(SearchFieldPaneTest, EscapeRedrawsTheWholeField) {
+    OpenSearchField *const pane = Make();
+    Click(*pane);
+    desktop.Play("type \"ab\"");
+    Repainted();
+    EventRecordAdapter escape;
+    escape.what = 3;
+    escape.message = 27;
+    TextOf(*pane).Key(&escape);
+    EXPECT_EQ(Repainted(), (std::vector<Rect>{BoxOf(*pane)}));
+}
+
+TEST_F(SearchFieldPaneTest, TheTextIsEmptyAlreadyWhenTheSearchIsSaidToBeCanceled) {
+    class Asking : public SearchFieldPane_Listener {
+    public:
+        explicit Asking(SearchFieldPane &pane_)
+            : pane(pane_) {
+            DependUpon(&pane_);
+        }
+        void SearchIsCanceled() override { text = pane.GetText(); }
+        SearchFieldPane &pane;
+        UString text = U("not told");
+    };
+    OpenSearchField *const pane = Make();
+    TextOf(*pane).SetText(U("ab"));
+    Asking asking(*pane);
+    pane->CancelSearch();
+    EXPECT_EQ(asking.text, UString());
+}
+
+TEST_F(SearchFieldPaneTest, ASpecialKeyIsHandedOnAsItIs) {
+    class Keeping : public SearchFieldPane_Listener {
+    public:
+        void HandleSpecialKey(EventRecordAdapter *given) override { event = given; }
+        EventRecordAdapter *event = nullptr;
+    };
+    OpenSearchField *const pane = Make();
+    Keeping keeping;
+    keeping.DependUpon(pane);
+    EventRecordAdapter event;
+    pane->HandleSpecialKey(&event);
+    EXPECT_EQ(keeping.event, &event);
+}
+
+TEST_F(SearchFieldPaneTest, AClickThatFailsLeavesTheButtonAtRest) {
+    class Failing : public GlogPane {
+        void DrawGuts(OSRgn *) override {}
+        int HandleClick(EventRecordAdapter *) override { throw std::runtime_error("a click"); }
+    };
+    OpenSearchField *const pane = Make();
+    TextOf(*pane).SetText(U("ab"));
+    Failing *const failing = new Failing;
+    failing->GlogPaneInit(glog, 0);
+    pane->Add(failing, -1);
+    Rect all = {0, 0, 20, 200};
+    failing->SetBox(&all);
+    pane->Prepare();
+    EventRecordAdapter event;
+    event.what = 1;
+    event.where = {kTop + 10, kLeft + 60};
+    EXPECT_THROW(pane->HandleClick(&event), std::runtime_error);
+    Lines const idle = Traced(*pane, [] { Draw1Icon(kFamily, 4, kLeft + 180, kTop); });
+    EXPECT_EQ(Traced(*pane, [&] { pane->DrawBackgroundGuts(nullptr); }).back(), idle.front());
+}
+
+TEST_F(SearchFieldPaneTest, AClickIntoTheTextIsAnsweredAsTheTextDoes) {
+    Make();
+    EXPECT_EQ(ResultOfClick("click " + std::to_string(kLeft + 60) + " " + std::to_string(kTop + 10)), -1);
+    EXPECT_EQ(ResultOfClick("click " + std::to_string(kLeft + 4) + " " + std::to_string(kTop + 10)), 0)
+        << "on the mark";
+}
+
 } // namespace
