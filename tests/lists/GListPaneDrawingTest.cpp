@@ -521,6 +521,10 @@ TEST_F(GListPaneDrawingTest, ARowIsInvalidatedFromItsFirstColumnToItsLast) {
     GListPane *const list = Filled(100);
     Show();
     EXPECT_EQ(InvalidatedBy([&] { list->InvalRow(1); }), (std::vector<Rect>{{37, 30, 53, 220}}));
+    boost::shared_ptr<ColumnList> const columns = ThreeColumns();
+    columns->SetBothEdges(0, 10, 60);
+    list->SetColumnList(columns);
+    EXPECT_EQ(InvalidatedBy([&] { list->InvalRow(1); }), (std::vector<Rect>{{37, 40, 53, 220}}));
     list->SetColumnList(boost::make_shared<ColumnList>(static_cast<short>(0)));
     EXPECT_TRUE(InvalidatedBy([&] { list->InvalRow(1); }).empty()) << "no columns";
 }

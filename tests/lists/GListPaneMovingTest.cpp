@@ -59,8 +59,12 @@ TEST_F(GListPaneMovingTest, ARowThatIsMovedUpWithinItsPlaceStays) {
 
 // The row behind is where its lower edge is, and that becomes its own number.
 TEST_F(GListPaneMovingTest, ARowThatIsMovedALittleDownKeepsItsNumber) {
-    Movable(10);
+    GListPane *const list = Movable(10);
     EXPECT_EQ(Dragged(kRow2, kRow2 + 2), 2);
+    Rect const row = {53, 31, 69, 229};
+    Lines const drawn = Only("ScrollRect", desktop.TakeDrawing());
+    EXPECT_EQ(drawn, Traced(*list, [&] { OSPort::Current().ScrollRect(row, OS::Size(0, 16)); }))
+        << "kept: its pixels move by a row all the same";
 }
 
 TEST_F(GListPaneMovingTest, ARowMovesDownToTheNumberThatItHasAfterwards) {

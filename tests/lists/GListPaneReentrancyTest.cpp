@@ -472,6 +472,50 @@ TEST_F(GListPaneReentrancyTest, PagesFarOutOfRangeDoNotHangTheSelection) {
                 }
 }
 
+TEST_F(GListPaneReentrancyTest, ACellOfAListThatGoesWhileTheWindowIsDrawnDoesNotCount) {
+    class Deleting : public GlogPane {
+    public:
+        Deleting(glogRec *owner, GListPane *&list_)
+            : list(list_) {
+            GlogPaneInit(owner, 0);
+            Rect box = {140, 10, 160, 30};
+            SetBox(&box);
+        }
+        bool deletes = false;
+
+    private:
+        void DrawGuts(OSRgn *) override {
+            if (!deletes)
+                return;
+            delete list;
+            list = nullptr;
+        }
+        GListPane *&list;
+    };
+    for (bool atFirst : {true, false}) {
+        Shown(10, kListSelectOne);
+        Deleting deleting(glog, list);
+        UpdateGlog(glog);
+        ListHooks hooks;
+        auto const drawItNow = [&] {
+            deleting.deletes = true;
+            deleting.Inval();
+        };
+        if (!atFirst)
+            hooks.onStep = drawItNow;
+        bool answer = true;
+        listener.onCall = [&](std::string const &) {
+            listener.onCall = nullptr;
+            if (atFirst)
+                drawItNow();
+            answer = list->TrackCol(1, 1);
+        };
+        desktop.Play("wait 1\npress " + At(1, 1) + "\nmove 110 45\nwait 0.5\nrelease");
+        EXPECT_EQ(list, nullptr) << atFirst;
+        EXPECT_FALSE(answer) << atFirst;
+    }
+}
+
 TEST_F(GListPaneReentrancyTest, ACellOfAListThatGoesInTheWaitDoesNotCount) {
     Shown(10, kListSelectOne);
     class Deleting : public CIdleChore {

@@ -132,6 +132,14 @@ TEST_F(GListPaneScrollingTest, GoingToAPageNeitherDrawsNorShowsOnTheBar) {
     EXPECT_FALSE(list->ScrolledToEnd());
 }
 
+TEST_F(GListPaneScrollingTest, APageBehindTheLastRowIsTheEnd) {
+    GListPane *const list = WithBar(14); // seven of them show
+    EXPECT_TRUE(list->ScrollToPage(2));
+    EXPECT_FALSE(list->ScrolledToEnd());
+    EXPECT_FALSE(list->ScrollToPage(3));
+    EXPECT_TRUE(list->ScrolledToEnd());
+}
+
 TEST_F(GListPaneScrollingTest, ItsRatioIsTheRowsThatFitOverAllRows) {
     GListPane *const list = WithBar(100);
     EXPECT_DOUBLE_EQ(list->GetThumbRatio(bar), 0.06);
