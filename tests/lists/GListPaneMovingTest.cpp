@@ -225,6 +225,8 @@ TEST_F(GListPaneMovingTest, ScrollingDrawsTheListAndKeepsThePen) {
     list->Prepare();
     VelaDrawing::MoveTo(77, 88);
     Dragged(kRow2, 130, "wait 0.12\n");
+    EXPECT_EQ(Only("SetPenState", desktop.TakeDrawing()).size(), 3u) << "once for each row";
+    ASSERT_EQ(list->GetScrollPos(), 3);
     list->Prepare();
     Point pen = {0, 0};
     VelaDrawing::GetPen(&pen);
