@@ -27,6 +27,14 @@ void *Allocate(std::size_t size) {
     return memory;
 }
 
+void *AllocateOrNull(std::size_t size) {
+    try {
+        return Allocate(size);
+    } catch (std::bad_alloc const &) {
+        return nullptr;
+    }
+}
+
 } // namespace
 
 Allocations::Counter::Counter()
@@ -48,6 +56,11 @@ bool Allocations::FailAfter::HasFailed() const { return failed; }
 
 void *operator new(std::size_t size) { return Allocate(size); }
 void *operator new[](std::size_t size) { return Allocate(size); }
+// Those without exceptions would come to these by themselves, but not under the address sanitizer.
+void *operator new(std::size_t size, std::nothrow_t const &) noexcept { return AllocateOrNull(size); }
+void *operator new[](std::size_t size, std::nothrow_t const &) noexcept { return AllocateOrNull(size); }
+void operator delete(void *memory, std::nothrow_t const &) noexcept { std::free(memory); }
+void operator delete[](void *memory, std::nothrow_t const &) noexcept { std::free(memory); }
 void operator delete(void *memory) noexcept { std::free(memory); }
 void operator delete[](void *memory) noexcept { std::free(memory); }
 void operator delete(void *memory, std::size_t) noexcept { std::free(memory); }
