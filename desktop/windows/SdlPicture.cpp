@@ -16,6 +16,7 @@
 static unsigned long const kRedMask = 0xFF0000, kGreenMask = 0xFF00, kBlueMask = 0xFF;
 static int const kPixelBits = 32, kPixelBytes = 4;
 static int const kOwnerOnly = 0600;
+static long long const kMostSentPixels = 8192; // 32 KB: a label, a strip that scrolls into view
 
 struct SdlPicture::Shared {
     Display *display = nullptr; // SDL's
@@ -36,7 +37,8 @@ struct SdlPicture::Shared {
     bool MakeImage(int width, int height);
     bool MakeMemory();
     bool Attach();
-    void Put(DeviceRect const &);
+    void Put(DeviceRect const &);  // the server reads our memory when it gets to it
+    void Send(DeviceRect const &); // the pixels go along
 };
 
 SdlPicture::Shared::~Shared() {
@@ -152,6 +154,19 @@ void SdlPicture::Shared::Put(DeviceRect const &rect) {
                  static_cast<unsigned int>(rect.Width()), static_cast<unsigned int>(rect.Height()), False);
 }
 
+void SdlPicture::Shared::Send(DeviceRect const &rect) {
+    XPutImage(display, window, context, image, rect.left, rect.top, rect.left, rect.top,
+              static_cast<unsigned int>(rect.Width()), static_cast<unsigned int>(rect.Height()));
+}
+
+// Whether the pixels had better go with the request: then nobody waits for the server to have read them.
+static bool AreFew(std::vector<DeviceRect> const &rects) {
+    long long pixels = 0;
+    for (DeviceRect const &rect : rects)
+        pixels += 1LL * rect.Width() * rect.Height();
+    return pixels <= kMostSentPixels;
+}
+
 static bool Covers(DeviceRect const *rects, std::size_t count, DeviceRect const &all) {
     return std::any_of(rects, rects + count, [&](DeviceRect const &rect) { return rect.Contains(all); });
 }
@@ -169,6 +184,12 @@ void SdlPicture::Show(Surface const &surface, DeviceRect const *rects, std::size
     if (shared->changed.empty())
         return;
     Display *const display = shared->display;
+    if (AreFew(shared->changed)) {
+        for (DeviceRect const &rect : shared->changed)
+            shared->Send(rect);
+        XFlush(display);
+        return;
+    }
     bool const behind = IsBehind(display, shared->shown);
     for (DeviceRect const &rect : shared->changed)
         shared->Put(rect);

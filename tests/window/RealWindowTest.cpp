@@ -365,6 +365,23 @@ TEST_F(PictureThatMoves, HasToBeWhollyOnTheScreen) {
     EXPECT_FALSE(window->Move(move)) << "larger than the window";
 }
 
+TEST_F(Picture, AFewPixelsComeAfterTheManyBeforeThem) {
+    Window window = Open(At(200, 150, 200, 150));
+    Surface surface(200, 150);
+    DeviceRect all = {0, 0, 200, 150}, few = {20, 10, 30, 20};
+    for (std::uint32_t colour : {0x336699U, 0xC08040U}) {
+        std::fill(surface.Pixels(), surface.Row(150), 0xFF000000U | colour);
+        window->Present(surface, &all, 1);
+        for (int y = few.top; y < few.bottom; ++y)
+            std::fill(surface.Row(y) + few.left, surface.Row(y) + few.right, 0xFFF0E0D0U);
+        window->Present(surface, &few, 1);
+        ExpectPixel(*window, 20, 10, 0xF0E0D0);
+        ExpectPixel(*window, 29, 19, 0xF0E0D0);
+        ExpectPixel(*window, 19, 10, colour);
+        ExpectPixel(*window, 30, 19, colour);
+    }
+}
+
 TEST_F(Picture, MovesOnAScreenOfAllColoursOnly) {
     Window window = Open(At(200, 150, 100, 80));
     Fill(*window, 0x336699);
