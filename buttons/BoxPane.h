@@ -1,4 +1,6 @@
-// A rectangle that draws nothing and takes no clicks: room that is kept for something.
+// A rectangle that draws nothing: room that is kept for something.
+//
+// It takes neither the mouse nor the keyboard.
 #pragma once
 #include "host/GlogPane.h"
 

@@ -29,10 +29,10 @@ public:
     // Changes of value tell both kinds of listeners and invalidate the box; an index that does not exist, and
     // a value that the box has, do nothing.
     void SetOne(short index, bool value);
-    // The box's value; false for an index that does not exist.
-    bool ReadOne(short index) const;
     void ToggleOne(short index);
     void SetAllToSame(bool value);
+    // The box's value; false for an index that does not exist.
+    bool ReadOne(short index) const;
 
 protected:
     CheckBoxPane();

@@ -1,4 +1,6 @@
-// A strip of icons with successive numbers, as an ornament. It takes no clicks.
+// A strip of icons with successive numbers, as an ornament.
+//
+// It takes neither the mouse nor the keyboard.
 #pragma once
 #include "buttons/SuccessiveIconsResRec.h"
 #include "host/GlogPane.h"

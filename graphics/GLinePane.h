@@ -1,4 +1,6 @@
-// A thin line that divides one part of a window from another. It takes no clicks.
+// A thin line that divides one part of a window from another.
+//
+// It takes neither the mouse nor the keyboard.
 #pragma once
 #include "graphics/GLineResRec.h"
 #include "host/GlogPane.h"

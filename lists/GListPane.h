@@ -66,7 +66,7 @@ public:
     // keeps its numbers, which AddItem would not: only a range that ends behind the last row ends there, and
     // one that is this row is no more.
     virtual void DelItem(int at);
-    int GetNumItems() const { return numItems; }
+    int GetNumItems() const { return numItems; } // how many rows there are
     // Whether the row is selected.
     virtual bool CheckSel(int line);
 
@@ -146,7 +146,7 @@ public:
     ScrollBarPane *GetScrollBar() const;
     void SetScrollWithNoBar(bool scrolls) { scrollWithNoBar = scrolls; }   // see SetScrollPosition
     void SetInhibitScrolling(bool inhibit) { inhibitScrolling = inhibit; } // the wheel is left to others
-    bool GetInhibitScrolling() const { return inhibitScrolling; }
+    bool GetInhibitScrolling() const { return inhibitScrolling; }          // as it was set
     // Shares the columns, which must not be null and may be changed further. Invalidates the list when they
     // are others than before in number, edges, alignment or name, and answers whether they are; without
     // columns before, also true. The column mapping starts anew.

@@ -1,7 +1,8 @@
 // A closed pop-up menu that shows its current item.
 //
-// A click opens the menu over the pane; see RunPopupMenu for what mouse and keys do there. A choice gives the
-// number of the item that is current then, anything else -1.
+// A click opens the menu over the pane. There the mouse chooses by one press that is held, or by clicks; the
+// arrow keys move, Return or the space bar choose, Escape dismisses (RunPopupMenu tells it all). A choice
+// gives the number of the item that is current then, anything else -1.
 #pragma once
 #include "frame/AutoSetActivityListener.h"
 #include "host/GlogPane.h"
@@ -63,7 +64,7 @@ public:
     // repaints it. Of the places of the arrow other than 0 it chooses the one for a menu with or without
     // text.
     virtual void ResizeToCurSel();
-    virtual PopupMenuBackColor GetMenuBackgroundColor();
+    virtual PopupMenuBackColor GetMenuBackgroundColor(); // as it was set
 
     // Only store: they show at the next drawing.
     void SetMenuBackgroundColor(PopupMenuBackColor color) { backgroundColor = color; }

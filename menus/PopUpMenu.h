@@ -46,8 +46,9 @@ public:
     // Makes the item current and tells MenuChanged, then repaints; nothing for the current item. A negative
     // number makes none current. Whether the item exists is not looked at.
     virtual void SelectItem(short item);
-    virtual short GetSelectedItem(); // 0 for a menu without items
-    virtual short CountItems() const;
+    virtual short GetSelectedItem();  // 0 for a menu without items
+    virtual short CountItems() const; // separators count too
+    // Change how the item looks, from when the menu next opens.
     virtual void SetItemIcon(short item, short icon);
     virtual void SetItemCheck(short item, bool on);
 

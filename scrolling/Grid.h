@@ -1,6 +1,7 @@
 // Panes one after another, in a column or a row.
 //
-// The grid moves its members so that each begins where the one before ends, and leaves them their sizes.
+// The grid moves its members so that each begins where the one before ends, and leaves them their sizes. It
+// takes no clicks of its own and no keys.
 #pragma once
 #include "host/CompoundPane.h"
 

@@ -1,5 +1,8 @@
 // A scroll bar: two arrows, a trough and a thumb.
 //
+// A press on an arrow scrolls by a unit, one in the trough by a page, toward the mouse, and both go on while
+// they are held; the thumb is dragged, and the wheel scrolls by units. The bar takes no keys.
+//
 // What can be scrolled, how far and in which steps is the client's business. The bar shows the position and
 // range that the client gives it, and reports what the user does. It is live while there is something to
 // scroll and room for it to work; a dead bar shows its trough without a thumb.
@@ -47,9 +50,9 @@ public:
     // it, also when nothing has changed. The position counts from 0 to the range; one beyond it shows the
     // thumb at the end. A range below 1 makes the bar dead.
     void Set(int position, int range);
-    int GetPosition() const { return position; }
-    int GetRange() const { return range; }
-    bool IsHorizontal() const { return orientation == kHorizontal; }
+    int GetPosition() const { return position; }                     // as it was set
+    int GetRange() const { return range; }                           // as it was set
+    bool IsHorizontal() const { return orientation == kHorizontal; } // by the flag
     // Whether the bar is too short to work.
     bool TooSmall();
 

@@ -1,7 +1,8 @@
 // A grid that scrolls along its axis.
 //
-// What has scrolled a little is moved as pixels, and only what comes into view is drawn. A scroll bar, which
-// is not the grid's, may show and move the position.
+// The wheel scrolls, and so does a scroll bar, which is not the grid's and shows the position. The grid takes
+// no clicks of its own and no keys. What has scrolled a little is moved as pixels, and only what comes into
+// view is drawn.
 #pragma once
 #include "host/PanePtr.h"
 #include "scrolling/Grid.h"
@@ -41,8 +42,9 @@ public:
 
     // Whether there is something to scroll to in the direction, by its sign.
     bool CanScroll(int direction);
+    // RevealSubpanes of one member.
     void ScrollTillVisible(GlogPane *);
-    int GetScrollOffset() { return scrollOffset; }
+    int GetScrollOffset() { return scrollOffset; } // the position
     // Stores the position and tells the members that they have moved. Draws and checks nothing, and leaves
     // the bar alone.
     void SetScrollOffset(int);

@@ -16,7 +16,7 @@ public:
     virtual void LateralScroll(int distance);
     // Pixels of a step: 1, or four fifths of the box across the axis.
     virtual int LateralScrollDelta(char byUnit);
-    virtual int GetMaxLateralScroll();
+    virtual int GetMaxLateralScroll(); // the largest position
     // Goes to the nearest position that there is. If that is another one, tells the members that they have
     // moved, moves what is seen and updates the glog at once. Then shows the position on the bar, also when
     // nothing has changed.
@@ -25,7 +25,7 @@ public:
     // Takes a bar as its own across the axis, or null, and leaves the former one without a client. The bar
     // hears of a position at the next change.
     void SetLateralScrollbar(ScrollBarPane *);
-    int GetLateralScrollOffset() { return lateralScrollOffset; }
+    int GetLateralScrollOffset() { return lateralScrollOffset; } // the position
     // Stores the position and tells the members that they have moved. Draws and checks nothing, and leaves
     // the bar alone.
     void SetLateralScrollOffset(int);

@@ -1,7 +1,8 @@
 // A pane with a virtual area that is larger than its box.
 //
 // Its subpanes lie in the coordinates of the virtual area. A horizontal and a vertical scroll bar, which are
-// not the pane's, may show and move the part that is seen.
+// not the pane's, may show and move the part that is seen; with a bar the wheel moves it along that axis too.
+// The pane takes no clicks of its own and no keys.
 #pragma once
 #include "host/CompoundPane.h"
 #include "host/PanePtr.h"

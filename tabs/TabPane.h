@@ -82,7 +82,9 @@ public:
     virtual int GetIcon(Part, int item, bool active);
 
     // Items
-    int CountItems() const { return static_cast<int>(items.size()); }
+
+    int CountItems() const { return static_cast<int>(items.size()); } // how many there are
+    // The item, and what it says.
     Item const &GetItem(int item) const { return items[Index(item)]; }
     Item &GetItem(int item) { return items[Index(item)]; } // changes show after InvalItemRects and Inval
     UString const &GetItemName(int item) const { return GetItem(item).name; }
@@ -99,12 +101,14 @@ public:
     void SetItemShortName(int item, UString const &);
 
     // Selection
+
     int GetSelectedItem() const { return selectedItem; } // -1: none
     // Stores the item, also the one that it is already, tells the listeners, then repaints.
     void SetSelectedItem(int item);
     void SetSelectedItem_NoBroadcast(int item) { selectedItem = item; } // only stores it
 
     // The row
+
     // The tab in the pane's coordinates. All hidden items have the same.
     Rect GetItemBox(int item);
     // Width of the name that is shown, in the font of the last layout or drawing.

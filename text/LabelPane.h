@@ -1,7 +1,8 @@
 // A line of static text at an anchor point.
 //
-// The box follows from the anchor, the alignment and the text. A label in a layout keeps the layout's box and
-// reports its natural size as the width and height attributes of its layout item.
+// It takes neither the mouse nor the keyboard. The box follows from the anchor, the alignment and the text. A
+// label in a layout keeps the layout's box and reports its natural size as the width and height attributes of
+// its layout item.
 #pragma once
 #include "text/LabelPaneImplementation.h"
 #include "text/gStringResRec.h"

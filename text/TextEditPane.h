@@ -1,6 +1,7 @@
 // A bare text engine as a pane, which may lie between whole pixels.
 //
-// It has no frame, no colours and no selection of its own: whoever made it drives the engine.
+// It has no frame, no colours and no selection of its own, and takes neither clicks nor keys by itself:
+// whoever made it drives the engine.
 #pragma once
 #include "frame/TextEditPane_Listener.h"
 #include "host/CompoundPane.h"
