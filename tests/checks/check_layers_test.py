@@ -57,6 +57,14 @@ class TreeIncludes(unittest.TestCase):
         self.assert_refused("desktop/panes/A.cpp", "dialogs/B.h")
         self.assert_refused("desktop/panes/A.cpp", "frame/Message.h")
 
+    def test_examples_see_the_headers_beside_them(self):
+        beside = {"examples/a/A.h": "", "examples/a/A.cpp": '#include "A.h"\n', "tools/a/A.h": ""}
+        self.assertEqual([], violations(beside))
+        self.assertEqual(['tools/a/A.cpp:1: must not include "A.h"'],
+                         violations(dict(beside, **{"tools/a/A.cpp": '#include "A.h"\n'})))
+        self.assertEqual(['examples/b/B.cpp:1: must not include "A.h"'],
+                         violations(dict(beside, **{"examples/b/B.cpp": '#include "A.h"\n'})))
+
     def test_programs_see_the_public_headers_of_the_desktop_only(self):
         self.assert_allowed("tools/gallery/A.cpp", "desktop/Desktop.h")
         self.assert_refused("tools/gallery/A.cpp", "desktop/panes/Glog.h")

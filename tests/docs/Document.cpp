@@ -62,9 +62,9 @@ void Document::ReadRow(std::string const &line) {
 }
 
 void Document::ReadLinks(std::string const &line) {
-    static std::regex const link("\\]\\(([^)#]+)");
+    static std::regex const link("\\]\\(([^)#]+)|src=\"([^\"]+)\"");
     for (std::sregex_iterator i(line.begin(), line.end(), link), end; i != end; ++i) {
-        std::string const target = (*i)[1];
+        std::string const target = (*i)[1].matched ? (*i)[1] : (*i)[2];
         if (target.find("://") == std::string::npos)
             links.push_back(target);
     }

@@ -11,9 +11,9 @@ std::uint32_t const kSame = 0xFF000000;      // black
 std::uint32_t const kDifferent = 0xFFFF00FF; // magenta
 int const kGap = 8;                          // pixels between the three pictures
 
-std::string GoldenPath(std::string const &name) {
-    return std::string(GLOG_TEST_SOURCE_DIR) + "/screens/golden/" + name + ".png";
-}
+std::string const kTop = std::string(GLOG_TEST_SOURCE_DIR) + "/../";
+
+std::string GoldenPath(std::string const &name) { return kTop + "tests/screens/golden/" + name + ".png"; }
 
 std::string OutputPath(std::string const &name) {
     std::string const directory = std::string(GLOG_TEST_OUTPUT_DIR) + "/screens";
@@ -42,18 +42,10 @@ testing::AssertionResult Write(Surface const &picture, std::string const &path, 
     return testing::AssertionFailure() << message;
 }
 
-} // namespace
-
-testing::AssertionResult GoldenPicture::Matches(Surface const &actual, std::string const &name) {
-    if (!IsUpdating())
-        return Compared(actual, name);
-    return Write(actual, GoldenPath(name),
-                 "the golden picture " + name + " was written anew: look at it, then run again");
-}
-
-testing::AssertionResult GoldenPicture::Compared(Surface const &actual, std::string const &name) {
+testing::AssertionResult ComparedWith(Surface const &actual, std::string const &path,
+                                      std::string const &name) {
     std::string error;
-    std::unique_ptr<Surface> const expected = Surface::ReadPng(GoldenPath(name), error);
+    std::unique_ptr<Surface> const expected = Surface::ReadPng(path, error);
     if (!expected)
         return testing::AssertionFailure() << "there is no golden picture " << name << ": " << error;
 
@@ -75,4 +67,26 @@ testing::AssertionResult GoldenPicture::Compared(Surface const &actual, std::str
     return Write(sheet, OutputPath(name),
                  std::to_string(different) + " pixels of " + name +
                      " differ; expected, actual and difference: " + OutputPath(name));
+}
+
+testing::AssertionResult ComparedOrWritten(Surface const &actual, std::string const &path,
+                                           std::string const &name) {
+    if (!IsUpdating())
+        return ComparedWith(actual, path, name);
+    return Write(actual, path,
+                 "the golden picture " + name + " was written anew: look at it, then run again");
+}
+
+} // namespace
+
+testing::AssertionResult GoldenPicture::Matches(Surface const &actual, std::string const &name) {
+    return ComparedOrWritten(actual, GoldenPath(name), name);
+}
+
+testing::AssertionResult GoldenPicture::MatchesFile(Surface const &actual, std::string const &path) {
+    return ComparedOrWritten(actual, kTop + path, std::filesystem::path(path).stem().string());
+}
+
+testing::AssertionResult GoldenPicture::Compared(Surface const &actual, std::string const &name) {
+    return ComparedWith(actual, GoldenPath(name), name);
 }

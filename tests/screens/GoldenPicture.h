@@ -13,5 +13,7 @@ testing::AssertionResult Compared(Surface const &actual, std::string const &name
 // The same; but with GLOG_UPDATE_GOLDEN=1 in the environment the picture is written anew, and that fails as
 // well: a run that makes its own expectations has shown nothing.
 testing::AssertionResult Matches(Surface const &actual, std::string const &name);
+// The same with a picture of any other folder, whose path is from the top of the tree.
+testing::AssertionResult MatchesFile(Surface const &actual, std::string const &path);
 
 } // namespace GoldenPicture
