@@ -15,7 +15,7 @@ readonly patience=20 # seconds
 process=$!
 trap 'kill "$process" 2>/dev/null || true' EXIT
 window=$(timeout "$patience" xdotool search --sync --onlyvisible --name "^$title\$" | tail -n 1)
-xdotool windowfocus --sync "$window" "${@/#%WINDOW/$window}"
+xdotool windowfocus --sync "$window" "${@/#WINDOW/$window}"
 timeout "$patience" tail --pid="$process" -f /dev/null
 wait "$process"
 trap - EXIT
