@@ -22,9 +22,10 @@ public:
 //     click 120 40            doubleclick 120 40     rightclick 120 40
 //     wheel 120 40 0 -1       # horizontal and vertical notches
 //     key Return              key a command     type "héllo"
-//     compose "nih" 2         # what an input method composes, its caret so many characters in; "" gives it
-//     up wait 0.5                resize 640 480    activate off menu 3                  # chooses item 3 of
-//     the open pop-up menu; 0 dismisses it menu 4/2                # item 2 of the submenu that item 4 opens
+//     compose "nih" 2         # what an input method composes, its caret so far in; "" gives it up
+//     wait 0.5                resize 640 480    activate off
+//     menu 3                  # chooses item 3 of the open pop-up menu; 0 dismisses it
+//     menu 4/2                # item 2 of the submenu that item 4 opens
 //     print list.pdf          snapshot a.png    dump a.json
 //
 // Steps are taken when something waits for events, nested loops too; `wait` lets virtual time pass first.

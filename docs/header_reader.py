@@ -111,13 +111,13 @@ class Body:
 
     def keep(self, declaration, trailing):
         above = self.comment if self.fresh or not trailing else ""
-        comment = " ".join(sentence(part) for part in (above, trailing) if part)
+        comment = " ".join(sentence(part) for part in (trailing, above) if part)
         shared = bool(self.comment) and not self.fresh and not trailing
         self.fresh = False
         if self.access != "public" or SKIPPED.match(declaration) or CONSTANT.match(declaration):
             return
         kept = self.owner.operations if "(" in declaration else self.owner.fields
-        if re.match(rf"(explicit )?{re.escape(self.owner.name)}\(\)$|~|virtual ~", declaration):
+        if re.match(rf"~|{re.escape(self.owner.name.split('::')[-1])}\(" + ("" if not comment else r"\)$"), declaration):
             return
         if shared and kept and kept[-1].comment == comment:
             kept[-1].declarations.append(declaration)
@@ -126,8 +126,11 @@ class Body:
 
 
 def sentence(comment):
-    """A comment as a sentence: without what is meant for tools, and with a capital if it begins with a plain word."""
+    """A comment as a sentence: without what is meant for tools, with a full stop, and a capital before a plain word."""
     text = re.sub(r"\s*NOLINT.*", "", comment)
+    if not text:
+        return ""
+    text += "" if text.endswith((".", ":")) else "."
     return text[0].upper() + text[1:] if re.match(r"[a-z]+\b(?![(:_])", text) else text
 
 

@@ -105,16 +105,23 @@ class Reference:
 # Pages
 
 
+def is_pane(name, headers):
+    if name in ("GlogPane", "CompoundPane"):
+        return True
+    return headers.has(name) and any(is_pane(base, headers) for base in headers.find(name).bases)
+
+
 class Page:
     def __init__(self, element, headers, reference):
         self.item = element.get("item")
         self.class_name = element.get("class")
-        self.name = self.item
+        self.name = self.item or self.class_name
         self.record_name = element.get("record")
         self.also = (element.get("also") or "").split()
         self.behaves_as = (element.get("behavesAs") or "").split()
         self.headers, self.reference = headers, reference
-        self.section = reference.section(self.item)
+        self.section = reference.section(self.item) if self.item and reference else None
+        self.golden_width = element.get("width")  # of the part of a golden picture
 
     def classes(self):
         """The class, its bases that are panes of the library, and what else belongs to it."""
@@ -125,19 +132,14 @@ class Page:
             if name in found or not self.headers.has(name):
                 continue
             found.append(name)
-            waiting += [base for base in self.headers.find(name).bases if self.is_pane(base)]
+            waiting += [base for base in self.headers.find(name).bases if is_pane(base, self.headers)]
         return [self.headers.find(name) for name in found]
-
-    def is_pane(self, name):
-        if name in ("GlogPane", "CompoundPane"):
-            return True
-        return self.headers.has(name) and any(self.is_pane(base) for base in self.headers.find(name).bases)
 
     def folder(self):
         return self.headers.find(self.class_name).path.split("/")[0] if self.class_name else "dialogs"
 
     def purpose(self):
-        return self.section.paragraphs[0]
+        return self.section.paragraphs[0] if self.section else escaped(self.headers.find(self.class_name).about[0])
 
     def text(self):
         parts = [f"# {self.name}", self.purpose(), self.pictures(), self.made_by()]
@@ -145,7 +147,7 @@ class Page:
         return "\n\n".join(part for part in parts if part) + "\n"
 
     def pictures(self):
-        width = ElementTree.fromstring(self.example_text()).get("width")
+        width = self.golden_width or ElementTree.fromstring(self.example_text()).get("width")
         images = [f'<img src="images/{self.name}-{theme}.png" width="{width}" alt="{self.name}, {theme}">'
                   for theme in ("light", "dark")]
         return "\n".join(images)
@@ -160,6 +162,9 @@ class Page:
     def made_by(self):
         if not self.class_name:
             return f"In dialogs the item type `{self.item}`; its class is no part of the interface."
+        if not self.item:
+            return f"The class `{self.class_name}`, {link(self.headers.find(self.class_name).path)}. " \
+                   "Dialogs have no type of item for it: a program derives from it or makes it itself."
         return f"In dialogs the item type `{self.item}`; in programs the class `{self.class_name}`, " \
                f"{link(self.headers.find(self.class_name).path)}."
 
@@ -169,9 +174,16 @@ class Page:
         told = [escaped(text) for text in self.headers.find(self.class_name).about[1:]]
         for name in self.behaves_as:
             told += [f"As every `{name}`:"] + [escaped(text) for text in self.headers.find(name).about[1:]]
+        if not self.takes_keys() and not re.search(r"\bkeys\b|keyboard", " ".join(told)):
+            told.append("It takes no keys itself.")
         return ["## Mouse and keyboard"] + told
 
+    def takes_keys(self):
+        return any(re.search(r"\bint Key\(|\bCompoundPane\b", file_text(TREE, one.path)) for one in self.classes())
+
     def dialog(self):
+        if not self.section:
+            return []
         parts = ["## In a dialog"] + self.section.paragraphs[1:]
         if self.section.table:
             parts += ["\n".join(self.section.table)]
@@ -184,13 +196,14 @@ class Page:
         return parts + ([block("script", script)] if script else [])
 
     def record(self):
-        told = self.reference.record(self.item)
+        told = self.reference.record(self.item) if self.item else None
         if not told:
             return []
         parts = ["## In a binary dialog", f"The record begins with {told[0]}, followed by: {told[1]}. See "
                  "[binary dialogs](../dialog-reference.md#binary-dialogs)."]
         if self.record_name:
-            rows = [f"| {code(', '.join(field.declarations))} | {escaped(field.comment)} |"
+            rows = [f"| {code(', '.join(field.declarations))} | "
+                    f"{escaped(re.sub('kKind|kType', told[0], field.comment))} |"
                     for field in self.record_fields(self.record_name)]
             path = self.headers.find(self.record_name).path
             parts += [f"A program hands the values over in a `{self.record_name}` ({link(path)}):",
@@ -207,7 +220,7 @@ class Page:
             names += [match.group(1) for base in one.bases if (match := re.match(r"Provider<(\w+)>", base))]
         listeners = [self.headers.find(name) for name in names]
         if not listeners:
-            return ["## Messages", "None."] if self.class_name else []
+            return ["## Messages", "It has no listener."] if self.class_name else []
         parts = ["## Messages"]
         for listener in listeners:
             parts.append(f"`{listener.name}` ({link(listener.path)}). {escaped(' '.join(listener.about))}")

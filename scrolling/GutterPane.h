@@ -1,4 +1,6 @@
 // A strip along the right or the bottom of its container.
+//
+// It holds what lies there, such as a scroll bar, and takes neither clicks nor keys itself.
 #pragma once
 #include "host/CompoundPane.h"
 
@@ -13,7 +15,7 @@ public:
 
     // Takes the size that the layout of its parts has, and the place that it belongs to.
     void InitializeBounds();
-    GutterType GetGutterType() const { return gutterType; }
+    GutterType GetGutterType() const { return gutterType; } // as it was made
     // The size of the container's box in pixels; 0 without a container.
     int GetContainerHeight();
     int GetContainerWidth();

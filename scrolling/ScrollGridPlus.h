@@ -1,4 +1,6 @@
 // A grid that scrolls along its axis and across it.
+//
+// The wheel scrolls in the direction that it is turned. A second bar may show and move the position across.
 #pragma once
 #include "host/PanePtr.h"
 #include "scrolling/ScrollGrid.h"

@@ -12,6 +12,8 @@ sys.path.insert(0, DOCS)
 import make_pane_pages  # noqa: E402
 from header_reader import read_class  # noqa: E402
 
+# What other panes are made of, and what no program makes.
+PARTS = {"SearchTextPane", "ZoomPopUpControl"}
 SCHEMA = "{http://www.w3.org/2001/XMLSchema}"
 
 
@@ -19,6 +21,19 @@ def item_types():
     root = ElementTree.parse(os.path.join(DOCS, "glog.xsd")).getroot()
     types = root.find(f"{SCHEMA}simpleType[@name='StockItemType']")
     return {value.get("value") for value in types.iter(SCHEMA + "enumeration")}
+
+
+def page_elements():
+    return list(ElementTree.parse(os.path.join(DOCS, "panes", "pages.xml")).getroot())
+
+
+def is_public_pane(name, path, headers):
+    if path.startswith("dialogs/"):
+        return False
+    try:
+        return make_pane_pages.is_pane(name, headers)
+    except ValueError:  # a header without a class of its name
+        return False
 
 
 def read(body, name="Meter", base=""):
@@ -38,16 +53,34 @@ class PagesTest(unittest.TestCase):
                          ["b", "c", "d"])
 
     def test_there_is_a_page_for_each_type_of_item(self):
-        pages = ElementTree.parse(os.path.join(DOCS, "panes", "pages.xml")).getroot()
+        pages = page_elements()
         self.assertGreater(len(item_types()), 40)
         self.assertEqual(item_types() - {page.get("item") for page in pages}, set())
 
-    def test_every_page_has_two_pictures_and_shows_its_item(self):
+    def test_every_page_shows_its_item(self):
         for name in item_types():
-            page = make_pane_pages.kept()[name + ".md"]
-            self.assertIn(f'<Item type="{name}"', page)
-            for theme in ("light", "dark"):
-                self.assertTrue(os.path.exists(os.path.join(DOCS, "panes", "images", f"{name}-{theme}.png")), name)
+            self.assertIn(f'<Item type="{name}"', make_pane_pages.kept()[name + ".md"])
+
+    def test_every_page_says_what_mouse_and_keys_do(self):
+        for name, page in make_pane_pages.kept().items():
+            if name != "README.md":
+                self.assertTrue(re.search(r"\n## Mouse and keyboard\n\n[A-Z]", page), name)
+
+    def test_every_page_has_two_pictures_and_there_are_no_others(self):
+        names = {page.get("item") or page.get("class") for page in page_elements()}
+        self.assertEqual({f"{name}-{theme}.png" for name in names for theme in ("light", "dark")},
+                         set(os.listdir(os.path.join(DOCS, "panes", "images"))))
+
+    def test_there_is_a_page_for_each_class_of_panes_but_for_bases_and_parts(self):
+        headers = make_pane_pages.Headers(make_pane_pages.TREE, [*make_pane_pages.FOLDERS])
+        pages = {page.get("class") for page in page_elements()}
+        told = set()
+        for element in page_elements():
+            if element.get("class"):
+                told |= {one.name for one in make_pane_pages.Page(element, headers, None).classes()}
+        panes = {name for name, path in headers.paths.items() if is_public_pane(name, path, headers)}
+        self.assertEqual(panes - told, PARTS)
+        self.assertGreater(len(pages & panes), 40)
 
     def test_every_example_and_script_belongs_to_a_page(self):
         names = {os.path.splitext(file)[0] for file in os.listdir(os.path.join(DOCS, "panes", "dialogs"))}
