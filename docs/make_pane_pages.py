@@ -203,7 +203,7 @@ class Page:
                  "[binary dialogs](../dialog-reference.md#binary-dialogs)."]
         if self.record_name:
             rows = [f"| {code(', '.join(field.declarations))} | "
-                    f"{escaped(re.sub('kKind|kType', told[0], field.comment))} |"
+                    f"{field_meaning(field.comment, told[0])} |"
                     for field in self.record_fields(self.record_name)]
             path = self.headers.find(self.record_name).path
             parts += [f"A program hands the values over in a `{self.record_name}` ({link(path)}):",
@@ -237,6 +237,12 @@ class Page:
                     parts.append(table(("Operation", "What it does"), told.operations))
         return ["## Operations", "Those that subclasses override are in the headers, and so is what is cut short here."] + \
             parts if parts else []
+
+
+def field_meaning(comment, kind):
+    """What a record's header says of a field, its keys as code."""
+    text = re.sub(r'^("\w+")\.$', r"\1", re.sub("kKind|kType", kind, comment))
+    return re.sub(r'"(\w+)"', r"`\1`", escaped(text))
 
 
 def is_value(told):

@@ -93,6 +93,24 @@ class PagesTest(unittest.TestCase):
             self.assertIn(len(re.findall(r"[.!?](?= [A-Z]|$)", purpose)), (1, 2), f"{name}: {purpose}")
 
 
+class MessagesTest(unittest.TestCase):
+    TOLD = re.compile(r"[Ww]atchers of messages hear(.*?)(?=\.\s|\.$|;)", re.DOTALL)
+
+    def sent(self):
+        names = set()
+        for name in os.listdir(os.path.join(DOCS, "..", "dialogs")):
+            if name.endswith(".cpp"):
+                text = make_pane_pages.file_text(DOCS, "..", "dialogs", name)
+                names |= set(re.findall(r'"message", std::string\("(\w+)"\)', text))
+                names |= set(re.findall(r'\b(?:Report\(\*?pane, |Begin\()"(\w+)"\)', text))
+        return names
+
+    def test_the_reference_tells_of_every_message_that_watchers_hear_and_of_no_other(self):
+        reference = make_pane_pages.file_text(DOCS, "dialog-reference.md")
+        told = {name for text in self.TOLD.findall(reference) for name in re.findall(r"`(\w+)`", text)}
+        self.assertEqual(told - {"PopUpMenu", "Up", "Down"}, self.sent())
+
+
 class HeaderTest(unittest.TestCase):
     def test_a_comment_is_told_with_all_declarations_below_it(self):
         self.assertEqual(told("    // Both.\n    void A();\n    int B() const;\n\n    void C();"),
