@@ -22,6 +22,7 @@
 #include "host/PortSavers.h"
 #include "host/Services.h"
 #include <algorithm>
+#include <deque>
 #include <list>
 
 namespace {
@@ -208,7 +209,8 @@ void Glog::Show() {
     if (!started)
         StartPanes();
     DesktopRep &rep = DesktopRep::Of(desktop);
-    if (!window) {
+    bool const again = window != nullptr;
+    if (!again) {
         WindowSpec spec;
         spec.title = options.title;
         spec.width = width;
@@ -230,6 +232,8 @@ void Glog::Show() {
     if (!options.popup)
         rep.CameToFront(this);
     Update();
+    if (again)
+        PresentAll(); // a window that is hidden loses what it showed
     if (EventLoop *loop = options.popup ? nullptr : EventLoop::Open())
         loop->WindowShown(window.get());
     window->Show();
@@ -566,30 +570,38 @@ std::vector<GlogPane *> Glog::TabOrder(char direction) const {
     return order;
 }
 
-// Every Tab may remove panes, the next one on the list among them, so that the list is made anew after each.
+// Every Tab may remove and hide panes, the next one on the list among them.
 bool Glog::OfferTab(char direction) {
-    std::vector<GlogPane *> order = TabOrder(direction);
+    std::vector<GlogPane *> const order = TabOrder(direction);
+    std::deque<PaneWatch> watches;
+    for (GlogPane *pane : order)
+        watches.emplace_back(pane);
     std::size_t next = 0;
-    auto standAfter = [&](GlogPane *pane) {
-        order = TabOrder(direction);
-        auto const found = std::find(order.begin(), order.end(), pane);
+    if (GlogPane *const from = current) {
+        auto const found = std::find(order.begin(), order.end(), from);
         if (found != order.end())
             next = static_cast<std::size_t>(found - order.begin()) + 1;
-    };
-    if (GlogPane *const from = current) {
-        standAfter(from);
         if (PaneEvents::Tab(*from, direction) != 1)
             return true;
-        standAfter(from);
     }
-    for (std::size_t offers = order.size(); offers > 0 && !order.empty() && !disposed; --offers) {
-        GlogPane *const pane = order[next % order.size()];
-        if (PaneEvents::Tab(*pane, direction) == 0)
+    for (std::size_t offers = order.size(); offers > 0 && !disposed; --offers, ++next) {
+        std::size_t const at = next % order.size();
+        if (watches[at].PaneExists() && IsOfferedTab(*order[at]) &&
+            PaneEvents::Tab(*order[at], direction) == 0)
             return true;
-        next = next % order.size() + 1;
-        standAfter(pane);
     }
     return false;
+}
+
+// It is shown, as far as that is the panes' matter, and in this glog.
+bool Glog::IsOfferedTab(GlogPane &pane) {
+    if (pane.GetGlog() != this)
+        return false;
+    for (GlogPane *at = &pane; at; at = PaneAccess::Container(*at)) {
+        if (!PaneAccess::OwnVisibility(*at))
+            return false;
+    }
+    return true;
 }
 
 void Glog::Wheel(InputEvent const &event) {

@@ -114,6 +114,7 @@ private:
     void GrowByDragging(Point start);
     void GrowTo(int newWidth, int newHeight);
     bool OfferTab(char direction);
+    bool IsOfferedTab(GlogPane &);
     std::vector<GlogPane *> TabOrder(char direction) const;
     void AddToTabOrder(GlogPane &, std::vector<GlogPane *> &) const;
     void Tell(void (TarnOSWindow::OSWindow_PlatformWindowListener::*what)(TarnOSWindow::OSWindow &));

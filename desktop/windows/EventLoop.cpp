@@ -108,8 +108,10 @@ bool EventLoop::Run(double seconds) {
             HostCall const call;
             Handle(event);
         }
-        if (!HostCall::Running())
+        if (!HostCall::Running()) {
             DesktopRep::Of(desktop).DeleteDisposed();
+            LeaveDrag();
+        }
         if (!taken || !DesktopRep::Of(desktop).AnyVisible())
             break;
     }
@@ -239,14 +241,20 @@ void EventLoop::HandlePress(Glog &glog, InputEvent const &event) {
     // What a pane leaves of the drag, the release before all, is the main loop's, even when the pane throws.
     struct Rest {
         ~Rest() {
-            loop.deferred.insert(loop.deferred.begin(), loop.pointer.begin(), loop.pointer.end());
-            loop.pointer.clear();
+            loop.LeaveDrag();
             glog.SetActivatedByMouseDown(false);
         }
         EventLoop &loop;
         Glog &glog;
     } const rest{*this, glog};
     glog.Click(event);
+}
+
+// A loop inside a pane keeps movements and the release for the drag that it takes place in. Where nobody
+// follows the mouse, they are the main loop's.
+void EventLoop::LeaveDrag() {
+    deferred.insert(deferred.begin(), pointer.begin(), pointer.end());
+    pointer.clear();
 }
 
 void EventLoop::ReleasePointer() {
@@ -452,6 +460,7 @@ void EventLoop::RunModal(Condition const &isOver, bool runChores) {
             continue;
         }
         Handle(event);
+        LeaveDrag(); // of a press in here; what was tracked before has ended
     }
 }
 

@@ -104,6 +104,7 @@ private:
     void NoteActivation(InputEvent const &);
     void HandlePress(Glog &, InputEvent const &);
     void TakeDeferredDrag();
+    void LeaveDrag();
     void ReleasePointer();
 
     Desktop &desktop;

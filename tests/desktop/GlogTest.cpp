@@ -4,6 +4,7 @@
 #include "host/UIEvent.h"
 #include "tests/PaneTest.h"
 #include "tests/desktop/ProbePane.h"
+#include <algorithm>
 #include <boost/make_shared.hpp>
 
 namespace {
@@ -75,6 +76,17 @@ TEST_F(GlogTest, AHiddenGlogKeepsItsDamage) {
     EXPECT_TRUE(calls.empty());
     ShowGlog(glog, kShowGlog);
     EXPECT_EQ(calls, (Calls{"pane: draw"}));
+}
+
+TEST_F(GlogTest, AGlogThatWasHiddenShowsAllOfItAgain) {
+    NewPane();
+    Show();
+    ShowGlog(glog, kHideGlog);
+    ShowGlog(glog, kShowGlog);
+    Surface const *const shown = desktop.Picture(glog);
+    ASSERT_NE(shown, nullptr);
+    Surface const &drawn = *Glog::From(glog).Pixels();
+    EXPECT_TRUE(std::equal(drawn.Pixels(), drawn.Pixels() + drawn.Width() * drawn.Height(), shown->Pixels()));
 }
 
 TEST_F(GlogTest, TheUpdateRegionIsGivenInThePanesCoordinates) {

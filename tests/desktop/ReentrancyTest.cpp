@@ -163,6 +163,19 @@ TEST_F(ReentrancyTest, TabMayDeleteTheNextPane) {
     EXPECT_EQ(glog->GetCurItem(), last);
 }
 
+TEST_F(ReentrancyTest, TabIsNotOfferedToAPaneThatItHides) {
+    Acting *acting = new Acting(glog, {0, 0, 5, 5}, calls, "acting");
+    ProbePane *hidden = new ProbePane(glog, {0, 0, 5, 5}, calls, "hidden");
+    ProbePane *last = new ProbePane(glog, {0, 0, 5, 5}, calls, "last");
+    acting->inTab = [&] { hidden->Hide(); };
+    for (ProbePane *each : {static_cast<ProbePane *>(acting), hidden, last})
+        each->takesTab = each->becomesGopher = true;
+    glog->SetCurItem(acting);
+    Show();
+    desktop.Play("key Tab");
+    EXPECT_EQ(glog->GetCurItem(), last);
+}
+
 TEST_F(ReentrancyTest, TabGoesOnFromWhereItWasWhenThePaneGivesUpBeingCurrent) {
     Acting *acting = new Acting(glog, {0, 0, 5, 5}, calls, "acting");
     ProbePane *next = new ProbePane(glog, {0, 0, 5, 5}, calls, "next");

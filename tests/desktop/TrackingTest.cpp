@@ -1,4 +1,5 @@
 #include "desktop/drawing/Surface.h"
+#include "desktop/windows/EventLoop.h"
 #include "host/CIdleChore.h"
 #include "host/MouseTask.h"
 #include "host/PanePtr.h"
@@ -34,6 +35,21 @@ TEST_F(TrackingTest, EachMoveIsToldUntilTheRelease) {
         Log("up");
     });
     EXPECT_EQ(log, (Calls{"31,22", "40,50", "up"}));
+}
+
+TEST_F(TrackingTest, AReleaseThatComesWhileAKeyIsHandledEndsThePress) {
+    class PausingPane : public ProbePane {
+    public:
+        using ProbePane::ProbePane;
+        int Key(EventRecordAdapter *) override {
+            Yield(0.5);
+            return -1;
+        }
+    };
+    glog->SetCurItem(new PausingPane(glog, {0, 0, 5, 5}, calls));
+    Show();
+    desktop.Play("press 30 20\nkey a\nrelease");
+    EXPECT_FALSE(EventLoop::Instance().IsTracking());
 }
 
 TEST_F(TrackingTest, PointsAreLocalToTheCurrentPort) {
