@@ -8,6 +8,7 @@
 #include "graphics/ZoomControlPane.h"
 #include "graphics/ZoomPopUpPane.h"
 #include "host/GlogStyleSheet.h"
+#include "host/PaneWatch.h"
 #include <algorithm>
 #include <memory>
 #include <new>
@@ -102,8 +103,10 @@ public:
     ZoomLevel const &Level() const { return level; }
 
     void Zoom(bool zoomIn, bool) override {
-        level.Set(*this, level.Level() + (zoomIn ? 1 : -1));
-        UpdateControlPane();
+        PaneWatch const self(this);
+        level.Set(*this, level.Level() + (zoomIn ? 1 : -1)); // who watches may delete the pane
+        if (self.PaneExists())
+            UpdateControlPane();
     }
     bool CanZoom(bool zoomIn) override { return zoomIn ? level.Level() < level.Most() : level.Level() > 0; }
 

@@ -207,6 +207,19 @@ TEST_F(GraphicItemsTest, AZoomSliderHasItsLevels) {
     EXPECT_TRUE(Holds(Dump(slider->GetGlog()), "\"level\":2,\"levels\":4")) << "20 pixels to the left";
 }
 
+TEST_F(GraphicItemsTest, ZoomButtonsMayGoWhenTheyTellOfALevel) {
+    ZoomControlPane *const buttons =
+        LoadOne<ZoomControlPane>("ZoomButtons", "<Origin v=\"20\" h=\"30\"/><Levels>4</Levels>");
+    glogRec *const glog = buttons->GetGlog();
+    ShowGlog(glog, kShowGlog);
+    desktop.WatchMessages([glog](std::string const &line) {
+        if (Holds(line, "Zoomed"))
+            delete GetGlogItem(glog, 1);
+    });
+    desktop.Play("click 37 27"); // zooms in
+    EXPECT_EQ(CountGlogItems(glog), 0);
+}
+
 TEST_F(GraphicItemsTest, ZoomButtonsHaveTheirLevels) {
     ZoomControlPane *const buttons = LoadOne<ZoomControlPane>(
         "ZoomButtons", "<Origin v=\"20\" h=\"30\"/><Levels>1</Levels><Direction>horiz</Direction>");
