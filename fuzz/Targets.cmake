@@ -19,3 +19,16 @@ function(glog_fuzz_programs prefix driver)
   endforeach()
   set(glog_fuzz_names ${names} PARENT_SCOPE)
 endfunction()
+
+# glog_storm_program(NAME): the program of random events over the gallery's pages and random dialogs.
+function(glog_storm_program name)
+  set(folder ${CMAKE_SOURCE_DIR}/fuzz/storm)
+  file(GLOB sources CONFIGURE_DEPENDS ${folder}/*.cpp)
+  file(GLOB gallery CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/tools/gallery/*.cpp)
+  list(FILTER gallery EXCLUDE REGEX "/(main|CommandLine)\\.cpp$")
+  glog_program(${name} ${sources} ${gallery} ${CMAKE_SOURCE_DIR}/tools/TextFile.cpp)
+  target_include_directories(${name} PRIVATE ${CMAKE_SOURCE_DIR})
+  target_link_libraries(${name} PRIVATE dialogs)
+  # It finds the pages beside itself, as the gallery does.
+  add_dependencies(${name} gallery_pages artwork)
+endfunction()
