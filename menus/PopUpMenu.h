@@ -48,7 +48,7 @@ public:
     virtual void SelectItem(short item);
     virtual short GetSelectedItem();  // 0 for a menu without items
     virtual short CountItems() const; // separators count too
-    // Change how the item looks, from when the menu next opens.
+    // Change how the item looks when the menu next opens; repaint nothing.
     virtual void SetItemIcon(short item, short icon);
     virtual void SetItemCheck(short item, bool on);
 
