@@ -26,6 +26,7 @@ LISTENERS = "frame"
 UP = "../.."                  # from a page to the top of the tree
 LONGEST_COMMENT = 240         # of an operation, in the table
 LONGEST_HEADING = 40
+SMALL_WIDTH = 160             # of pictures in the index; pixels
 
 
 def file_text(*path):
@@ -148,9 +149,10 @@ class Page:
 
     def pictures(self):
         width = self.golden_width or ElementTree.fromstring(self.example_text()).get("width")
-        images = [f'<img src="images/{self.name}-{theme}.png" width="{width}" alt="{self.name}, {theme}">'
-                  for theme in ("light", "dark")]
-        return "\n".join(images)
+        return "\n".join(self.picture(theme, width) for theme in ("light", "dark"))
+
+    def picture(self, theme, width):
+        return f'<img src="images/{self.name}-{theme}.png" width="{width}" alt="{self.name}, {theme}">'
 
     def example_text(self):
         return file_text(PANES, "dialogs", self.name + ".xml")
@@ -268,9 +270,10 @@ def index(pages):
     parts = ["# Panes", "What there is, with a picture and a page for each. How these pages are made is in "
              "`CONTRIBUTING.md`; change what they are made from, not the pages."]
     for folder, title in FOLDERS.items():
-        rows = [f"| [{page.name}]({page.name}.md) | {page.purpose()} |" for page in pages if page.folder() == folder]
+        rows = [f"| [{page.name}]({page.name}.md) | {page.picture('light', SMALL_WIDTH)} | {page.purpose()} |"
+                for page in pages if page.folder() == folder]
         if rows:
-            parts.append(f"## {title}\n\n| Pane | What it is |\n|---|---|\n" + "\n".join(rows))
+            parts.append(f"## {title}\n\n| Pane | | What it is |\n|---|---|---|\n" + "\n".join(rows))
     return "\n\n".join(parts) + "\n"
 
 
