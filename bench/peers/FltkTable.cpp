@@ -83,9 +83,12 @@ private:
 
     static void Clicked(Fl_Widget *, void *data) {
         FltkTable *const peer = static_cast<FltkTable *>(data);
-        if (Fl::event() != FL_PUSH || peer->table->callback_context() != Fl_Table::CONTEXT_CELL)
+        if (peer->table->callback_context() != Fl_Table::CONTEXT_CELL)
             return;
-        peer->table->Select(peer->table->callback_row());
+        if (Fl::event() == FL_PUSH)
+            peer->table->Select(peer->table->callback_row());
+        if (Fl::event() != FL_RELEASE)
+            return;
         Heard();
         peer->heard = true;
     }

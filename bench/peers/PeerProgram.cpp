@@ -26,6 +26,7 @@
 #include <fstream>
 #include <memory>
 #include <string>
+#include <sys/wait.h>
 #include <unistd.h>
 
 namespace {
@@ -39,6 +40,7 @@ int const kStep = 37;                // from box to box; has no factor in common
 int const kPressH = 6, kPressV = 11; // within a check box: on its mark in each of the toolkits
 int const kPrimaryButton = 1;
 int const kSettlingMicroseconds = 20000;
+int const kHeldMicroseconds = 80000; // as a hand does
 long const kPerSecond = 1000000000;
 
 clockid_t serverClock = CLOCK_PROCESS_CPUTIME_ID;
@@ -75,34 +77,78 @@ template <class Toolkit> void Settle(Toolkit &peer) {
     }
 }
 
-// A pointer for the server to move and to press, on a connection of its own.
+// The server's pointer, which a process of its own moves and presses, as a hand does: the release comes well
+// after the press, when whoever was told of the press has drawn what it does. What this process takes does
+// not count.
 class Pointer {
 public:
-    Pointer()
-        : display(XOpenDisplay(nullptr)) {
-        if (!display)
-            Fail("the X server cannot be reached");
+    Pointer() {
+        int orders[2], answers[2];
+        if (pipe(orders) != 0 || pipe(answers) != 0 || (hand = fork()) < 0)
+            Fail("there is no process for the pointer");
+        if (hand == 0) {
+            close(orders[1]);
+            Obey(orders[0], answers[1]);
+            _exit(EXIT_SUCCESS);
+        }
+        close(orders[0]);
+        close(answers[1]);
+        to = orders[1];
+        from = answers[0];
     }
-    ~Pointer() { XCloseDisplay(display); }
+    ~Pointer() {
+        close(to);
+        close(from);
+        waitpid(hand, nullptr, 0);
+    }
+    Pointer(Pointer const &) = delete;
+    Pointer &operator=(Pointer const &) = delete;
+
     void MoveTo(int h, int v) {
-        XTestFakeMotionEvent(display, -1, h, v, CurrentTime);
-        XSync(display, False);
+        Give({kMove, h, v});
+        char done;
+        if (read(from, &done, 1) != 1)
+            Fail("the pointer cannot be moved");
     }
-    // A server that has slept takes twice as long for its first request.
-    void WakeServer() { XSync(display, False); }
-    void Click() {
-        XTestFakeButtonEvent(display, kPrimaryButton, True, CurrentTime);
-        XTestFakeButtonEvent(display, kPrimaryButton, False, CurrentTime);
+    // Returns at once.
+    void Click() { Give({kClick, 0, 0}); }
+
+private:
+    enum Kind { kMove, kClick };
+    struct Order {
+        Kind kind;
+        int h, v;
+    };
+    void Give(Order const &order) {
+        if (write(to, &order, sizeof order) != sizeof order)
+            Fail("the pointer does not answer");
+    }
+    static void Obey(int orders, int answers) {
+        Display *const display = XOpenDisplay(nullptr);
+        Order order;
+        while (display && read(orders, &order, sizeof order) == sizeof order)
+            if (order.kind == kMove) {
+                XTestFakeMotionEvent(display, -1, order.h, order.v, CurrentTime);
+                XSync(display, False);
+                if (write(answers, "", 1) != 1)
+                    return;
+            } else {
+                Press(display, True);
+                usleep(kHeldMicroseconds);
+                Press(display, False);
+            }
+    }
+    static void Press(Display *display, Bool down) {
+        XTestFakeButtonEvent(display, kPrimaryButton, down, CurrentTime);
         XSync(display, False);
     }
 
-private:
-    Display *display;
+    pid_t hand = 0;
+    int to = -1, from = -1;
 };
 
 template <class Toolkit> void TimeClick(char const *name, Pointer &pointer, Toolkit &peer) {
     heardAt = 0;
-    pointer.WakeServer(); // some toolkits ask it something whenever they are idle, others do not
     long long const start = Now();
     pointer.Click();
     peer.WaitUntilHeard();
@@ -156,10 +202,15 @@ void MeasureOffscreen(Peer &peer) {
     peer.Destroy();
 }
 
-long ResidentPages() {
-    long size = 0, resident = 0;
-    std::ifstream("/proc/self/statm") >> size >> resident;
-    return resident;
+// Without what is mapped from files, of which the system has now more pages in memory and now fewer.
+long long ResidentBytes() {
+    long long const kilobyte = 1024;
+    long long bytes = 0;
+    std::ifstream status("/proc/self/status");
+    for (std::string line; std::getline(status, line);)
+        if (line.rfind("RssAnon:", 0) == 0 || line.rfind("RssShmem:", 0) == 0)
+            bytes += std::atoll(line.c_str() + line.find(':') + 1) * kilobyte;
+    return bytes;
 }
 
 // The window is as large for few check boxes as for many, so that its pixels do not count.
@@ -168,8 +219,7 @@ void MeasureMemory(Peer &peer, int boxes) {
     peer.Show();
     Settle(peer);
     peer.Repaint();
-    Report(("resident-" + std::to_string(boxes)).c_str(),
-           static_cast<long long>(ResidentPages()) * sysconf(_SC_PAGESIZE));
+    Report(("resident-" + std::to_string(boxes)).c_str(), ResidentBytes());
     peer.Destroy();
 }
 

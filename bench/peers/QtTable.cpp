@@ -27,7 +27,7 @@ public:
         view->setModel(&model);
         for (int column = 0; column < kColumns; ++column)
             view->setColumnWidth(column, kColumnWidth);
-        QObject::connect(view->selectionModel(), &QItemSelectionModel::selectionChanged, view.get(), [this] {
+        QObject::connect(view.get(), &QTreeView::clicked, view.get(), [this] {
             Heard();
             heard = true;
         });
