@@ -79,8 +79,17 @@ void SdlPointer::Move(InputEvent event, SdlWindow *window, SDL_MouseMotionEvent 
     SetScreenPlace(window, motion.x, motion.y);
     if (held == 0 && capture == nullptr && !IsOver(*target))
         return;
+    CaptureDrag();
     Enter(event, target);
     Send(event, InputEvent::kMouseMove, target);
+}
+
+// The server gives a window all of a drag that begins in it. It is SDL that does not report it outside,
+// without a capture. That costs the server half a dozen questions, which a click without movement is spared.
+// Of a quick drag SDL has taken the release already: nothing is left to be captured.
+void SdlPointer::CaptureDrag() {
+    if (held != 0 && !sdlCapture.Holds() && !HasBeenReleased())
+        sdlCapture.Hold();
 }
 
 void SdlPointer::Press(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent const &press) {
@@ -91,11 +100,7 @@ void SdlPointer::Press(InputEvent event, SdlWindow *window, SDL_MouseButtonEvent
     SetScreenPlace(window, press.x, press.y);
     Enter(event, target);
     pressWindow = target;
-    bool first = held == 0;
     held |= Bit(button);
-    // Of a quick click SDL has taken the release together with the press: nothing is left to be captured.
-    if (first && !HasBeenReleased())
-        sdlCapture.Hold();
     event.button = button;
     Place(event, target);
     event.clicks = clicks = clickCounter.Count(event);
@@ -154,7 +159,7 @@ void SdlPointer::Leave(InputEvent event, SdlWindow *window) {
 }
 
 void SdlPointer::Recapture() {
-    if (held != 0 || capture != nullptr)
+    if (sdlCapture.Holds())
         sdlCapture.Hold();
 }
 
@@ -172,12 +177,11 @@ void SdlPointer::Capture(InputEvent event, SdlWindow *window) {
     LeaveIfOutside(event);
 }
 
-// Taking the capture costs the server half a dozen questions. The press of a quick click wants it only until
-// the release, which has come already.
+// The press that is still held has the mouse from its first movement on. That of a quick click wants it only
+// until the release, which has come already.
 void SdlPointer::CaptureFor(SdlWindow *window) {
-    bool const isQuickClick =
-        held == 0 ? queue.HasRelease(window) : window == pressWindow && HasBeenReleased();
-    if (!isQuickClick && !sdlCapture.Holds())
+    bool const isPress = held != 0 ? window == pressWindow : queue.HasRelease(window);
+    if (!isPress && !sdlCapture.Holds())
         sdlCapture.Hold();
 }
 

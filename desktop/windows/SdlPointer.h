@@ -46,6 +46,7 @@ private:
     bool IsOver(SdlWindow const &) const;
     void LeaveIfOutside(InputEvent);
     void ReleaseButton(InputEvent, int button);
+    void CaptureDrag();
     void CaptureFor(SdlWindow *);
     static bool HasBeenReleased();
     void EndCapture();

@@ -8,9 +8,11 @@
 #include <cstring>
 
 static double const kMillisecondsPerSecond = 1000.0;
-static double const kLongestBlock = 3600.0;     // seconds; SDL counts milliseconds in 32 bits
-static double const kShortestBlock = 0.001;     // seconds
-static double const kLongestPause = 0.2;        // seconds
+static double const kLongestBlock = 3600.0; // seconds; SDL counts milliseconds in 32 bits
+static double const kShortestBlock = 0.001; // seconds
+static double const kLongestPause = 0.2;    // seconds
+// In seconds. A signal between two pauses, which does not end either, is seen after so long at the latest.
+static double const kLongestUnseen = 0.5;
 static double const kInputMethodInterval = 0.1; // seconds
 
 SdlWindowSystem::SdlWindowSystem(double forcedScale_)
@@ -113,7 +115,7 @@ bool SdlWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter, char 
         return true;
     double const end = Now() + timeout;
     bool const blocks = timeout < 0 || timeout > kShortestBlock;
-    bool mayHaveCome = !blocks || !queue.Empty() || hasPaused;
+    bool mayHaveCome = !blocks || !queue.Empty() || hasPaused || Now() > lookedAt + kLongestUnseen;
     for (;;) {
         if (mayHaveCome)
             Pump();
@@ -147,8 +149,9 @@ bool SdlWindowSystem::Block(double seconds) {
     int milliseconds = static_cast<int>(std::ceil(std::min(seconds, longest) * kMillisecondsPerSecond));
     bool const brief = seconds < kLongestPause && !keyboard.MustAskInputMethod() && SdlScreen::CanWait();
     if (brief && !SDL_HasEvents(SDL_FIRSTEVENT, SDL_LASTEVENT)) {
-        hasPaused = true;
-        return SdlScreen::Wait(milliseconds);
+        bool const came = SdlScreen::Wait(milliseconds);
+        hasPaused = hasPaused || came;
+        return came;
     }
     return SDL_WaitEventTimeout(nullptr, milliseconds) != 0;
 }
@@ -162,6 +165,7 @@ void SdlWindowSystem::OpenWaker() {
 // Takes over everything that SDL knows, so that moves of the mouse can take each other's place.
 void SdlWindowSystem::Pump() {
     hasPaused = false;
+    lookedAt = Now();
     SDL_PumpEvents();
     SDL_Event event;
     while (SDL_PeepEvents(&event, 1, SDL_GETEVENT, SDL_FIRSTEVENT, SDL_LASTEVENT) > 0)

@@ -83,5 +83,6 @@ private:
     SdlCursors cursors;
     SDL_Window *waker = nullptr; // see OpenWaker
     bool activationLost = false; // since the last Pump
-    bool hasPaused = false;      // since then; signals and input methods may have been missed
+    bool hasPaused = false;      // since then, and something has come
+    double lookedAt = 0;         // time of the last Pump
 };

@@ -98,6 +98,23 @@ TEST_F(Mouse, ADragGoesOnOutsideTheWindow) {
     EXPECT_FALSE(System().IsMouseDown());
 }
 
+TEST_F(Mouse, ADragThatLeapsOutAfterARestIsFollowed) {
+    Window window = Open(At(300, 250, 200, 100));
+    PointAt(*window, 20, 20);
+    Do("mousedown 1");
+    Drain();
+    Do("mousemove 600 500");
+    EXPECT_EQ(Await(InputEvent::kMouseMove).h, 300);
+    Drain();
+    Do("mousemove 620 510");
+    InputEvent outside = Await(InputEvent::kMouseMove);
+    EXPECT_EQ(outside.h, 320);
+    EXPECT_EQ(outside.v, 260);
+    Do("mouseup 1");
+    EXPECT_EQ(Await(InputEvent::kMouseUp).h, 320);
+    EXPECT_FALSE(System().IsMouseDown());
+}
+
 TEST_F(Mouse, ADragMayComeBackAndGoOutAgain) {
     Window window = Open(At(300, 250, 200, 100));
     PointAt(*window, 20, 20);

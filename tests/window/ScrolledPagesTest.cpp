@@ -162,8 +162,11 @@ TEST_P(ScrolledPage, ShowsWhatAFreshOneShowsAfterAStorm) {
     for (int round = 0; round < kRounds; ++round) {
         std::string const storm = Storm();
         Beside([&] { Do(storm); });
-        WaitFor([this] { return TheGlog().Width() == width && TheGlog().Height() == height; });
-        ASSERT_FALSE(EventLoop::Instance().IsTracking());
+        WaitFor([this] {
+            return TheGlog().Width() == width && TheGlog().Height() == height &&
+                   !EventLoop::Instance().IsTracking();
+        });
+        desktop.ProcessEvents(0.1); // what lies behind the last release
         Pixels const shown = Shown(), drawn = Drawn(), fresh = DrawnAfresh();
         ASSERT_EQ(DifferenceOf(drawn, fresh), "") << "what is drawn, round " << round;
         ASSERT_EQ(DifferenceOf(shown, fresh), "") << "what the screen shows, round " << round;

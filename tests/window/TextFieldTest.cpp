@@ -3,6 +3,7 @@
 #include "desktop/panes/Glog.h"
 #include "desktop/resources/Utf.h"
 #include "host/glogRec.h"
+#include "tests/window/XScreen.h"
 #include "text/GTextPane.h"
 #include <cstdio>
 #include <cstdlib>
@@ -52,6 +53,13 @@ protected:
             desktop.ProcessEvents(kStep);
         return output.get();
     }
+    // Lets another program have the clipboard, with what the command of the shell prints. It takes it in a
+    // process of its own, maybe after its command is over.
+    void GiveClipboard(std::string const &command) {
+        unsigned long const before = screen.ClipboardOwner();
+        RunBeside(command + " | xclip -i -selection clipboard >/dev/null 2>&1");
+        WaitFor([&] { return screen.ClipboardOwner() != before; });
+    }
     std::string Text() const { return Utf::ToUtf8(field->GetText()); }
     void ExpectText(std::string const &text) {
         WaitFor([&] { return Text() == text; });
@@ -61,6 +69,7 @@ protected:
     Desktop desktop;
     glogRec *glog;
     GTextPane *field;
+    XScreen screen;
 };
 
 } // namespace
@@ -77,7 +86,7 @@ TEST_F(RealTextField, WhatIsCopiedReachesOtherPrograms) {
 }
 
 TEST_F(RealTextField, WhatOtherProgramsCopyIsPasted) {
-    RunBeside("printf 'na\xC3\xAFve \xF0\x9F\x98\x80' | xclip -i -selection clipboard >/dev/null 2>&1");
+    GiveClipboard("printf 'na\xC3\xAFve \xF0\x9F\x98\x80'");
     RunBeside("xdotool key ctrl+v");
     ExpectText("na\xC3\xAFve \xF0\x9F\x98\x80");
 }
@@ -87,7 +96,7 @@ TEST_F(RealTextField, WhatIsCutComesBackByWayOfAnotherProgram) {
     RunBeside("xdotool key ctrl+a key ctrl+x");
     ExpectText("");
     // The other one owns the clipboard now, with the text that it was given.
-    RunBeside("xclip -o -selection clipboard | xclip -i -selection clipboard >/dev/null 2>&1");
+    GiveClipboard("xclip -o -selection clipboard");
     RunBeside("xdotool key ctrl+v key ctrl+v");
     ExpectText("\xD7\xA9\xD7\x9C\xD7\x95\xD7\x9D 1\xD7\xA9\xD7\x9C\xD7\x95\xD7\x9D 1");
 }

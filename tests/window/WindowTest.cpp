@@ -97,6 +97,14 @@ std::string WindowTest::RunBeside(std::string const &command) {
     return output.get();
 }
 
+void WindowTest::AwaitClipboard(std::string const &utf8) {
+    double const end = System().Now() + kPatience;
+    InputEvent event;
+    while (System().GetClipboardText() != utf8 && System().Now() < end)
+        System().WaitEvent(event, kStep, WindowSystem::Waiter::kPause, "a test");
+    EXPECT_EQ(System().GetClipboardText(), utf8);
+}
+
 void WindowTest::Fill(PlatformWindow &window, std::uint32_t colour) {
     DeviceScale scale(window.Scale());
     Surface surface(scale.Edge(window.Width()), scale.Edge(window.Height()));

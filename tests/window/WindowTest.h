@@ -37,6 +37,8 @@ protected:
     void PointAt(PlatformWindow const &, int h, int v);
     // Runs a command of the shell to its end while events are handled, and returns what it prints.
     std::string RunBeside(std::string const &command);
+    // Expects the clipboard to come to hold the text: another program may take it after its command is over.
+    void AwaitClipboard(std::string const &utf8);
 
     // Fills the window with a surface of one colour (0xRRGGBB).
     void Fill(PlatformWindow &, std::uint32_t colour);

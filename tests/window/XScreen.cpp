@@ -105,6 +105,10 @@ void XScreen::SendToAWindowThatIsGone() const {
     XSync(display, False);
 }
 
+unsigned long XScreen::ClipboardOwner() const {
+    return XGetSelectionOwner(connection->display, XInternAtom(connection->display, "CLIPBOARD", False));
+}
+
 int XScreen::ColourBits() const {
     Display *display = connection->display;
     return DefaultDepth(display, DefaultScreen(display)) >= kDeepColourDepth ? kFullBits : kReducedBits;

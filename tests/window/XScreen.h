@@ -21,6 +21,8 @@ public:
     // that moment; return when the server has refused it.
     void SendToAWindowThatIsGone() const;
     void LookForAWindowThatIsGone() const;
+    // The window that has the clipboard, 0 for none.
+    unsigned long ClipboardOwner() const;
     // Bits of each of the colours red, green and blue that the screen can show.
     int ColourBits() const;
 

@@ -75,7 +75,8 @@ export DISPLAY=:$number
 setpriv --pdeathsig TERM openbox --sm-disable --config-file "$scratch/openbox.xml" >"$scratch/manager.log" 2>&1 &
 processes+=($!)
 deadline=$((SECONDS + start_seconds))
-until xprop -root _NET_SUPPORTING_WM_CHECK 2>/dev/null | grep -q 'window id'; do
+# The list of windows comes last; a window that is shown before may never be managed.
+until xprop -root _NET_CLIENT_LIST 2>/dev/null | grep -q 'window id'; do
     [ $SECONDS -lt $deadline ] || fail "the window manager did not start: $(cat "$scratch/manager.log")"
     sleep 0.05
 done
