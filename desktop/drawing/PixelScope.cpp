@@ -29,11 +29,24 @@ pixman_color_t PremultipliedColor(OS::RGBAColor const &color) {
             Component16(Unit(color.b) * alpha), Component16(alpha)};
 }
 
+// Of so few pixels a row is done before a function of the C library has begun: frames, scroll bars, carets.
+constexpr int kNarrow = 16;
+
 // The C library fills wide characters as fast as the machine can, and a pixel is as large as one.
 static_assert(sizeof(wchar_t) == sizeof(std::uint32_t), "a pixel and a wide character have the same size");
 void FillRow(std::uint32_t *row, int width, std::uint32_t pixel) {
     std::wmemset(reinterpret_cast<wchar_t *>(row), static_cast<wchar_t>(pixel),
                  static_cast<std::size_t>(width));
+}
+
+void FillNarrowRow(std::uint32_t *row, int width, std::uint32_t pixel) {
+    for (int i = 0; i < width; ++i)
+        row[i] = pixel;
+}
+
+void CopyNarrowRow(std::uint32_t const *from, int width, std::uint32_t *to) {
+    for (int i = 0; i < width; ++i)
+        to[i] = from[i];
 }
 
 // One colour everywhere.
@@ -81,9 +94,14 @@ private:
 void CopyRows(pixman_image_t *from, int fromH, int fromV, Surface &to, DeviceRect const &part) {
     std::uint32_t const *const pixels = pixman_image_get_data(from);
     int const stride = pixman_image_get_stride(from) / static_cast<int>(sizeof(std::uint32_t));
-    for (int y = part.top; y < part.bottom; ++y)
-        std::copy_n(pixels + static_cast<std::ptrdiff_t>(fromV + y - part.top) * stride + fromH, part.Width(),
-                    to.Row(y) + part.left);
+    int const width = part.Width();
+    std::uint32_t const *source = pixels + static_cast<std::ptrdiff_t>(fromV) * stride + fromH;
+    std::uint32_t *target = to.Row(part.top) + part.left;
+    for (int y = part.top; y < part.bottom; ++y, source += stride, target += to.Width())
+        if (width <= kNarrow)
+            CopyNarrowRow(source, width, target);
+        else
+            std::copy_n(source, width, target);
 }
 
 // Drawing a tile at a time is faster than having pixman repeat an image row by row, but for the smallest.
@@ -136,7 +154,10 @@ void PixelScope::FillPixels(DeviceRect const &r, std::uint32_t pixel) {
     int const width = r.Width();
     std::uint32_t *row = surface.Row(r.top) + r.left;
     for (int y = r.top; y < r.bottom; ++y, row += surface.Width())
-        FillRow(row, width, pixel);
+        if (width <= kNarrow)
+            FillNarrowRow(row, width, pixel);
+        else
+            FillRow(row, width, pixel);
 }
 
 void PixelScope::FillBox(DeviceRect const &r, OS::RGBAColor const &color) {
