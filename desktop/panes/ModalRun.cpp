@@ -100,12 +100,17 @@ bool ModalRun::Filters(InputEvent const &event) {
     return true;
 }
 
+// A text field remains the current item when its editing has ended, and takes both keys without an effect.
+static bool HasBeenLeft(GlogPane *pane) { return pane && pane->Selectable() && !pane->IsSelected(); }
+
 bool ModalRun::TakesKey(InputEvent const &event) {
     bool const confirms = event.key == KeyCodes::kReturn || event.key == KeyCodes::kEnter;
     bool const cancels = event.key == KeyCodes::kEscape;
     if (!confirms && !cancels)
         return false;
-    if (glog.KeyDown(event) || IsOver())
+    if (!HasBeenLeft(glog.GetCurItem()) && glog.KeyDown(event))
+        return true;
+    if (IsOver())
         return true;
     if (cancels)
         Cancel(event);

@@ -7,6 +7,7 @@
 #include "tests/VirtualPlace.h"
 #include "tests/dialogs/DialogTest.h"
 #include "tests/resources/TemporaryDirectory.h"
+#include "text/GTextPane.h"
 #include <functional>
 
 namespace {
@@ -243,6 +244,18 @@ TEST_F(ModalGlogClassTest, ReturnConfirmsAndEscapeCancels) {
     dialog.ModalGlogInit(700);
     EXPECT_EQ(Loop(dialog, "key Return"), 1);
     EXPECT_EQ(Loop(dialog, "key Escape"), 2);
+}
+
+TEST_F(ModalGlogClassTest, InATextFieldReturnEndsTheEditingFirst) {
+    TestDialog dialog;
+    dialog.ModalGlogInit(700);
+    Rect box = {20, 80, 40, 190};
+    GTextPane *const field = GTextPane::NewGTextPane(dialog.GlogP(), 40, &box, UString(), nullptr);
+    EXPECT_EQ(Loop(dialog, "click 130 30\nkey a\nkey Return\n" + kCancel), 2);
+    EXPECT_EQ(field->GetText().length(), 1u) << "the first return is the field's";
+    EXPECT_FALSE(field->IsSelected());
+    EXPECT_EQ(Loop(dialog, "click 130 30\nkey Return\nkey Return"), 1);
+    EXPECT_EQ(Loop(dialog, "click 130 30\nkey Escape\nkey Escape"), 2);
 }
 
 TEST_F(ModalGlogClassTest, TheFilterEndsEvents) {
