@@ -41,6 +41,7 @@ struct IconSet::Layer {
 struct IconSet::Scaled {
     std::unique_ptr<Surface> surface;
     bool opaque;
+    DeviceRect solid; // of tiles only
 };
 
 IconSet::IconSet(std::vector<std::string> const &atlases) {
@@ -87,8 +88,12 @@ PixelImage IconSet::Stored(Layer &layer, IconRecord const &icon, int choice) {
                      static_cast<std::size_t>(choice)];
     if (!image)
         image = ViewOf(layer.atlas.Pixels(record), record.width, record.height);
-    return {image, record.width, record.height, (record.flags & kImageOpaque) != 0,
-            (record.flags & kImageEmpty) != 0 || !image};
+    return {image,
+            record.width,
+            record.height,
+            (record.flags & kImageOpaque) != 0,
+            (record.flags & kImageEmpty) != 0 || !image,
+            {0, 0, 0, 0}};
 }
 
 PixelImage IconSet::Image(Icon const &icon, int deviceWidth, int deviceHeight) {
@@ -122,9 +127,9 @@ PixelImage IconSet::ScaledImage(Icon const &icon, int deviceWidth, int deviceHei
         std::unique_ptr<Surface> surface(new Surface(width, height));
         ScalePixels(layer.atlas.Pixels(best), best.width, best.height, surface->Pixels(), width, height);
         bool const opaque = surface->IsOpaque();
-        kept = scaled.emplace(key, Scaled{std::move(surface), opaque}).first;
+        kept = scaled.emplace(key, Scaled{std::move(surface), opaque, {0, 0, 0, 0}}).first;
     }
-    return {kept->second.surface->PixmanImage(), width, height, kept->second.opaque, false};
+    return {kept->second.surface->PixmanImage(), width, height, kept->second.opaque, false, {0, 0, 0, 0}};
 }
 
 // How many tiles make one along a side of the area; always as many or one, so that few images are kept.
@@ -146,9 +151,10 @@ PixelImage IconSet::Tiles(Icon const &icon, int deviceWidth, int deviceHeight, D
             for (int left = 0; left < width; left += tile.width)
                 pixman_image_composite32(PIXMAN_OP_SRC, tile.pixels, nullptr, surface->PixmanImage(), 0, 0, 0,
                                          0, left, top, tile.width, tile.height);
-        kept = tiled.emplace(key, Scaled{std::move(surface), tile.opaque}).first;
+        DeviceRect const solid = surface->OpaquePart();
+        kept = tiled.emplace(key, Scaled{std::move(surface), tile.opaque, solid}).first;
     }
-    return {kept->second.surface->PixmanImage(), width, height, tile.opaque, false};
+    return {kept->second.surface->PixmanImage(), width, height, tile.opaque, false, kept->second.solid};
 }
 
 void DrawMissingIcon(PixelScope &pixels, DeviceRect const &r) {

@@ -104,6 +104,16 @@ void CopyRows(pixman_image_t *from, int fromH, int fromV, Surface &to, DeviceRec
             std::copy_n(source, width, target);
 }
 
+// Of the part, whose top left corner lies at that place of the tile, what the tile has pixels for.
+void CopyTile(pixman_image_t *tile, int fromH, int fromV, DeviceRect const &solid, Surface &to,
+              DeviceRect const &part) {
+    int const h = part.left - fromH, v = part.top - fromV;
+    DeviceRect const covered =
+        part.Intersected({solid.left + h, solid.top + v, solid.right + h, solid.bottom + v});
+    if (!covered.Empty())
+        CopyRows(tile, covered.left - h, covered.top - v, to, covered);
+}
+
 // Drawing a tile at a time is faster than having pixman repeat an image row by row, but for the smallest.
 constexpr int kSmallestTile = 64; // device pixels
 
@@ -212,11 +222,12 @@ void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRec
     bool const repeats =
         left > box.left || top > box.top || left + image.width < box.right || top + image.height < box.bottom;
     bool const inTiles = repeats && image.width * image.height >= kSmallestTile;
-    if (inTiles && image.opaque && !faded && port.state.darken == 0) {
+    DeviceRect const solid = image.opaque ? DeviceRect{0, 0, image.width, image.height} : image.solid;
+    if (inTiles && !solid.Empty() && !faded && port.state.darken == 0) {
         ForEachVisible(box, [&](DeviceRect const &visible) {
             ForEachTile(visible, left, top, image.width, image.height,
                         [&](DeviceRect const &part, int fromH, int fromV) {
-                            CopyRows(image.pixels, fromH, fromV, *port.surface, part);
+                            CopyTile(image.pixels, fromH, fromV, solid, *port.surface, part);
                         });
         });
         return;

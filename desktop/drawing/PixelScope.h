@@ -11,6 +11,8 @@ struct PixelImage {
     int width = 0, height = 0;        // device pixels
     bool opaque = false;              // every pixel has full alpha
     bool empty = true;                // no pixel has any: there is nothing to draw
+    // What has full alpha, where all else has none and that is known; empty otherwise.
+    DeviceRect solid = {0, 0, 0, 0};
 };
 
 // The way from local coordinates onto a port's surface, for the duration of one drawing call. Cuts to the

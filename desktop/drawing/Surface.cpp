@@ -102,6 +102,23 @@ bool Surface::IsOpaque() const {
                        [](std::uint32_t pixel) { return (pixel & kAlphaMask) == kAlphaMask; });
 }
 
+DeviceRect Surface::OpaquePart() const {
+    auto const isOpaque = [this](int x, int y) { return (Row(y)[x] & kAlphaMask) == kAlphaMask; };
+    DeviceRect part = {width, height, 0, 0};
+    for (int y = 0; y < height; ++y)
+        for (int x = 0; x < width; ++x)
+            if (isOpaque(x, y))
+                part = {std::min(part.left, x), std::min(part.top, y), std::max(part.right, x + 1),
+                        std::max(part.bottom, y + 1)};
+    for (int y = 0; y < height; ++y)
+        for (int x = 0; x < width; ++x) {
+            bool const inside = x >= part.left && x < part.right && y >= part.top && y < part.bottom;
+            if (inside ? !isOpaque(x, y) : Row(y)[x] != 0)
+                return {0, 0, 0, 0};
+        }
+    return part;
+}
+
 bool Surface::WritePng(std::string const &path, std::string &error) const {
     // Cairo only reads from the surface while it writes the file.
     unsigned char *data = reinterpret_cast<unsigned char *>(const_cast<std::uint32_t *>(Pixels()));

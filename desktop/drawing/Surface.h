@@ -37,6 +37,9 @@ public:
 
     // Whether every pixel has full alpha; looks at all of them.
     bool IsOpaque() const;
+    // The rectangle of opaque pixels that has nothing but clear ones round it; empty when the pixels are
+    // otherwise.
+    DeviceRect OpaquePart() const;
 
     // Writes a PNG file; false, with the reason in `error`, when it cannot be written.
     bool WritePng(std::string const &path, std::string &error) const;

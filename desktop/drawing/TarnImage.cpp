@@ -111,7 +111,7 @@ struct PngImage::Rep {
             }
             shown = scaled.get();
         }
-        return {shown->PixmanImage(), width, height, opaque, false};
+        return {shown->PixmanImage(), width, height, opaque, false, {0, 0, 0, 0}};
     }
 
     // Which pictures are shown has to be found out again; what was decoded stays, for when they come back.

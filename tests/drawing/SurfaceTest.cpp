@@ -1,5 +1,6 @@
 #include "Canvas.h"
 #include "tests/resources/TemporaryDirectory.h"
+#include <algorithm>
 #include <fstream>
 #include <iterator>
 #include <memory>
@@ -121,4 +122,24 @@ TEST(Surface, CairoAndPixmanSeeTheSamePixels) {
     EXPECT_EQ(canvas.Picture(Canvas::kRed)[3], "########");
     EXPECT_EQ(canvas.Picture(Canvas::kRed)[4], "########");
     EXPECT_EQ(canvas.Count(Canvas::kBlack), 48);
+}
+
+TEST(Surface, KnowsTheOpaquePartThatHasNothingRoundIt) {
+    Surface surface(6, 4);
+    EXPECT_EQ(surface.OpaquePart().Width(), 6) << "a new one is opaque";
+    std::fill(surface.Pixels(), surface.Row(4), 0);
+    EXPECT_TRUE(surface.OpaquePart().Empty()) << "nothing is opaque";
+    for (int y = 1; y < 4; ++y)
+        for (int x = 2; x < 5; ++x)
+            surface.Row(y)[x] = 0xFF102030u;
+    DeviceRect const part = surface.OpaquePart();
+    EXPECT_EQ(part.left, 2);
+    EXPECT_EQ(part.top, 1);
+    EXPECT_EQ(part.right, 5);
+    EXPECT_EQ(part.bottom, 4);
+    surface.Row(2)[0] = 0x01000000u;
+    EXPECT_TRUE(surface.OpaquePart().Empty()) << "something translucent lies beside it";
+    surface.Row(2)[0] = 0;
+    surface.Row(2)[3] = 0x80102030u;
+    EXPECT_TRUE(surface.OpaquePart().Empty()) << "it has a translucent hole";
 }
