@@ -1,12 +1,14 @@
 #!/usr/bin/env python3
 """Runs the same form in several toolkits and prints medians, and how ours compares.
 
-    Peers.py [--check] --rounds N --server PID DIRECTORY
+    Peers.py [--check] [--record FILE] --rounds N --server PID DIRECTORY
 
 The programs of the directory take turns in each round, so that all meet the same conditions. With --check the exit
-status is 1 when a goal is missed.
+status is 1 when a goal is missed. With --record the table is written to a document too, with what it was measured on.
 """
 import argparse
+import contextlib
+import io
 import os
 import statistics
 import subprocess
@@ -92,9 +94,47 @@ def print_row(row, medians, ours=OURS):
     return missed
 
 
+def output_of(*command):
+    try:
+        return subprocess.run(command, stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True, check=True).stdout
+    except (OSError, subprocess.CalledProcessError):
+        return ""
+
+
+def first_line(text, start):
+    return next((line[len(start):].lstrip(" \t:=").strip('"') for line in text.splitlines() if line.startswith(start)), "?")
+
+
+def conditions(rounds):
+    """What the figures hold for, as lines of a document."""
+    processor = first_line(output_of("cat", "/proc/cpuinfo"), "model name")
+    system = first_line(output_of("cat", "/etc/os-release"), "PRETTY_NAME")
+    versions = {"Qt": output_of("pkg-config", "--modversion", "Qt6Widgets"),
+                "FLTK": output_of("fltk-config", "--version"),
+                "GTK": output_of("pkg-config", "--modversion", "gtk4"),
+                "SDL": output_of("pkg-config", "--modversion", "sdl2"),
+                "Cairo": output_of("pkg-config", "--modversion", "cairo"),
+                "Pango": output_of("pkg-config", "--modversion", "pango"),
+                "g++": output_of("g++", "-dumpfullversion"),
+                "X server": output_of("dpkg-query", "-W", "-f", "${Version}", "xvfb")}
+    named = ", ".join(f"{name} {version.strip() or '?'}" for name, version in versions.items())
+    return [f"- {os.cpu_count()} processors: {processor}", f"- {system}", f"- {named}",
+            f"- medians of {rounds} rounds"]
+
+
+def write_record(path, table, rounds):
+    lines = ["# How the panes compare", "",
+             "What `bench/peers/run --record` measured; `bench/peers/README.md` says how, and what is not comparable.",
+             "A goal is for our figure divided by the other's.", "", *conditions(rounds), "", "```", table.rstrip(),
+             "```", ""]
+    with open(path, "w", encoding="utf-8") as file:
+        file.write("\n".join(lines))
+
+
 def main():
     parser = argparse.ArgumentParser()
     parser.add_argument("--check", action="store_true")
+    parser.add_argument("--record")
     parser.add_argument("--rounds", type=int, required=True)
     parser.add_argument("--server", type=int, required=True)
     parser.add_argument("directory")
@@ -106,14 +146,19 @@ def main():
             run_round(options.directory, peer, options.server, values)
     medians = {key: statistics.median(measured) for key, measured in values.items()}
 
-    print_heading(OURS)
-    missed = sum(print_row(row, medians) for row in ROWS)
-    print()
-    print_heading(OURS_IN_PANES)
-    for row in ROWS:
-        print_row(row._replace(goals={}), medians, OURS_IN_PANES)
-    print()
-    print(f"{missed} goal(s) missed" if missed else "All goals met")
+    table = io.StringIO()
+    with contextlib.redirect_stdout(table):
+        print_heading(OURS)
+        missed = sum(print_row(row, medians) for row in ROWS)
+        print()
+        print_heading(OURS_IN_PANES)
+        for row in ROWS:
+            print_row(row._replace(goals={}), medians, OURS_IN_PANES)
+        print()
+        print(f"{missed} goal(s) missed" if missed else "All goals met")
+    print(table.getvalue(), end="")
+    if options.record:
+        write_record(options.record, table.getvalue(), options.rounds)
     return 1 if options.check and missed else 0
 
 
