@@ -19,7 +19,8 @@ typedef char (*GlogFilterHook)(glogRec *, void *self, EventRecordAdapter *, shor
 //
 // Return and enter press the item `confirm`, escape and closing the window the item `cancel`; 0 stands for
 // the items 1 and 2. A pane that has the keyboard may take the keys itself: a text field that is edited ends
-// its editing by the first, and the next one is the dialog's. A button that is disabled is not hit. Where no pane has the number of the cancelling item, that item counts as hit all the same. The
-// flags, and the 2, change nothing.
+// its editing by the first, and the next one is the dialog's. A button that is disabled is not hit. Where no
+// pane has the number of the cancelling item, that item counts as hit all the same. The flags, and the 2,
+// change nothing.
 void DoModalGlog(glogRec *, short *item, int *value, GlogFilterHook, void *self, bool flag, int two,
                  int confirm, int cancel, bool no, RunIdleChores);
