@@ -21,8 +21,8 @@ struct glogRec;
 class ItemType {
 public:
     // Makes a pane and attaches it to the glog. The sheet holds what the dialog says under the type's keys,
-    // all of it checked. Null, or a throw of KeyFault, std::bad_alloc or TarnError, becomes a LoadError; the
-    // maker keeps no pane alive then.
+    // all of it checked. Null, or a throw of KeyFault, std::bad_alloc or TarnError, becomes a LoadError;
+    // panes that the maker has attached to the glog by then are deleted.
     typedef std::function<GlogPane *(glogRec *, GlogStyleSheet *)> Maker;
     // The same from a binary record, whose kind is its first number. Bytes that are left over are an error.
     typedef std::function<GlogPane *(glogRec *, RecordBytes &)> RecordMaker;

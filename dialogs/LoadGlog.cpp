@@ -1,11 +1,10 @@
 #include "dialogs/LoadGlog.h"
-#include "desktop/panes/Glog.h"
 #include "dialogs/DialogReader.h"
+#include "dialogs/GrowingPanes.h"
 #include "dialogs/PaneMaker.h"
 #include "dialogs/RecordFile.h"
 #include "host/CompoundPane.h"
 #include "host/TarnError.h"
-#include <algorithm>
 #include <fstream>
 #include <iterator>
 #include <stdexcept>
@@ -51,28 +50,6 @@ public:
 private:
     Desktop &desktop;
     glogRec *glog;
-};
-
-// Panes at the glog's top level that are deleted unless they were moved elsewhere.
-class GrowingPanes {
-public:
-    explicit GrowingPanes(glogRec *glog_)
-        : glog(glog_)
-        , before(Panes()) {}
-    ~GrowingPanes() {
-        for (GlogPane *pane : Panes()) {
-            if (std::find(before.begin(), before.end(), pane) == before.end())
-                delete pane;
-        }
-    }
-    GrowingPanes(GrowingPanes const &) = delete;
-    GrowingPanes &operator=(GrowingPanes const &) = delete;
-
-private:
-    std::vector<GlogPane *> Panes() const { return Glog::From(glog).Items(); }
-
-    glogRec *glog;
-    std::vector<GlogPane *> before;
 };
 
 glogRec *MakeGlog(Dialog const &dialog) {

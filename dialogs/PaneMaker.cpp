@@ -1,6 +1,7 @@
 #include "dialogs/PaneMaker.h"
 #include "dialogs/CommonKeys.h"
 #include "dialogs/Dialog.h"
+#include "dialogs/GrowingPanes.h"
 #include "dialogs/ItemType.h"
 #include "dialogs/KeyFault.h"
 #include "host/CompoundPane.h"
@@ -31,11 +32,13 @@ void PaneMaker::Guard(PlaceOfKey const &placeOf, std::function<void()> const &ma
 }
 
 GlogPane *PaneMaker::Make(DialogItem const &item) {
+    GrowingPanes growing(glog);
     GlogPane *pane = nullptr;
     Guard([&](std::string const &key) { return item.PlaceOf(key); }, [&] { pane = MakeAlone(item); });
     MakeInside(pane, item);
     if (item.type->reporter)
-        item.type->reporter(pane);
+        Guard([&](std::string const &) { return item.place; }, [&] { item.type->reporter(pane); });
+    growing.Keep();
     return pane;
 }
 

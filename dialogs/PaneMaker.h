@@ -13,7 +13,7 @@ public:
         : glog(glog_) {}
 
     // Makes the item's pane and all that is in it, attached to the glog's top level. Throws LoadError; what
-    // was made by then stays with the glog.
+    // was made by then is deleted.
     GlogPane *Make(DialogItem const &);
 
     // Calls the function, which makes something for the item, and turns whatever goes wrong in it into a

@@ -82,8 +82,9 @@ private:
 };
 
 GlogPane *MakeZoomSlider(glogRec *glog, GlogStyleSheet *sheet) {
-    SliderClient *const client = new SliderClient(ZoomLevel(sheet));
-    std::unique_ptr<DialogZoomSlider> slider(new DialogZoomSlider(glog, client));
+    std::unique_ptr<SliderClient> client(new SliderClient(ZoomLevel(sheet)));
+    std::unique_ptr<DialogZoomSlider> slider(new DialogZoomSlider(glog, client.get()));
+    client.release(); // the slider's
     if (!slider->GetGlog())
         return nullptr;
     slider->Offset(OptionalPoint(sheet->GetItemRes(), "Origin"));
@@ -118,7 +119,8 @@ GlogPane *MakeZoomButtons(glogRec *glog, GlogStyleSheet *sheet) {
     bool const isLevel = sheet->GetUStringItemValue(ResourceKey("Direction")) == ResourceKey("horiz");
     std::unique_ptr<DialogZoomButtons> buttons(new DialogZoomButtons(
         glog, ZoomLevel(sheet), isLevel ? ZoomControlPane::kHorizontal : ZoomControlPane::kVertical));
-    if (!buttons->GetGlog())
+    if (!buttons->GetGlog() ||
+        buttons->NumSubpanes() == 0) // which is all that is told of buttons without memory
         return nullptr;
     buttons->Offset(OptionalPoint(sheet->GetItemRes(), "Origin"));
     return buttons.release();

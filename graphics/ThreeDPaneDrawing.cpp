@@ -16,17 +16,13 @@ double const kLineWidth = 0.5;
 double const kGridStep = 0.25;
 RGBColor const kGridColor = {0x4000, 0xCCCC, 0x4000};
 
-// Keeps the port's clip.
-class KeptClip {
-public:
-    KeptClip() { VelaDrawing::GetClip(clip); }
-    ~KeptClip() { VelaDrawing::SetClip(clip); }
-    KeptClip(KeptClip const &) = delete;
-    KeptClip &operator=(KeptClip const &) = delete;
-
-private:
+// Draws, and puts the clip back afterwards. When drawing throws, that is the host's matter.
+template <class Drawing> void KeepClip(Drawing const &draw) {
     TempRgn clip;
-};
+    VelaDrawing::GetClip(clip);
+    draw();
+    VelaDrawing::SetClip(clip);
+}
 
 // Makes the rectangle round both points the clip, with room for the line between them.
 void ClipBetween(Point a, Point b) {
@@ -68,21 +64,23 @@ void ThreeDPane::DrawLine(Axis3D axis) const {
 }
 
 void ThreeDPane::DrawBackHalfOfZLine() const {
-    KeptClip const clip;
-    Point a, b;
-    ProjectLine(kAxisZ, &a, &b);
-    ClipBetween(b, Project(value));
-    StrokeLine(a, b);
+    KeepClip([this] {
+        Point a, b;
+        ProjectLine(kAxisZ, &a, &b);
+        ClipBetween(b, Project(value));
+        StrokeLine(a, b);
+    });
 }
 
 void ThreeDPane::DrawFrontHalfOfZLine() const {
     if (!(value.z + 1.0 > radius))
         return; // the ball touches the front
-    KeptClip const clip;
-    Point a, b;
-    ProjectLine(kAxisZ, &a, &b);
-    ClipBetween(a, Project({value.x, value.y, value.z - radius}));
-    StrokeLine(a, b);
+    KeepClip([this] {
+        Point a, b;
+        ProjectLine(kAxisZ, &a, &b);
+        ClipBetween(a, Project({value.x, value.y, value.z - radius}));
+        StrokeLine(a, b);
+    });
 }
 
 void ThreeDPane::DrawIndicator() const {
@@ -104,11 +102,12 @@ void ThreeDPane::DrawShadow() const {
     VelaDrawing::Pt2Rect(far, near, &oval);
     float const alpha = static_cast<float>(1.0 - lift) * 0.27f + 0.13f;
 
-    KeptClip const clip;
-    OSPort *const port = OSPort::GetCurrent();
-    port->NarrowClipPath(walls);
-    port->SetForeColor(OS::RGBAColor(0.0, 0.0, 0.0, static_cast<double>(alpha)));
-    port->PaintOval(oval);
+    KeepClip([&] {
+        OSPort *const port = OSPort::GetCurrent();
+        port->NarrowClipPath(walls);
+        port->SetForeColor(OS::RGBAColor(0.0, 0.0, 0.0, static_cast<double>(alpha)));
+        port->PaintOval(oval);
+    });
 }
 
 void ThreeDPane::DrawWall(OSPath &path, Axis3D axis, double wall) const {

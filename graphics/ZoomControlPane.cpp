@@ -7,6 +7,7 @@
 #include "host/LocalizedStrings.h"
 #include "host/PaneWatch.h"
 #include "host/Services.h"
+#include <memory>
 #include <new>
 
 namespace {
@@ -140,20 +141,22 @@ void ZoomControlPane::Client::SetControlPane(ZoomControlPane *pane) {
 ZoomControlPane::ZoomControlPane(glogRec *owner, Client *client, Orientation orientation) {
     if (!CompoundPaneInit(owner, kNoNumber))
         return;
-    ButtonPane *const out = NewButton(client, false, orientation), *const in =
-                                                                       NewButton(client, true, orientation);
+    std::unique_ptr<ButtonPane> out(NewButton(client, false, orientation)),
+        in(NewButton(client, true, orientation));
     if (!out || !in)
         return;
-    zoomOutButton = out;
-    zoomInButton = in;
+    zoomOutButton = out.get();
+    zoomInButton = in.get();
     if (orientation == kHorizontal) {
         GetLayout()->SetAttributeFromString(GlogLayoutItem::kDirection, ResourceKey("horiz"));
-        Add(out, kAtEnd);
-        Add(in, kAtEnd);
+        Add(out.get(), kAtEnd);
+        Add(in.get(), kAtEnd);
     } else {
-        Add(in, kAtEnd);
-        Add(out, kAtEnd);
+        Add(in.get(), kAtEnd);
+        Add(out.get(), kAtEnd);
     }
+    out.release();
+    in.release();
     SetUseLayout(true);
     SetSizeToLayout(true);
     client->SetControlPane(this);
@@ -169,10 +172,9 @@ ZoomControlPane::~ZoomControlPane() {
 
 ZoomControlPane::ButtonPane *ZoomControlPane::NewButton(Client *client, bool zoomIn,
                                                         Orientation orientation) {
-    ButtonPane *const button = new (std::nothrow) ButtonPane(client, zoomIn);
+    std::unique_ptr<ButtonPane> button(new (std::nothrow) ButtonPane(client, zoomIn));
     if (button && button->Init(GetGlog(), LookOf(zoomIn, orientation)))
-        return button;
-    delete button;
+        return button.release();
     return nullptr;
 }
 

@@ -89,6 +89,11 @@ void ZoomPopUpPane::PopZoomControl(EventRecordAdapter *event) {
         kSliderWindow, OSWindow::SendBehindArg(OSWindow::PositionOnTop), false, nullptr);
     if (!popup)
         return;
+    // Also when the client or the slider throws.
+    struct Disposed {
+        ~Disposed() { DisposeGlog(glog); }
+        glogRec *glog;
+    } const disposed{popup};
     SetPortToGlog(popup);
     PaneWatch const self(this);
     // The level that the client has comes up under the mouse. The fraction's own error counts, so that one
@@ -102,7 +107,6 @@ void ZoomPopUpPane::PopZoomControl(EventRecordAdapter *event) {
     PositionGlog(popup, &place, false);
     if (self.PaneExists())
         RunSlider(popup, mouse);
-    DisposeGlog(popup);
 }
 
 void ZoomPopUpPane::RunSlider(glogRec *popup, Point mouse) {

@@ -49,12 +49,12 @@ LabelPane *LabelPane::NewLabelPane(glogRec *owner, int id, Rect *rect, bool righ
     resource.font = 0;
     resource.alignment = rightAligned ? gStringResRec::kAlignRight : gStringResRec::kAlignLeft;
     resource.reserved = 0;
-    LabelPane *const pane = NewLabelPane(owner, &resource);
+    std::unique_ptr<LabelPane> pane(NewLabelPane(owner, &resource));
     if (!pane)
         FailMemFullError();
     pane->SetText(text);
     pane->SetID(id);
-    return pane;
+    return pane.release();
 }
 
 LabelPane *LabelPane::NewLabelPane(glogRec *owner, GlogStyleSheet *sheet) {
@@ -68,12 +68,12 @@ LabelPane *LabelPane::NewLabelPane(glogRec *owner, GlogStyleSheet *sheet) {
     UString const text = sheet->GetUStringItemValue(ResourceKey("Text"));
     int const spacing = sheet->GetSInt32ItemValue(ResourceKey("LineSpacing"));
 
-    LabelPane *const pane = NewLabelPane(owner, &resource);
+    std::unique_ptr<LabelPane> pane(NewLabelPane(owner, &resource));
     if (!pane)
         return nullptr;
     pane->SetText(text);
     pane->SetLineSpacing(spacing);
-    return pane;
+    return pane.release();
 }
 
 LabelPane *LabelPane::LabelPaneInit(glogRec *owner, short id, const UString &text) {

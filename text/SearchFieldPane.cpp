@@ -11,6 +11,7 @@
 #include "text/SearchTextPane.h"
 #include "text/SearchedForm.h"
 #include <algorithm>
+#include <memory>
 #include <new>
 
 namespace {
@@ -64,7 +65,7 @@ void SearchFieldPane::Init(glogRec *owner) {
     if (!CompoundPaneInit(owner, kNoNumber))
         return;
     SetNoErase(1); // the icons cover all of the box
-    SearchTextPane *const text = new (std::nothrow) SearchTextPane(this);
+    std::unique_ptr<SearchTextPane> text(new (std::nothrow) SearchTextPane(this));
     if (!text)
         return;
     gtextResRec record;
@@ -76,10 +77,10 @@ void SearchFieldPane::Init(glogRec *owner) {
     GlogStyleSheet *const sheet = owner->GetStyleSheet() ? owner->GetStyleSheet() : &own;
     sheet->SetItemRes(GTextPane::XMLResFrom_GTextResRec(record));
     text->InitGTextPane(owner, sheet, nullptr, nullptr);
-    searchText = text;
-    Add(text, -1);
+    searchText = text.get();
+    Add(text.get(), -1);
     Rect box = TextBox(kWidestForText);
-    text->SetBox(&box);
+    text.release()->SetBox(&box); // the container's from now on
 }
 
 // The search

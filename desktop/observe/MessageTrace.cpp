@@ -3,6 +3,7 @@
 #include "host/Services.h"
 #include <cstdlib>
 #include <cxxabi.h>
+#include <memory>
 #include <utility>
 
 namespace {
@@ -37,9 +38,9 @@ void MessageTrace::Write(JsonLine const &line) {
 
 std::string MessageTrace::ClassName(GlogPane &pane) {
     int status = 0;
-    char *name = abi::__cxa_demangle(typeid(pane).name(), nullptr, nullptr, &status);
-    std::string result = status == 0 ? name : typeid(pane).name();
-    std::free(name);
+    std::unique_ptr<char, decltype(&std::free)> const name(
+        abi::__cxa_demangle(typeid(pane).name(), nullptr, nullptr, &status), std::free);
+    std::string result = status == 0 ? name.get() : typeid(pane).name();
     // Where a class was written down says nothing to who reads the trace.
     static std::string const kUnnamed = "(anonymous namespace)::";
     for (std::size_t at = result.find(kUnnamed); at != std::string::npos; at = result.find(kUnnamed))

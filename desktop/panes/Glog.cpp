@@ -24,6 +24,7 @@
 #include <algorithm>
 #include <deque>
 #include <list>
+#include <new>
 
 namespace {
 
@@ -78,8 +79,12 @@ void Glog::TellClosing() {
         PaneWatch const watch;
     };
     std::list<Owned> before;
-    for (GlogPane *pane : items)
-        before.emplace_back(pane);
+    try {
+        for (GlogPane *pane : items)
+            before.emplace_back(pane);
+    } catch (std::bad_alloc const &) {
+        // The window closes without memory, too; only such panes are lost then.
+    }
     Tell(&TarnOSWindow::OSWindow_PlatformWindowListener::PlatformWindow_Closing);
     for (Owned const &owned : before)
         if (owned.watch.PaneExists() && !owned.pane->GetGlog() && !PaneAccess::Container(*owned.pane))

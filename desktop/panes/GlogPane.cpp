@@ -411,10 +411,12 @@ bool GlogPane::DispatchCustomEvent(UIEvent *event) {
     CustomEventHandler *handler = CanHandleCustomEvent(event);
     if (!handler)
         return false;
-    bool const consumed = handler->HandleEvent(event);
     // A handler has a trivial destructor that is not virtual; the storage alone is given back.
-    ::operator delete(handler);
-    return consumed;
+    struct Freed {
+        ~Freed() { ::operator delete(handler); }
+        CustomEventHandler *handler;
+    } const freed{handler};
+    return handler->HandleEvent(event);
 }
 
 char GlogPane::DispatchCursor(Point p) { return Contains(p) ? AdjustCursorAndDisplayHelp(p) : 0; }

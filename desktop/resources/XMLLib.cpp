@@ -64,19 +64,28 @@ ContainerItem::ContainerItem(UString const &)
     : rep(new Rep) {}
 
 // Takes deep trees apart in a loop: a container within a container ten thousand times over would else use up
-// the stack.
+// the stack. A destructor must do without memory, so the way back is kept in the tree: while the list of a
+// container is being emptied, the container holds the list that it stood in itself, and its place there is
+// taken by the container around that.
 ContainerItem::~ContainerItem() {
-    std::vector<boost::shared_ptr<Item>> doomed = std::move(rep->items);
+    std::vector<boost::shared_ptr<Item>> list = std::move(rep->items);
     delete rep;
-    while (!doomed.empty()) {
-        boost::shared_ptr<Item> const item = std::move(doomed.back());
-        doomed.pop_back();
-        if (item.use_count() != 1)
+    boost::shared_ptr<Item> around; // the container whose list is being emptied; null for this one
+    while (!list.empty() || around) {
+        if (list.empty()) {
+            list.swap(static_cast<ContainerItem &>(*around).rep->items);
+            around = std::move(list.back());
+            list.pop_back();
             continue;
-        if (ContainerItem *inner = dynamic_cast<ContainerItem *>(item.get())) {
-            std::move(inner->rep->items.begin(), inner->rep->items.end(), std::back_inserter(doomed));
-            inner->rep->items.clear();
         }
+        ContainerItem *const inner =
+            list.back().use_count() == 1 ? dynamic_cast<ContainerItem *>(list.back().get()) : nullptr;
+        if (!inner || inner->rep->items.empty()) {
+            list.pop_back();
+            continue;
+        }
+        around.swap(list.back());
+        list.swap(inner->rep->items);
     }
 }
 

@@ -182,7 +182,7 @@ bool SetRandomValueOf(GlogPane &pane, Chance &chance) {
     else if (ButtonGroupPane *const group = dynamic_cast<ButtonGroupPane *>(&pane))
         SetRandomValue(*group, chance);
     else if (LabelPane *const label = dynamic_cast<LabelPane *>(&pane))
-        label->SetText(RandomUString(chance));
+        label->SetTextWithInval(RandomUString(chance));
     else if (ProgressBarPane *const bar = dynamic_cast<ProgressBarPane *>(&pane))
         bar->SetProgress(chance.Below(120), chance.Below(3) * 50);
     else if (ScrollPane *const scrolled = dynamic_cast<ScrollPane *>(&pane))
@@ -305,8 +305,11 @@ void Meddler::Remove(Chance &chance) {
         return;
     }
     CompoundPane *const container = PaneAccess::Container(*pane);
+    PaneWatch const watch(container);
     if (container && chance.OneIn(2)) {
         container->Del(container->Find(pane));
+        if (watch.PaneExists())
+            container->Inval(); // a grid has moved the rest without drawing it
     } else {
         pane->Inval();
         delete pane;
