@@ -282,6 +282,7 @@ void Glog::Resized(int w, int h) {
         MakeSurface();
     port.SetExtent(width, height);
     ForEachItem([&](GlogPane &pane) { pane.Resize(delta); });
+    resizedInClick = true;
     DamageAll();
 }
 
@@ -450,11 +451,15 @@ void Glog::Click(InputEvent const &event) {
         int item;
         bool noted;
     } const ownHit(*this);
+    resizedInClick = false;
     int const value = event.button == 1   ? ClickFrom(*pane, record)
                       : event.button == 2 ? PaneEvents::SecondaryClick(*pane, record)
                                           : 0;
     if (disposed)
         return;
+    // While it follows the mouse a pane draws by the clip that it saved before, wherever it lies by then.
+    if (resizedInClick)
+        DamageAll();
     if (value == 0 && event.button == 1 && HasItem(pane))
         pane->TryMouseControl(record.where);
     if (value < 0 && event.button == 1 && IsGrowCorner(record.where))

@@ -131,6 +131,7 @@ private:
     std::map<int, Rect> described;
     GlogPane *current = nullptr;
     int hitItem = 0;
+    bool resizedInClick = false;
     bool hitNoted = false;
     std::unique_ptr<PlatformWindow> window;
     std::unique_ptr<Surface> surface;

@@ -1,13 +1,36 @@
 #include "desktop/panes/Glog.h"
 #include "desktop/drawing/Surface.h"
 #include "host/CustomEventHandler.h"
+#include "host/Services.h"
 #include "host/UIEvent.h"
+#include "host/VelaDrawing.h"
 #include "tests/PaneTest.h"
 #include "tests/desktop/ProbePane.h"
 #include <algorithm>
 #include <boost/make_shared.hpp>
 
 namespace {
+
+// At the end of a press it draws without a look at what has changed meanwhile.
+class PressedPane : public GlogPane {
+public:
+    PressedPane(glogRec *owner, Rect box) {
+        GlogPaneInit(owner, 1);
+        SetBox(&box);
+    }
+
+private:
+    int HandleClick(EventRecordAdapter *) override {
+        Rect const box = GetBounds();
+        Point place;
+        while (MouseIsDragging(&place, nullptr)) {
+        }
+        SetPortToGlog(GetGlog());
+        VelaDrawing::PaintRect(&box);
+        return -1;
+    }
+    void DrawGuts(OSRgn *) override {}
+};
 
 class GlogTest : public PaneTest {
 protected:
@@ -87,6 +110,14 @@ TEST_F(GlogTest, AGlogThatWasHiddenShowsAllOfItAgain) {
     ASSERT_NE(shown, nullptr);
     Surface const &drawn = *Glog::From(glog).Pixels();
     EXPECT_TRUE(std::equal(drawn.Pixels(), drawn.Pixels() + drawn.Width() * drawn.Height(), shown->Pixels()));
+}
+
+TEST_F(GlogTest, WhatAPressDrewInAWindowThatWasResizedMeanwhileIsDrawnAnew) {
+    new PressedPane(glog, {20, 20, 60, 60});
+    Show();
+    desktop.Play("press 30 30\nresize 300 180\nrelease");
+    Surface const &drawn = *Glog::From(glog).Pixels();
+    EXPECT_EQ(drawn.Row(40)[40], drawn.Row(100)[100]);
 }
 
 TEST_F(GlogTest, TheUpdateRegionIsGivenInThePanesCoordinates) {

@@ -65,11 +65,15 @@ protected:
         ++events;
         return "mousemove " + std::to_string(kLeft + h) + ' ' + std::to_string(kTop + v) + "\nsleep 0.002\n";
     }
+    // Done before what follows: a hand does not press what is about to move. The tool waits for a change.
     std::string Resize() {
         ++events;
-        width = Random(kLeastWidth, kMostWidth);
+        int const before = width;
+        while (width == before)
+            width = Random(kLeastWidth, kMostWidth);
         height = Random(kLeastHeight, kMostHeight);
-        return "getactivewindow windowsize " + std::to_string(width) + ' ' + std::to_string(height) + '\n';
+        return "getactivewindow windowsize --sync " + std::to_string(width) + ' ' + std::to_string(height) +
+               '\n';
     }
     // From somewhere on the bar, an arrow, the trough or most of all the thumb, to and fro beside it.
     std::string Drag(ScrollBarPane &bar) {
