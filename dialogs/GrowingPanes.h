@@ -2,20 +2,20 @@
 #pragma once
 #include "desktop/panes/Glog.h"
 #include "host/GlogPane.h"
-#include <algorithm>
+#include <cstddef>
 #include <vector>
 
-// Deletes, at its end, panes that have come to the glog's top level meanwhile, unless they were moved
-// elsewhere or Keep was called.
+// Deletes, at its end, panes that have come to the glog's top level meanwhile, which come last there, unless
+// they were moved elsewhere or Keep was called. Costs the same however many panes there are.
 class GrowingPanes {
 public:
     explicit GrowingPanes(glogRec *glog_)
         : glog(glog_)
-        , before(Panes()) {}
+        , before(Panes().size()) {}
     ~GrowingPanes() {
         // Each pane that goes may take others along.
-        while (GlogPane *const pane = kept ? nullptr : Newcomer())
-            delete pane;
+        while (!kept && Panes().size() > before)
+            delete Panes().back();
     }
     GrowingPanes(GrowingPanes const &) = delete;
     GrowingPanes &operator=(GrowingPanes const &) = delete;
@@ -24,16 +24,8 @@ public:
 
 private:
     std::vector<GlogPane *> const &Panes() const { return Glog::From(glog).Items(); }
-    // Null when there is none.
-    GlogPane *Newcomer() const {
-        std::vector<GlogPane *> const &panes = Panes();
-        auto const found = std::find_if(panes.begin(), panes.end(), [this](GlogPane *pane) {
-            return std::find(before.begin(), before.end(), pane) == before.end();
-        });
-        return found == panes.end() ? nullptr : *found;
-    }
 
     glogRec *glog;
-    std::vector<GlogPane *> before;
+    std::size_t const before;
     bool kept = false;
 };
