@@ -51,7 +51,7 @@ void Grid::Move(short from, short to) {
         return;
     GlogPane *const member = Get(from);
     DelGuts(from, true);
-    if (AddGuts(member, to) < 0)
+    if (CompoundPane::AddGuts(member, to) < 0) // a subclass's is for additions, and this is none
         return;
     for (short i = std::min(from, to); i <= std::max(from, to); ++i) {
         SetMemberBounds(i);

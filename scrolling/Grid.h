@@ -18,8 +18,8 @@ public:
     // Deletes the member and lays out everything behind it. An index that does not exist has no effect.
     void Del(short index) override;
 
-    // Moves a member to another index, and lays out what lies between them. Without effect when there is no
-    // such index.
+    // Moves a member to another index, and lays out what lies between them. A subclass sees the member go by
+    // DelGuts, but not come by AddGuts: it is no addition. Without effect when there is no such index.
     virtual void Move(short from, short to);
     // Lays out the subpanes from the first one on; with `invalidate` each is drawn anew.
     virtual void Reposition(short first, unsigned char invalidate);

@@ -46,6 +46,20 @@ public:
     short GetGridItemIndex(GlogPane *pane) override { return static_cast<short>(Find(pane) - 1); }
 };
 
+// A grid that counts what comes and goes.
+class CountingGrid : public Grid {
+public:
+    short AddGuts(GlogPane *pane, short position) override {
+        ++added;
+        return Grid::AddGuts(pane, position);
+    }
+    void DelGuts(short index, bool keep) override {
+        ++taken;
+        Grid::DelGuts(index, keep);
+    }
+    int added = 0, taken = 0;
+};
+
 } // namespace
 
 TEST_F(GridTest, IsMadeAsAColumnOfEqualMembersUnderItsNumber) {
@@ -204,6 +218,19 @@ TEST_F(GridTest, MoveToTheSameIndexDrawsThatMemberAlone) {
     grid->Move(1, 1);
     EXPECT_EQ(grid->Get(1), second);
     EXPECT_EQ(Repainted(), (Rects{{30, 20, 40, 70}}));
+}
+
+TEST_F(GridTest, MoveIsNoAdditionForASubclass) {
+    CountingGrid *const counting = new CountingGrid;
+    counting->GridInit(glog, 8);
+    GlogPane *const first = Member(50, 20);
+    counting->Add(first, -1);
+    counting->Add(Member(50, 10), -1);
+    EXPECT_EQ(counting->added, 2);
+    counting->Move(0, 1);
+    EXPECT_EQ(counting->Get(1), first);
+    EXPECT_EQ(counting->taken, 1);
+    EXPECT_EQ(counting->added, 2);
 }
 
 TEST_F(GridTest, MoveIgnoresIndicesThatDoNotExist) {
