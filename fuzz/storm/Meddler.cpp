@@ -32,12 +32,13 @@
 
 namespace {
 
-int const kDeepest = 3;       // disturbances within each other
-int const kMostNested = 2;    // loops within each other that a disturbance runs
-int const kMostRows = 60;     // of lists
-int const kMostItems = 12;    // of menus and tabs
-int const kLongestText = 600; // units; longer ones are taken out again
-int const kFarthest = 40;     // pixels that a pane is moved at a time
+int const kDeepest = 3;        // disturbances within each other
+int const kChangedEvery = 100; // removals where nothing can be removed; making a page anew takes long
+int const kMostNested = 2;     // loops within each other that a disturbance runs
+int const kMostRows = 60;      // of lists
+int const kMostItems = 12;     // of menus and tabs
+int const kLongestText = 600;  // units; longer ones are taken out again
+int const kFarthest = 40;      // pixels that a pane is moved at a time
 short const kLargestSide = 500;
 
 char const kQuestion[] =
@@ -300,7 +301,7 @@ GlogPane *Meddler::Told(GlogPane *pane) const {
 void Meddler::Remove(Chance &chance) {
     GlogPane *const pane = AnyLoose(chance);
     if (!pane) {
-        if (chance.OneIn(20))
+        if (chance.OneIn(kChangedEvery))
             stage.Change(chance);
         return;
     }

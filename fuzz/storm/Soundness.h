@@ -10,11 +10,15 @@ namespace Soundness {
 bool PanesOverlap(StormDesktop &);
 
 // Ends the process, with a sentence, when something does not hold: panes know where they are, the current
-// item is one of them, nothing is being tracked that is not pressed, no menu or dialog is left open, every
-// window shows what was drawn, and, with `pixels`, a full redraw gives what the redraws of damage have left.
-void Check(StormDesktop &, bool pixels);
+// item is one of them, nothing is being tracked that is not pressed, no menu or dialog is left open, and
+// drawing comes to an end.
+void Check(StormDesktop &);
 
-// Ends the process when a full redraw does not give what the redraws of damage have left.
+// Ends the process when a window cannot be described. Takes long where there are many panes.
+void CheckDescription(StormDesktop &);
+
+// Ends the process when a window does not show what was drawn, or a full redraw does not give what the
+// redraws of damage have left.
 void CheckRedraw(StormDesktop &);
 
 } // namespace Soundness

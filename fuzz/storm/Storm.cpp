@@ -8,7 +8,7 @@
 namespace {
 
 long const kBatch = 64;       // events between two checks
-long const kRedrawEvery = 8;  // batches between two full redraws
+long const kRedrawEvery = 8;  // batches between two checks that take long
 int const kDisturbed = 3;     // one message in so many
 int const kMostMessages = 40; // disturbed ones of one step
 int const kMostEnds = 60;     // attempts to end what waits
@@ -110,8 +110,12 @@ void Storm::RunUntil(long step) {
 void Storm::Run() {
     for (long batch = 0; progress.step < plan.steps; ++batch) {
         RunUntil(std::min(progress.step + kBatch, plan.steps));
-        bool const pixels = batch % kRedrawEvery == 0 && !Soundness::PanesOverlap(desktop);
-        Soundness::Check(desktop, pixels);
+        Soundness::Check(desktop);
+        if (batch % kRedrawEvery == 0) {
+            Soundness::CheckDescription(desktop);
+            if (!Soundness::PanesOverlap(desktop))
+                Soundness::CheckRedraw(desktop);
+        }
         Chance chance(plan.seed, kBetween + Step(batch));
         if (plan.meddling && !IsLeftOut(progress.step - 1) && chance.OneIn(8))
             meddler->DisturbDesktop(chance);
