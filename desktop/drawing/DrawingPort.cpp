@@ -176,8 +176,9 @@ OS::RGBAColor DrawingPort::Ink() const {
     return state.darken != 0 ? OS::RGBAColor(0, 0, 0, state.darken / kPercent) : state.fore;
 }
 
-void DrawingPort::Damage(Rect const &local) {
-    Rect window = LocalToWindow(local);
+void DrawingPort::Damage(Rect const &local) { DamageWindow(LocalToWindow(local)); }
+
+void DrawingPort::DamageWindow(Rect window) {
     if (VelaDrawing::SectRect(&window, &extent, &window))
         Region::UniteRect(damage, window);
 }

@@ -111,6 +111,7 @@ public:
     // What waits to be redrawn, in window coordinates. Damage takes a local rectangle.
     void Damage(Rect const &local);
     void DamageWindow(OSRgn const &);
+    void DamageWindow(Rect window); // takes no memory of its own
     OSRgn const &GetDamage() const { return damage; }
     OSRgn TakeDamage();
 

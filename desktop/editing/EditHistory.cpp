@@ -8,19 +8,20 @@ namespace {
 std::size_t const kMostUnits = 8u << 20;
 std::size_t const kMostSteps = 10000;
 
-// Puts one piece behind the other.
-TextFragment Joined(TextFragment first, TextFragment const &second) {
-    for (StyleRuns::Run const &run : second.looks)
-        if (run.start < second.units.size() && (first.looks.back().style != run.style))
-            first.looks.push_back({first.units.size() + run.start, run.style});
+// Puts the second piece behind the first one.
+void Append(TextFragment &first, TextFragment const &second) {
+    std::size_t const size = first.units.size();
+    first.looks.reserve(first.looks.size() + second.looks.size());
     first.units += second.units;
-    return first;
+    for (StyleRuns::Run const &run : second.looks)
+        if (run.start < second.units.size() && first.looks.back().style != run.style)
+            first.looks.push_back({size + run.start, run.style});
 }
 
 } // namespace
 
 // Whether the step goes on with the last one, which then has taken it in.
-bool EditHistory::Joins(EditStep const &step, Kind kind) {
+bool EditHistory::Joins(EditStep &step, Kind kind) {
     if (!open || done.empty() || kind != openKind || kind == kOther)
         return false;
     EditStep &last = done.back();
@@ -32,12 +33,14 @@ bool EditHistory::Joins(EditStep const &step, Kind kind) {
         std::size_t const removed = step.before.units.size();
         if (step.length != 0 || last.length != 0)
             return false;
-        if (step.start + removed == last.start)
-            last.before = Joined(step.before, last.before);
-        else if (step.start == last.start)
-            last.before = Joined(std::move(last.before), step.before);
-        else
+        if (step.start + removed == last.start) {
+            Append(step.before, last.before);
+            last.before = std::move(step.before);
+        } else if (step.start == last.start) {
+            Append(last.before, step.before);
+        } else {
             return false;
+        }
         last.start = step.start;
         weight += removed;
     }
@@ -46,12 +49,12 @@ bool EditHistory::Joins(EditStep const &step, Kind kind) {
 }
 
 void EditHistory::Add(EditStep step, Kind kind) {
-    undone.clear();
-    bool const joined = Joins(step, kind);
-    if (!joined) {
-        weight += step.before.units.size();
+    if (!Joins(step, kind)) {
+        std::size_t const units = step.before.units.size();
         done.push_back(std::move(step));
+        weight += units;
     }
+    undone.clear();
     open = true;
     openKind = kind;
     Limit();
@@ -72,23 +75,17 @@ void EditHistory::Clear() {
     Seal();
 }
 
-EditStep EditHistory::TakeDone() {
-    EditStep step = std::move(done.back());
+void EditHistory::Undo(EditStep reverse) {
+    undone.push_back(std::move(reverse));
+    weight -= done.back().before.units.size();
     done.pop_back();
-    weight -= step.before.units.size();
     Seal();
-    return step;
 }
 
-EditStep EditHistory::TakeUndone() {
-    EditStep step = std::move(undone.back());
+void EditHistory::Redo(EditStep reverse) {
+    std::size_t const units = reverse.before.units.size();
+    done.push_back(std::move(reverse));
+    weight += units;
     undone.pop_back();
-    Seal();
-    return step;
-}
-
-void EditHistory::AddRedone(EditStep step) {
-    weight += step.before.units.size();
-    done.push_back(std::move(step));
     Seal();
 }

@@ -25,7 +25,8 @@ class EditHistory {
 public:
     enum Kind { kTyping, kDeleting, kOther };
 
-    // The user has made a new step, after which nothing can be done again.
+    // The user makes a new step, after which nothing can be done again. When memory runs out, in this and the
+    // others, everything stays as it is.
     void Add(EditStep, Kind);
     // What comes next is a step of its own.
     void Seal() { open = false; }
@@ -33,14 +34,15 @@ public:
 
     bool CanUndo() const { return !done.empty(); }
     bool CanRedo() const { return !undone.empty(); }
-    // The step to be taken back or made again. What it replaces goes to AddUndone or AddRedone.
-    EditStep TakeDone();
-    EditStep TakeUndone();
-    void AddUndone(EditStep step) { undone.push_back(std::move(step)); }
-    void AddRedone(EditStep);
+    // The step to be taken back or made again.
+    EditStep const &Done() const { return done.back(); }
+    EditStep const &Undone() const { return undone.back(); }
+    // It was, and this step brings back what it has replaced.
+    void Undo(EditStep reverse);
+    void Redo(EditStep reverse);
 
 private:
-    bool Joins(EditStep const &, Kind);
+    bool Joins(EditStep &, Kind);
     void Limit();
 
     std::vector<EditStep> done, undone;

@@ -15,6 +15,12 @@ template <class Iterator> Iterator Plus(Iterator begin, std::size_t offset) {
     return begin + static_cast<std::ptrdiff_t>(offset);
 }
 
+// Room for so many, and some for what comes next.
+template <class T> void ReserveMore(std::vector<T> &list, std::size_t count) {
+    if (count > list.capacity())
+        list.reserve(std::max(count, 2 * list.capacity()));
+}
+
 } // namespace
 
 ParagraphIndex::Sum &ParagraphIndex::Sum::operator+=(Sum const &other) {
@@ -52,8 +58,8 @@ ParagraphIndex::Sum ParagraphIndex::SumOf(Entries const &entries) {
     return sum;
 }
 
-ParagraphIndex::ParagraphIndex() {
-    Insert({0, 0, Sum()}, Entries(1, Entry{0, 0}));
+ParagraphIndex::ParagraphIndex()
+    : blocks(Divided(Entries(1, Entry{0, 0}))) {
     Rebuild();
 }
 
@@ -144,63 +150,81 @@ void ParagraphIndex::SetHeight(std::size_t index, std::uint32_t height, bool mea
     SetEntry(place, Packed({EntryAt(place).units, height, measured}));
 }
 
-void ParagraphIndex::Replace(std::size_t first, std::size_t count, std::vector<Paragraph> const &others) {
-    if (count == others.size()) {
-        for (std::size_t i = 0; i < count; ++i)
-            SetEntry(Find(&Sum::count, first + i), Packed(others[i]));
-        return;
-    }
+ParagraphIndex::Replacement ParagraphIndex::Prepare(std::size_t first, std::size_t count,
+                                                    std::vector<Paragraph> const &others) {
+    Replacement made;
+    made.first = first;
     Entries packed(others.size());
     std::transform(others.begin(), others.end(), packed.begin(), Packed);
+    if (count == others.size()) {
+        made.entries = std::move(packed);
+        return made;
+    }
     if (packed.empty() && count == Count())
         packed.push_back({0, 0});
     Place place = Find(&Sum::count, first);
     if (first >= Count()) // behind the last one
         place.within = blocks[place.block].entries.size();
-    bool const inOneBlock = place.within + count <= blocks[place.block].entries.size();
-    std::size_t const blocksBefore = blocks.size();
-    Sum const sumBefore = blocks[place.block].sum;
-    Remove(place, count);
-    Insert(place, packed);
-    if (inOneBlock && blocks.size() == blocksBefore)
-        AddToTree(place.block, blocks[place.block].sum, sumBefore);
+    // What is left of the blocks at both ends goes on in new ones, with the others between.
+    std::size_t last = place.block, end = place.within + count;
+    while (end > blocks[last].entries.size())
+        end -= blocks[last++].entries.size();
+    Entries const &before = blocks[place.block].entries, &behind = blocks[last].entries;
+    Entries whole;
+    whole.reserve(place.within + packed.size() + behind.size() - end);
+    whole.insert(whole.end(), before.begin(), Plus(before.begin(), place.within));
+    whole.insert(whole.end(), packed.begin(), packed.end());
+    whole.insert(whole.end(), Plus(behind.begin(), end), behind.end());
+    made.firstBlock = place.block;
+    made.numBlocks = last + 1 - place.block;
+    made.blocks = Divided(std::move(whole));
+    std::size_t const numBlocks = blocks.size() - made.numBlocks + made.blocks.size();
+    ReserveMore(blocks, numBlocks);
+    ReserveMore(tree, numBlocks + 1);
+    return made;
+}
+
+void ParagraphIndex::Replace(Replacement &&others) noexcept {
+    if (others.numBlocks == 0)
+        TakeEntries(others);
     else
-        Rebuild();
+        TakeBlocks(others);
 }
 
-// Leaves the tree as it is, and the first block there even when nothing is left of it.
-void ParagraphIndex::Remove(Place const &place, std::size_t count) {
-    std::size_t at = place.block, within = place.within;
-    for (; count > 0; ++at, within = 0) {
-        Block &block = blocks[at];
-        std::size_t const taken = std::min(count, block.entries.size() - within);
-        auto const first = Plus(block.entries.begin(), within);
-        block.entries.erase(first, Plus(first, taken));
-        block.sum = SumOf(block.entries);
-        count -= taken;
+void ParagraphIndex::TakeEntries(Replacement const &others) {
+    for (std::size_t i = 0; i < others.entries.size(); ++i)
+        SetEntry(Find(&Sum::count, others.first + i), others.entries[i]);
+}
+
+void ParagraphIndex::TakeBlocks(Replacement &others) {
+    auto const first = Plus(blocks.begin(), others.firstBlock);
+    if (others.numBlocks == 1 && others.blocks.size() == 1) {
+        Sum const sumBefore = first->sum;
+        *first = std::move(others.blocks.front());
+        AddToTree(others.firstBlock, first->sum, sumBefore);
+        return;
     }
-    auto const isEmpty = [](Block const &block) { return block.entries.empty(); };
-    auto const second = Plus(blocks.begin(), std::min(place.block + 1, blocks.size()));
-    auto const behind = std::max(second, Plus(blocks.begin(), at));
-    blocks.erase(std::remove_if(second, behind, isEmpty), behind);
+    std::size_t const common = std::min(others.numBlocks, others.blocks.size());
+    auto const from = std::make_move_iterator(others.blocks.begin()),
+               to = std::make_move_iterator(others.blocks.end());
+    auto const behind = std::copy(from, Plus(from, common), first);
+    if (common < others.numBlocks)
+        blocks.erase(behind, Plus(first, others.numBlocks));
+    else
+        blocks.insert(behind, Plus(from, common), to);
+    Rebuild();
 }
 
-// Leaves the tree as it is.
-void ParagraphIndex::Insert(Place const &place, Entries const &others) {
-    if (blocks.empty())
-        blocks.emplace_back();
-    Block &block = blocks[place.block];
-    block.entries.insert(Plus(block.entries.begin(), place.within), others.begin(), others.end());
-    block.sum += SumOf(others);
-    if (block.entries.empty())
-        blocks.erase(Plus(blocks.begin(), place.block));
-    else if (block.entries.size() > kMostInBlock)
-        Divide(place.block);
-}
-
-void ParagraphIndex::Divide(std::size_t block) {
-    Entries const whole = std::move(blocks[block].entries);
+std::vector<ParagraphIndex::Block> ParagraphIndex::Divided(Entries &&whole) {
     std::vector<Block> parts;
+    if (whole.size() <= kMostInBlock) {
+        if (!whole.empty()) {
+            Sum const sum = SumOf(whole);
+            parts.push_back({std::move(whole), sum});
+        }
+        return parts;
+    }
+    parts.reserve((whole.size() + kUsualInBlock - 1) / kUsualInBlock);
     for (std::size_t start = 0; start < whole.size(); start += kUsualInBlock) {
         Block part;
         part.entries.assign(Plus(whole.begin(), start),
@@ -208,7 +232,5 @@ void ParagraphIndex::Divide(std::size_t block) {
         part.sum = SumOf(part.entries);
         parts.push_back(std::move(part));
     }
-    blocks[block] = std::move(parts.front());
-    blocks.insert(Plus(blocks.begin(), block + 1), std::make_move_iterator(std::next(parts.begin())),
-                  std::make_move_iterator(parts.end()));
+    return parts;
 }

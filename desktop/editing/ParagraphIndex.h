@@ -28,8 +28,11 @@ public:
     std::size_t AtHeight(long long pixel) const;
 
     void SetHeight(std::size_t index, std::uint32_t height, bool measured);
-    // Puts other paragraphs in the place of `count` ones from the first on.
-    void Replace(std::size_t first, std::size_t count, std::vector<Paragraph> const &);
+    class Replacement;
+    // Other paragraphs for the place of `count` ones from the first on, with all the memory that takes: until
+    // Replace, which then needs none, nothing is changed, and nothing may be.
+    Replacement Prepare(std::size_t first, std::size_t count, std::vector<Paragraph> const &);
+    void Replace(Replacement &&) noexcept;
     // Takes all heights as guesses; `guess` tells each from the units.
     template <class Guess> void ForgetHeights(Guess const &guess) {
         for (Block &block : blocks) {
@@ -68,13 +71,22 @@ private:
     Entry &EntryAt(Place const &place) { return blocks[place.block].entries[place.within]; }
     void SetEntry(Place const &, Entry);
     void AddToTree(std::size_t block, Sum const &added, Sum const &removed);
-    void Remove(Place const &, std::size_t count);
-    void Insert(Place const &, Entries const &);
-    void Divide(std::size_t block);
+    void TakeEntries(Replacement const &);
+    void TakeBlocks(Replacement &);
+    static std::vector<Block> Divided(Entries &&);
     void Rebuild();
 
     std::vector<Block> blocks; // none is empty
     Sum all;
     // Element n holds the sum of as many blocks before place n as the lowest bit of n says.
     std::vector<Sum> tree;
+};
+
+class ParagraphIndex::Replacement {
+    friend class ParagraphIndex;
+
+    std::size_t first = 0; // paragraph
+    Entries entries;       // for as many others
+    std::size_t firstBlock = 0, numBlocks = 0;
+    std::vector<Block> blocks; // for those, where the number of paragraphs is another one
 };

@@ -36,11 +36,6 @@ StyleRuns::StyleRuns()
     runs.front().style.style.size = kUsualSize;
 }
 
-void StyleRuns::SetAll(EditStyle const &style) {
-    EditStyle const kept = style; // it may be one of the runs
-    runs.assign(1, Run{0, kept});
-}
-
 std::size_t StyleRuns::IndexAt(std::size_t unit) const {
     auto const next = std::upper_bound(runs.begin(), runs.end(), unit,
                                        [](std::size_t place, Run const &run) { return place < run.start; });
@@ -55,17 +50,12 @@ StyleRuns::List StyleRuns::Slice(std::size_t start, std::size_t end) const {
     return slice;
 }
 
-void StyleRuns::Merge() {
-    auto const same = [](Run const &a, Run const &b) { return a.style == b.style; };
-    runs.erase(std::unique(runs.begin(), runs.end(), same), runs.end());
-}
-
-void StyleRuns::Replace(std::size_t start, std::size_t removed, std::size_t inserted, List const &looks,
-                        std::size_t size) {
-    if (runs.size() == 1 && (inserted == 0 || (looks.size() == 1 && looks.front().style == runs[0].style)))
-        return;
-    std::size_t const end = start + removed;
+StyleRuns::List StyleRuns::Replaced(std::size_t start, std::size_t removed, std::size_t inserted,
+                                    List const &looks, std::size_t size) const {
     List changed;
+    if (runs.size() == 1 && (inserted == 0 || (looks.size() == 1 && looks.front().style == runs[0].style)))
+        return changed;
+    std::size_t const end = start + removed;
     for (Run const &run : runs)
         if (run.start < start)
             changed.push_back(run);
@@ -79,17 +69,21 @@ void StyleRuns::Replace(std::size_t start, std::size_t removed, std::size_t inse
     // What was there last tells how a text looks that begins anew.
     if (changed.empty())
         changed.push_back({0, At(start)});
-    runs.swap(changed);
-    Merge();
+    auto const same = [](Run const &a, Run const &b) { return a.style == b.style; };
+    changed.erase(std::unique(changed.begin(), changed.end(), same), changed.end());
+    return changed;
 }
 
-void StyleRuns::Change(std::size_t start, std::size_t end, unsigned int mask, OS::TextStyle const &style,
-                       std::size_t size) {
+StyleRuns::List StyleRuns::Changed(std::size_t start, std::size_t end, unsigned int mask,
+                                   OS::TextStyle const &style, std::size_t size) const {
     List slice = Slice(start, end);
     for (Run &run : slice)
         CopyStyle(mask, style, run.style);
-    if (size == 0)
-        SetAll(slice.front().style);
-    else
-        Replace(start, end - start, end - start, slice, size);
+    return size == 0 ? List(1, Run{0, slice.front().style})
+                     : Replaced(start, end - start, end - start, slice, size);
+}
+
+void StyleRuns::Take(List &&changed) noexcept {
+    if (!changed.empty())
+        runs.swap(changed);
 }

@@ -34,24 +34,23 @@ public:
     typedef std::vector<Run> List;
 
     StyleRuns();
-    // All of the text has this look from now on.
-    void SetAll(EditStyle const &);
 
     List const &All() const { return runs; }
     std::size_t IndexAt(std::size_t unit) const; // in All
     EditStyle const &At(std::size_t unit) const { return runs[IndexAt(unit)].style; }
     // The runs between the two places, counted from the first; one even when there is nothing between.
     List Slice(std::size_t start, std::size_t end) const;
-    // Text was replaced: `inserted` units, which look as the list says, stand in the place of `removed` ones.
-    // `size` is the length of the text before.
-    void Replace(std::size_t start, std::size_t removed, std::size_t inserted, List const &looks,
-                 std::size_t size);
-    // Changes the look of what lies between the two places. `size` is the length of the text.
-    void Change(std::size_t start, std::size_t end, unsigned int mask, OS::TextStyle const &,
-                std::size_t size);
+    // All runs once text is replaced: `inserted` units, which look as the list says, in the place of
+    // `removed` ones. `size` is the length of the text before. Empty when they stay as they are.
+    List Replaced(std::size_t start, std::size_t removed, std::size_t inserted, List const &looks,
+                  std::size_t size) const;
+    // All runs with another look of what lies between the two places. `size` is the length of the text. Empty
+    // when they stay as they are.
+    List Changed(std::size_t start, std::size_t end, unsigned int mask, OS::TextStyle const &,
+                 std::size_t size) const;
+    // What one of those two has told.
+    void Take(List &&) noexcept;
 
 private:
-    void Merge();
-
     List runs;
 };

@@ -1,5 +1,6 @@
 #include "desktop/editing/TextBuffer.h"
 #include <algorithm>
+#include <new>
 
 namespace {
 
@@ -11,13 +12,17 @@ constexpr std::size_t kSmallestGap = 32, kLargestGap = 1 << 16, kGapShare = 16;
 std::u16string TextBuffer::Copy(std::size_t start, std::size_t end) const {
     std::u16string copy;
     copy.reserve(end - start);
+    AppendTo(copy, start, end);
+    return copy;
+}
+
+void TextBuffer::AppendTo(std::u16string &copy, std::size_t start, std::size_t end) const {
     std::size_t const beforeGap = std::min(end, gapStart);
     if (start < beforeGap)
         copy.append(units.data() + start, beforeGap - start);
     std::size_t const behind = std::max(start, gapStart);
     if (behind < end)
         copy.append(units.data() + behind + (gapEnd - gapStart), end - behind);
-    return copy;
 }
 
 bool TextBuffer::Equals(std::u16string_view other) const {
@@ -53,20 +58,33 @@ void TextBuffer::WidenGap(std::size_t atLeast) {
     gapEnd += more;
 }
 
+void TextBuffer::MakeRoom(std::size_t removed, std::size_t inserted) {
+    if (gapEnd - gapStart + removed < inserted)
+        WidenGap(inserted - removed);
+}
+
 void TextBuffer::Replace(std::size_t start, std::size_t removed, std::u16string_view inserted) {
+    MakeRoom(removed, inserted.size());
     MoveGap(start);
     gapEnd += removed;
-    if (gapEnd - gapStart < inserted.size())
-        WidenGap(inserted.size());
     std::copy(inserted.begin(), inserted.end(), units.begin() + static_cast<std::ptrdiff_t>(gapStart));
     gapStart += inserted.size();
-    // What a large deletion left is given back.
+    // What a large deletion left.
     std::size_t const room = gapEnd - gapStart;
-    if (room > 2 * kLargestGap && room > Size()) {
-        std::vector<char16_t> tight;
-        std::u16string const all = Copy(0, Size());
-        tight.assign(all.begin(), all.end());
-        units.swap(tight);
-        gapStart = gapEnd = units.size();
+    if (room > 2 * kLargestGap && room > Size())
+        GiveBack();
+}
+
+void TextBuffer::GiveBack() {
+    std::vector<char16_t> tight;
+    try {
+        tight.reserve(Size());
+    } catch (std::bad_alloc const &) {
+        return; // then it is kept
     }
+    auto const begin = units.begin();
+    tight.assign(begin, begin + static_cast<std::ptrdiff_t>(gapStart));
+    tight.insert(tight.end(), begin + static_cast<std::ptrdiff_t>(gapEnd), units.end());
+    units.swap(tight);
+    gapStart = gapEnd = units.size();
 }

@@ -45,13 +45,18 @@ public:
     // A paragraph's units, without what ends it.
     std::u16string BodyOf(std::size_t paragraph) const;
     TextFragment FragmentOf(std::size_t start, std::size_t end) const;
-    // Puts the fragment in the place of `removed` units.
-    ParagraphChange Replace(std::size_t start, std::size_t removed, TextFragment const &);
+    class Replacement;
+    // What it takes to put the fragment in the place of `removed` units, with all the memory: until Replace,
+    // which then needs none, nothing is changed, and nothing may be. The fragment has to stay as well.
+    Replacement Prepare(std::size_t start, std::size_t removed, TextFragment const &);
+    ParagraphChange Replace(Replacement &&) noexcept;
     // Takes all heights as guesses, of this kind from now on.
     void GuessHeights(HeightGuess const &);
 
 private:
-    ParagraphChange ReplaceParagraphs(std::size_t start, std::size_t removed, std::u16string_view inserted);
+    void PrepareParagraphs(Replacement &);
+    std::vector<std::uint32_t> LengthsWith(Replacement const &, std::size_t from, std::size_t to,
+                                           bool toEnd) const;
     bool EndsOpen(std::size_t paragraph) const;
 
     bool severalLines;
@@ -59,4 +64,14 @@ private:
     StyleRuns styles;
     ParagraphIndex paragraphs;
     HeightGuess guess;
+};
+
+class TextDocument::Replacement {
+    friend class TextDocument;
+
+    std::size_t start = 0, removed = 0;
+    std::u16string_view inserted;
+    StyleRuns::List styles;
+    ParagraphIndex::Replacement paragraphs;
+    ParagraphChange change = {0, 0, 0};
 };

@@ -58,18 +58,19 @@ void TextEditor::SetWindow(Window other) {
 // The text
 
 void TextEditor::SetText(UString const &text) {
-    composing = false;
-    hasTypingStyle = false;
-    history.Clear();
     std::u16string_view const given = Utf::View(text);
     std::u16string_view const units = given.substr(0, ParagraphBreaks::Fitting(given, MostUnits()));
     TextFragment whole;
     whole.units = units;
     whole.looks = document.Styles().Slice(0, 0);
-    ReplaceText(0, document.Size(), whole);
+    TextDocument::Replacement change = document.Prepare(0, document.Size(), whole);
+    composing = false;
+    hasTypingStyle = false;
+    history.Clear();
+    ReplaceText(std::move(change));
     selection.from = std::min(selection.from, units.size());
     selection.to = std::min(selection.to, units.size());
-    KeepTextInSight();
+    Show([this] { KeepTextInSight(); });
     DamageAll();
     CaretChanged();
 }
@@ -148,9 +149,11 @@ void TextEditor::SetStyle(unsigned int mask, OS::TextStyle const &style) {
         return;
     }
     std::size_t const start = all ? 0 : selection.Start(), end = all ? document.Size() : selection.End();
-    document.Styles().Change(start, end, mask, style, document.Size());
+    StyleRuns::List runs = document.Styles().Changed(start, end, mask, style, document.Size());
+    HeightGuess const guess = flow.GuessFor((runs.empty() ? document.Styles().All() : runs).front().style);
+    document.Styles().Take(std::move(runs));
     if (all)
-        flow.LooksChanged();
+        flow.LooksChanged(guess);
     else
         flow.LooksChanged(start, end);
     hasTypingStyle = false;
@@ -219,16 +222,18 @@ void TextEditor::Select(EditSelection next) {
     if (old.from == next.from && old.to == next.to)
         return;
     hasTypingStyle = false;
-    DamageCaret();
+    Show([this] { DamageCaret(); });
     selection = next;
-    // What both cover looks as before.
-    if (old.Empty() || next.Empty() || old.End() <= next.Start() || next.End() <= old.Start()) {
-        DamageUnits(old.Start(), old.End());
-        DamageUnits(next.Start(), next.End());
-    } else {
-        DamageUnits(std::min(old.Start(), next.Start()), std::max(old.Start(), next.Start()));
-        DamageUnits(std::min(old.End(), next.End()), std::max(old.End(), next.End()));
-    }
+    Show([&] {
+        // What both cover looks as before.
+        if (old.Empty() || next.Empty() || old.End() <= next.Start() || next.End() <= old.Start()) {
+            DamageUnits(old.Start(), old.End());
+            DamageUnits(next.Start(), next.End());
+        } else {
+            DamageUnits(std::min(old.Start(), next.Start()), std::max(old.Start(), next.Start()));
+            DamageUnits(std::min(old.End(), next.End()), std::max(old.End(), next.End()));
+        }
+    });
     CaretChanged();
 }
 

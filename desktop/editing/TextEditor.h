@@ -10,6 +10,7 @@
 #include "desktop/editing/TextFlow.h"
 #include "host/OSTextEdit.h"
 #include <memory>
+#include <new>
 #include <string_view>
 
 class DrawingPort;
@@ -23,6 +24,9 @@ enum Bit : unsigned int { kStyled = 1, kSeveralLines = 2, kReadOnly = 4, kNoAuto
 } // namespace TextEditFlags
 
 // Whoever listens, or is asked as client, may delete the engine: nothing is done with it after such calls.
+//
+// When memory runs out in a change (std::bad_alloc), the text, its looks, the selection and what can be
+// undone are as before. Where it runs out in showing a change, the change stays, and all is drawn anew.
 class TextEditor : public OSTextEdit, private OS::TextEditLayoutInfo {
 public:
     TextEditor(Window, unsigned int flags);
@@ -96,7 +100,7 @@ private:
     bool IsStyled() const { return (flags & TextEditFlags::kStyled) != 0; }
     bool HasSeveralLines() const { return document.HasSeveralLines(); }
     bool IsReadOnly() const { return (flags & TextEditFlags::kReadOnly) != 0; }
-    void ReplaceText(std::size_t start, std::size_t end, TextFragment const &);
+    void ReplaceText(TextDocument::Replacement);
     void ReplaceByUser(std::size_t start, std::size_t end, std::u16string_view, EditHistory::Kind);
     void Type(std::u16string_view);
     std::size_t MostUnits() const;
@@ -104,9 +108,10 @@ private:
     EditStyle InsertionStyle() const;
     TextFragment LookingAs(std::u16string_view, EditStyle const &) const;
     TextFragment AsItMayLook(TextFragment const &) const;
+    EditStyle TypedStyle() const;
     void Record(std::size_t start, std::size_t end, std::u16string_view, EditHistory::Kind);
-    EditStep TakeBack(EditStep const &);
-    void ShowStep(EditSelection const &);
+    EditStep Reverse(EditStep const &) const;
+    void TakeStep(TextDocument::Replacement, EditSelection const &);
     void EndComposing();
     void RestoreComposed();
     void BroadcastTextChanged();
@@ -142,6 +147,8 @@ private:
     void ScrollAcrossTo(int h);
     void LayOutVisible();
     void KeepTop(ParagraphChange const &);
+    template <class Drawing> void Show(Drawing const &);
+    void DamageChange(ParagraphChange const &, long long heightBefore);
     std::size_t LastVisible() const;
     std::size_t UnitAtPoint(Point window);
     std::size_t CharacterAtPoint(Point window);
@@ -201,3 +208,12 @@ private:
     bool caretLit = true;
     mutable bool drawnSinceBlink = false; // otherwise nobody sees it
 };
+
+// For what only shows something: where there is no memory for it, all is drawn anew.
+template <class Drawing> void TextEditor::Show(Drawing const &show) {
+    try {
+        show();
+    } catch (std::bad_alloc const &) {
+        DamageAll();
+    }
+}

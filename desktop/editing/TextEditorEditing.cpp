@@ -55,16 +55,20 @@ TextFragment TextEditor::AsItMayLook(TextFragment const &fragment) const {
     return IsStyled() ? fragment : LookingAs(fragment.units, document.Styles().At(0));
 }
 
-// Changes the text and damages what looks different now; selection and history are the caller's.
-void TextEditor::ReplaceText(std::size_t start, std::size_t end, TextFragment const &fragment) {
-    DamageCaret();
+// Changes the text, which all memory is there for, and damages what looks different now; selection and
+// history are the caller's.
+void TextEditor::ReplaceText(TextDocument::Replacement replacement) {
+    Show([this] { DamageCaret(); });
     long long const heightBefore = flow.Height();
-    ParagraphChange const change = document.Replace(start, end - start, fragment);
+    ParagraphChange const change = document.Replace(std::move(replacement));
     flow.TextChanged(change);
     keepsWantedH = false;
     KeepTop(change);
-    if (!window)
-        return;
+    if (window)
+        Show([&] { DamageChange(change, heightBefore); });
+}
+
+void TextEditor::DamageChange(ParagraphChange const &change, long long heightBefore) {
     bool const sameCount = change.removed == change.added;
     for (std::size_t i = 0; sameCount && change.added <= kMostMeasured && i < change.added; ++i)
         flow.LayoutOf(change.first + i);
@@ -91,15 +95,26 @@ void TextEditor::KeepTop(ParagraphChange const &change) {
     topParagraph = std::min(topParagraph, document.Paragraphs().Count() - 1);
 }
 
-// Without a word to anybody.
+// Of what is typed: in the place of what is composed, as that would look.
+EditStyle TextEditor::TypedStyle() const {
+    if (!composing || hasTypingStyle)
+        return InsertionStyle();
+    return IsStyled() ? composedStyle : document.Styles().At(0);
+}
+
+// Without a word to anybody. What is composed counts as what it stands over. Everything that takes memory
+// comes before anything is changed.
 void TextEditor::Record(std::size_t start, std::size_t end, std::u16string_view units,
                         EditHistory::Kind kind) {
-    TextFragment const fragment = LookingAs(units, InsertionStyle());
-    EditStep step{start, document.FragmentOf(start, end), units.size(), selection, {}};
-    ReplaceText(start, end, fragment);
-    selection = {start + units.size(), start + units.size()};
-    step.selectionAfter = selection;
+    TextFragment const fragment = LookingAs(units, TypedStyle());
+    EditSelection const caret{start + units.size(), start + units.size()};
+    EditStep step{start, composing ? composedOver : document.FragmentOf(start, end), units.size(),
+                  composing ? composedFrom : selection, caret};
+    TextDocument::Replacement replacement = document.Prepare(start, end - start, fragment);
     history.Add(std::move(step), kind);
+    composing = false;
+    ReplaceText(std::move(replacement));
+    selection = caret;
     hasTypingStyle = false;
     CaretChanged();
 }
@@ -117,11 +132,13 @@ void TextEditor::Type(std::u16string_view units) {
     if (IsReadOnly())
         return;
     bool const composed = composing;
-    RestoreComposed();
-    std::u16string const typed = Fitted(units, selection.End() - selection.Start());
+    std::size_t const start = composed ? markStart : selection.Start();
+    std::size_t const end = composed ? markEnd : selection.End();
+    std::u16string const typed = Fitted(units, end - start);
     if (!typed.empty()) {
-        ReplaceByUser(selection.Start(), selection.End(), typed, EditHistory::kTyping);
+        ReplaceByUser(start, end, typed, EditHistory::kTyping);
     } else if (composed) {
+        RestoreComposed();
         CaretChanged();
         BroadcastTextChanged();
     }
@@ -166,22 +183,22 @@ void TextEditor::Delete(Action::Reach reach, Action::Way way) {
                       EditHistory::kDeleting);
 }
 
-// Carries out what the step says; the result takes that back.
-EditStep TextEditor::TakeBack(EditStep const &step) {
-    std::size_t const end = step.start + step.length;
-    EditStep reverse{step.start, document.FragmentOf(step.start, end), step.before.units.size(),
-                     step.selectionBefore, step.selectionAfter};
-    ReplaceText(step.start, end, AsItMayLook(step.before));
-    return reverse;
+// What takes the step back that is to be carried out.
+EditStep TextEditor::Reverse(EditStep const &step) const {
+    return {step.start, document.FragmentOf(step.start, step.start + step.length), step.before.units.size(),
+            step.selectionBefore, step.selectionAfter};
 }
 
 bool TextEditor::Undo() {
     EndComposing();
     if (IsReadOnly() || !history.CanUndo())
         return false;
-    EditStep const step = history.TakeDone();
-    history.AddUndone(TakeBack(step));
-    ShowStep(step.selectionBefore);
+    EditStep const &step = history.Done();
+    TextFragment const former = AsItMayLook(step.before);
+    EditSelection const selected = step.selectionBefore;
+    TextDocument::Replacement replacement = document.Prepare(step.start, step.length, former);
+    history.Undo(Reverse(step));
+    TakeStep(std::move(replacement), selected);
     return true;
 }
 
@@ -189,15 +206,19 @@ bool TextEditor::Redo() {
     EndComposing();
     if (IsReadOnly() || !history.CanRedo())
         return false;
-    EditStep const step = history.TakeUndone();
-    history.AddRedone(TakeBack(step));
-    ShowStep(step.selectionAfter);
+    EditStep const &step = history.Undone();
+    TextFragment const later = AsItMayLook(step.before);
+    EditSelection const selected = step.selectionAfter;
+    TextDocument::Replacement replacement = document.Prepare(step.start, step.length, later);
+    history.Redo(Reverse(step));
+    TakeStep(std::move(replacement), selected);
     return true;
 }
 
-// After a step of the history. Whoever is told may delete this.
-void TextEditor::ShowStep(EditSelection const &selected) {
+// A step of the history. Whoever is told may delete this.
+void TextEditor::TakeStep(TextDocument::Replacement replacement, EditSelection const &selected) {
     Alive const self = alive;
+    ReplaceText(std::move(replacement));
     selection = selected;
     DamageAll();
     CaretChanged();
@@ -218,16 +239,22 @@ void TextEditor::Compose(UString const &text, int caret) {
         BroadcastTextChanged();
         return;
     }
-    if (!composing) {
+    bool const begins = !composing;
+    std::size_t const start = begins ? selection.Start() : markStart;
+    std::size_t const end = begins ? selection.End() : markEnd;
+    EditStyle const style = begins ? InsertionStyle() : composedStyle;
+    TextFragment over = begins ? document.FragmentOf(start, end) : TextFragment();
+    std::u16string const units = Fitted(Utf::View(text), end - start);
+    TextFragment const shown = AsItMayLook(LookingAs(units, style));
+    TextDocument::Replacement replacement = document.Prepare(start, end - start, shown);
+    if (begins) {
         composedFrom = selection;
-        composedStyle = InsertionStyle();
-        composedOver = document.FragmentOf(selection.Start(), selection.End());
-        markStart = selection.Start();
-        markEnd = selection.End();
+        composedStyle = style;
+        composedOver = std::move(over);
+        markStart = start;
         composing = true;
     }
-    std::u16string const units = Fitted(Utf::View(text), markEnd - markStart);
-    ReplaceText(markStart, markEnd, AsItMayLook(LookingAs(units, composedStyle)));
+    ReplaceText(std::move(replacement));
     markEnd = markStart + units.size();
     std::size_t at = 0;
     for (int i = 0; i < caret && at < units.size(); ++i)
@@ -243,8 +270,10 @@ void TextEditor::Compose(UString const &text, int caret) {
 void TextEditor::RestoreComposed() {
     if (!composing)
         return;
+    TextFragment const former = AsItMayLook(composedOver);
+    TextDocument::Replacement replacement = document.Prepare(markStart, markEnd - markStart, former);
     composing = false;
-    ReplaceText(markStart, markEnd, AsItMayLook(composedOver));
+    ReplaceText(std::move(replacement));
     selection = composedFrom;
 }
 
@@ -254,7 +283,6 @@ void TextEditor::EndComposing() {
         return;
     std::u16string const units = document.Units().Copy(markStart, markEnd);
     std::size_t const caret = selection.to;
-    RestoreComposed();
-    Record(selection.Start(), selection.End(), units, EditHistory::kTyping);
+    Record(markStart, markEnd, units, EditHistory::kTyping);
     selection = {caret, caret};
 }

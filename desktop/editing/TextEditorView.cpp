@@ -79,8 +79,11 @@ void TextEditor::LayOut() {
 
 // A line that has become shorter, or has got more room, does not leave its end for nothing.
 void TextEditor::KeepTextInSight() {
-    if (scrollLeft != 0)
-        ScrollAcross(scrollLeft);
+    if (scrollLeft == 0)
+        return;
+    int const left = scrollLeft;
+    scrollLeft = 0; // in case that there is no memory to look at the line
+    ScrollAcross(left);
 }
 
 void TextEditor::ScrollAcross(int left) {
@@ -141,10 +144,13 @@ bool TextEditor::ScrollIntoView(std::size_t unit) {
 
 // Whoever hears of it may delete this.
 void TextEditor::FollowCaret() {
-    if (!autoScrolls || !window || !ScrollIntoView(selection.to))
-        return;
-    TextFocus::CaretMoved(*this);
-    if (HasDependents())
+    bool scrolled = false;
+    Show([&] {
+        scrolled = autoScrolls && window && ScrollIntoView(selection.to);
+        if (scrolled)
+            TextFocus::CaretMoved(*this);
+    });
+    if (scrolled && HasDependents())
         BroadcastChange(AutoScrolledMsg(), nullptr);
 }
 
@@ -269,10 +275,12 @@ void TextEditor::CaretChanged() {
     caretLit = true;
     if (!active)
         return;
-    if (!IsReadOnly())
-        blinking.Restart();
-    DamageCaret();
-    TextFocus::CaretMoved(*this);
+    Show([this] {
+        if (!IsReadOnly())
+            blinking.Restart();
+        DamageCaret();
+        TextFocus::CaretMoved(*this);
+    });
 }
 
 // While the last change of the insertion point has not been drawn, the pane is hidden, and nothing that lies

@@ -1,6 +1,7 @@
 #include "desktop/editing/TextFlow.h"
 #include "desktop/type/FontLibrary.h"
 #include <algorithm>
+#include <iterator>
 
 namespace {
 
@@ -14,13 +15,15 @@ std::size_t const kMostLayouts = 512;
 TextFlow::TextFlow(TextDocument &document_)
     : document(document_) {}
 
-int TextFlow::LineHeight() const {
-    return std::max(FontLibrary::Instance().Metrics(document.Styles().At(0).Font()).LineHeight(), 1);
+int TextFlow::LineHeightOf(EditStyle const &style) {
+    return std::max(FontLibrary::Instance().Metrics(style.Font()).LineHeight(), 1);
 }
 
-HeightGuess TextFlow::Guess() const {
+int TextFlow::LineHeight() const { return LineHeightOf(document.Styles().At(0)); }
+
+HeightGuess TextFlow::GuessFor(EditStyle const &style) const {
     HeightGuess guess;
-    int const lineHeight = LineHeight(), letter = std::max(lineHeight / kWidthShare, 1);
+    int const lineHeight = LineHeightOf(style), letter = std::max(lineHeight / kWidthShare, 1);
     guess.lineHeight = static_cast<std::uint32_t>(lineHeight);
     if (document.HasSeveralLines())
         guess.unitsPerLine = static_cast<std::uint32_t>(std::max(width / letter, 1));
@@ -32,12 +35,13 @@ void TextFlow::SetRoom(int width_, TextSettings::Alignment alignment_) {
         return;
     width = width_;
     alignment = alignment_;
-    LooksChanged();
+    layouts.clear();
+    LooksChanged(GuessFor(document.Styles().At(0)));
 }
 
-void TextFlow::LooksChanged() {
+void TextFlow::LooksChanged(HeightGuess const &guess) noexcept {
     layouts.clear();
-    document.GuessHeights(Guess());
+    document.GuessHeights(guess);
 }
 
 void TextFlow::LooksChanged(std::size_t start, std::size_t end) {
@@ -46,21 +50,25 @@ void TextFlow::LooksChanged(std::size_t start, std::size_t end) {
     layouts.erase(layouts.lower_bound(first), layouts.upper_bound(last));
 }
 
-// Layouts of paragraphs behind the change go on under their new numbers.
-void TextFlow::TextChanged(ParagraphChange const &change) {
+// Layouts of paragraphs behind the change go on under their new numbers: those that move away from it from
+// the last on, so that none comes where another one still is.
+void TextFlow::TextChanged(ParagraphChange const &change) noexcept {
     std::size_t const behind = change.first + change.removed;
-    if (change.removed == change.added) {
-        layouts.erase(layouts.lower_bound(change.first), layouts.lower_bound(behind));
-        return;
+    auto next = layouts.erase(layouts.lower_bound(change.first), layouts.lower_bound(behind));
+    auto const renumber = [&](auto from) {
+        auto node = layouts.extract(from);
+        node.key() += change.added;
+        node.key() -= change.removed;
+        return layouts.insert(std::move(node)).position;
+    };
+    if (change.added < change.removed) {
+        while (next != layouts.end())
+            next = std::next(renumber(next));
+    } else if (change.added > change.removed) {
+        std::size_t count = static_cast<std::size_t>(std::distance(next, layouts.end()));
+        for (auto last = layouts.end(); count > 0; --count)
+            last = renumber(std::prev(last));
     }
-    std::map<std::size_t, std::unique_ptr<ParagraphLayout>> kept;
-    for (auto &[paragraph, layout] : layouts) {
-        if (paragraph < change.first)
-            kept.emplace(paragraph, std::move(layout));
-        else if (paragraph >= behind)
-            kept.emplace(paragraph - change.removed + change.added, std::move(layout));
-    }
-    layouts.swap(kept);
 }
 
 ParagraphLayout const &TextFlow::LayoutOf(std::size_t paragraph) {

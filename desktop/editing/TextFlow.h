@@ -16,10 +16,12 @@ public:
 
     // The box that lines are aligned and, in a text of several lines, broken in.
     void SetRoom(int width, TextSettings::Alignment);
+    // How high what is not laid out will be, if the text begins with this look.
+    HeightGuess GuessFor(EditStyle const &) const;
     // To be called with every change of the document's text.
-    void TextChanged(ParagraphChange const &);
-    // And when the look of all that is there may have changed.
-    void LooksChanged();
+    void TextChanged(ParagraphChange const &) noexcept;
+    // And when the look of all that is there may have changed; the guess is the one for the new look.
+    void LooksChanged(HeightGuess const &) noexcept;
     // The same of what lies between the two places.
     void LooksChanged(std::size_t start, std::size_t end);
 
@@ -65,8 +67,8 @@ private:
         std::size_t paragraph, start, unit;
     };
     Spot SpotOf(std::size_t unit) const;
+    static int LineHeightOf(EditStyle const &);
     Spot SpotAtHeight(long long v, std::size_t &line);
-    HeightGuess Guess() const;
 
     TextDocument &document;
     int width = 0;

@@ -298,10 +298,7 @@ void Glog::SetScale(DeviceScale scale_) {
 
 void Glog::DamageAll() { DamageWindowRect({0, 0, Coordinate16(height), Coordinate16(width)}); }
 
-void Glog::DamageWindowRect(Rect const &r) {
-    OSRgn region(r);
-    port.DamageWindow(region);
-}
+void Glog::DamageWindowRect(Rect const &r) { port.DamageWindow(r); }
 
 void Glog::Update() {
     if (started && hasNewPanes)

@@ -31,7 +31,7 @@ protected:
         return made;
     }
     void Replace(std::size_t first, std::size_t count, std::vector<Paragraph> const &others) {
-        index.Replace(first, count, others);
+        index.Replace(index.Prepare(first, count, others));
         plain.Replace(first, count, others);
     }
 
@@ -125,11 +125,11 @@ TEST_F(ParagraphIndexTest, AllHeightsAreGuessedAnew) {
 }
 
 TEST_F(ParagraphIndexTest, OneOfAMillionIsAddedAndTakenAway) {
-    index.Replace(0, 1, std::vector<Paragraph>(1000000, {60, 14, false}));
+    index.Replace(index.Prepare(0, 1, std::vector<Paragraph>(1000000, {60, 14, false})));
     for (int i = 0; i < 500; ++i) {
-        index.Replace(500000, 1, {{30, 14, false}, {31, 14, false}});
+        index.Replace(index.Prepare(500000, 1, {{30, 14, false}, {31, 14, false}}));
         EXPECT_EQ(index.StartOf(500001), 30000030u);
-        index.Replace(500000, 2, {{60, 14, false}});
+        index.Replace(index.Prepare(500000, 2, {{60, 14, false}}));
     }
     EXPECT_EQ(index.Units(), 60000000u);
     EXPECT_EQ(index.AtUnit(59999999), 999999u);
