@@ -1,36 +1,24 @@
 // Memory that runs out at any moment of an item's life: at each use of memory there is, once.
 //
 // What is asked for from the C++ library is meant; the libraries underneath end the program by themselves.
-#include "desktop/SimulatedDesktop.h"
-#include "desktop/panes/DesktopRep.h"
-#include "desktop/panes/Glog.h"
-#include "desktop/windows/EventLoop.h"
 #include "dialogs/DialogReader.h"
 #include "dialogs/ItemRegistry.h"
 #include "dialogs/LoadGlog.h"
 #include "dialogs/PaneMaker.h"
-#include "host/CompoundPane.h"
 #include "host/GlogPane.h"
-#include "host/TarnError.h"
-#include "host/glogRec.h"
-#include "tests/frame/Allocations.h"
-#include <algorithm>
+#include "tests/memory/MemoryTest.h"
 #include <fstream>
-#include <functional>
-#include <gtest/gtest.h>
-#include <new>
-#include <string>
+#include <stdexcept>
 #include <vector>
 
 namespace {
 
 std::string const kItems = std::string(GLOG_TEST_SOURCE_DIR) + "/memory/items.xml";
 int const kWidth = 200, kHeight = 120;
-long const kMostUses = 20000; // of memory; more would be a loop without end
 
 std::vector<std::string> Types() { return ItemRegistry::Instance().Names(); }
 
-class ItemMemory : public testing::TestWithParam<std::string> {
+class ItemMemory : public MemoryTest, public testing::WithParamInterface<std::string> {
 protected:
     ItemMemory()
         : dialog(DialogReader::ReadFile(kItems))
@@ -56,34 +44,6 @@ protected:
         return std::string();
     }
 
-    // Does it, with memory that runs out after so many uses. True when it did run out.
-    static bool RunsOut(long uses, std::function<void()> const &action) {
-        Allocations::FailAfter const fail(uses);
-        try {
-            action();
-        } catch (TarnError const &) {
-            EXPECT_TRUE(fail.HasFailed());
-        } catch (std::bad_alloc const &) {
-            EXPECT_TRUE(fail.HasFailed());
-        } catch (LoadError const &error) {
-            EXPECT_TRUE(fail.HasFailed()) << error.what();
-        }
-        return fail.HasFailed();
-    }
-
-    // With each use of memory failing in its turn. The check comes after each time; the count of times.
-    static long ForEachUse(std::function<void()> const &action, std::function<void()> const &check) {
-        long uses = 0;
-        for (bool ranOut = true; ranOut && uses < kMostUses; ++uses) {
-            ranOut = RunsOut(uses, action);
-            check();
-            if (HasFatalFailure())
-                break;
-        }
-        EXPECT_LT(uses, kMostUses);
-        return uses;
-    }
-
     std::vector<GlogPane *> Panes() const { return Glog::From(glog).Items(); }
 
     // The item in a window that is shown.
@@ -98,20 +58,9 @@ protected:
     // The script, with each use of memory failing in its turn; afterwards the window works as before.
     void PlayWithoutMemory(std::string const &script) {
         Show();
-        ForEachUse([&] { desktop.Play(script); },
-                   [this] {
-                       desktop.Play("release\nkey Escape\n");
-                       ASSERT_FALSE(EventLoop::Instance().IsTracking());
-                       ASSERT_FALSE(GlogError(glog));
-                       ASSERT_EQ(DesktopRep::Of(desktop).Glogs().size(), 1u) << "a window is left open";
-                   });
-        Glog::From(glog).DamageAll();
-        UpdateGlog(glog);
-        EXPECT_FALSE(Glog::From(glog).NeedsUpdate());
-        EXPECT_FALSE(desktop.DumpTree(glog).empty());
+        PlayForEachUse(glog, script);
     }
 
-    SimulatedDesktop desktop;
     Dialog dialog;
     glogRec *glog;
 };
@@ -134,18 +83,8 @@ TEST_P(ItemMemory, LeavesNothingHalfMadeInItsWindow) {
 }
 
 TEST_P(ItemMemory, LeavesNoWindowWhereItsDialogIsLoaded) {
-    std::size_t const before = DesktopRep::Of(desktop).Glogs().size();
     std::string const xml = "<Glog width=\"200\" height=\"120\"><Items>" + Written() + "</Items></Glog>";
-    glogRec *loaded = nullptr;
-    ForEachUse(
-        [&] {
-            loaded = nullptr;
-            loaded = LoadGlogFromText(xml, "item");
-        },
-        [&] {
-            ASSERT_EQ(DesktopRep::Of(desktop).Glogs().size(), before + (loaded ? 1 : 0));
-            DisposeGlog(loaded);
-        });
+    LoadForEachUse([&] { return LoadGlogFromText(xml, "item"); });
 }
 
 TEST_P(ItemMemory, IsDrawnAgainAfterADrawingWithout) {
