@@ -15,6 +15,8 @@ CairoScope::CairoScope(DrawingPort &port_, Rect const &bounds)
     if (box.Empty())
         return;
     port.touched.Add(box);
+    if (port.device->ground.Waits())
+        port.device->ground.Prepare(box, port.device->clip);
 
     context = port.device->UpdateContext(port);
     if (port.surface)

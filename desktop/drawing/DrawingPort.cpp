@@ -153,11 +153,13 @@ void DrawingPort::SetClipState(ClipState const &kept) {
     CutClip(kept.region);
 }
 
-void DrawingPort::FillClip(OS::RGBAColor const &color) {
+void DrawingPort::LayGround(OS::RGBAColor const &color) {
     PixelScope scope(*this);
     if (scope.CanDraw())
-        scope.Fill(device->clipBounds, color);
+        scope.LayGround(color);
 }
+
+void DrawingPort::FinishGround() { device->ground.Finish(); }
 
 void DrawingPort::NarrowClipTo(Rect const &window) {
     Region::IntersectRect(clip, window);
@@ -377,6 +379,7 @@ void DrawingPort::MoveDevicePixels(OSRgn const &destination, int dh, int dv) {
     if (boxes.empty())
         return;
     NoteMove(boxes, dx, dy);
+    FinishGround();
     pixman_region32_t region;
     pixman_region32_init_rects(&region, boxes.data(), static_cast<int>(boxes.size()));
     MovePixels(*surface, region, dx, dy);

@@ -105,8 +105,10 @@ public:
     // What shapes are drawn in: the foreground, or the shade that darkens by as much as the state says.
     OS::RGBAColor Ink() const;
 
-    // Covers all of the clip with the colour, whatever the state.
-    void FillClip(OS::RGBAColor const &);
+    // Covers all of the clip with the colour, whatever the state. Need not do so at once: what is drawn next
+    // comes to lie on it, but the surface has it only after FinishGround.
+    void LayGround(OS::RGBAColor const &);
+    void FinishGround();
 
     // What waits to be redrawn, in window coordinates. Damage takes a local rectangle.
     void Damage(Rect const &local);

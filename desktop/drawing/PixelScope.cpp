@@ -3,7 +3,6 @@
 #include "desktop/drawing/Surface.h"
 #include <algorithm>
 #include <cmath>
-#include <cwchar>
 
 namespace {
 
@@ -29,20 +28,8 @@ pixman_color_t PremultipliedColor(OS::RGBAColor const &color) {
             Component16(Unit(color.b) * alpha), Component16(alpha)};
 }
 
-// Of so few pixels a row is done before a function of the C library has begun: frames, scroll bars, carets.
+// Of so few pixels a row is done before a function of the C library has begun: tiles of a scroll bar.
 constexpr int kNarrow = 16;
-
-// The C library fills wide characters as fast as the machine can, and a pixel is as large as one.
-static_assert(sizeof(wchar_t) == sizeof(std::uint32_t), "a pixel and a wide character have the same size");
-void FillRow(std::uint32_t *row, int width, std::uint32_t pixel) {
-    std::wmemset(reinterpret_cast<wchar_t *>(row), static_cast<wchar_t>(pixel),
-                 static_cast<std::size_t>(width));
-}
-
-void FillNarrowRow(std::uint32_t *row, int width, std::uint32_t pixel) {
-    for (int i = 0; i < width; ++i)
-        row[i] = pixel;
-}
 
 void CopyNarrowRow(std::uint32_t const *from, int width, std::uint32_t *to) {
     for (int i = 0; i < width; ++i)
@@ -141,11 +128,21 @@ void ForEachTile(DeviceRect const &part, int left, int top, int width, int heigh
 
 } // namespace
 
-template <class Draw> void PixelScope::ForEachVisible(DeviceRect const &r, Draw draw) {
+void PixelScope::PrepareGround(DeviceRect const &visible, Hides hides) {
+    if (!device->ground.Waits())
+        return;
+    if (hides == Hides::kAll)
+        device->ground.Cover(visible, device->clip);
+    else
+        device->ground.Prepare(visible, device->clip);
+}
+
+template <class Draw> void PixelScope::ForEachVisible(DeviceRect const &r, Hides hides, Draw draw) {
     DeviceRect box = r.Intersected(device->clipBounds);
     if (box.Empty())
         return;
     port.touched.Add(box);
+    PrepareGround(box, hides);
     if (device->clipIsBox) {
         draw(box);
         return;
@@ -159,15 +156,14 @@ template <class Draw> void PixelScope::ForEachVisible(DeviceRect const &r, Draw 
     }
 }
 
-void PixelScope::FillPixels(DeviceRect const &r, std::uint32_t pixel) {
-    Surface &surface = *port.surface;
-    int const width = r.Width();
-    std::uint32_t *row = surface.Row(r.top) + r.left;
-    for (int y = r.top; y < r.bottom; ++y, row += surface.Width())
-        if (width <= kNarrow)
-            FillNarrowRow(row, width, pixel);
-        else
-            FillRow(row, width, pixel);
+void PixelScope::FindPixel(OS::RGBAColor const &color) {
+    if (device->IsColor(color))
+        return;
+    double const alpha = Unit(color.a);
+    device->color = color;
+    device->pixel = Component8(alpha) << 24 | Component8(Unit(color.r) * alpha) << 16 |
+                    Component8(Unit(color.g) * alpha) << 8 | Component8(Unit(color.b) * alpha);
+    device->solid = device->pixel >> 24 == kFullAlpha;
 }
 
 void PixelScope::FillBox(DeviceRect const &r, OS::RGBAColor const &color) {
@@ -175,25 +171,30 @@ void PixelScope::FillBox(DeviceRect const &r, OS::RGBAColor const &color) {
         PageDrawing::Fill(device->UpdateContext(port), r, color);
         return;
     }
-    if (!device->IsColor(color)) {
-        double alpha = Unit(color.a);
-        device->color = color;
-        device->pixel = Component8(alpha) << 24 | Component8(Unit(color.r) * alpha) << 16 |
-                        Component8(Unit(color.g) * alpha) << 8 | Component8(Unit(color.b) * alpha);
-        device->solid = device->pixel >> 24 == kFullAlpha;
-    }
+    FindPixel(color);
     if (device->solid) {
-        ForEachVisible(r, [&](DeviceRect const &part) { FillPixels(part, device->pixel); });
+        ForEachVisible(r, Hides::kAll,
+                       [&](DeviceRect const &part) { port.surface->Fill(part, device->pixel); });
         return;
     }
     pixman_color_t const over = PremultipliedColor(color);
-    ForEachVisible(r, [&](DeviceRect const &part) {
+    ForEachVisible(r, Hides::kNotAll, [&](DeviceRect const &part) {
         pixman_box32_t box = {part.left, part.top, part.right, part.bottom};
         pixman_image_fill_boxes(PIXMAN_OP_OVER, port.surface->PixmanImage(), &over, 1, &box);
     });
 }
 
 void PixelScope::Cover(OS::RGBAColor const &color) { FillBox(device->clipBounds, color); }
+
+void PixelScope::LayGround(OS::RGBAColor const &color) {
+    if (port.page) {
+        FillBox(device->clipBounds, color);
+        return;
+    }
+    port.touched.Add(device->clipBounds);
+    FindPixel(color);
+    device->ground.Begin(*port.surface, device->clip, device->pixel);
+}
 
 void PixelScope::FillFrame(DeviceRect const &outer, DeviceRect const &inner, OS::RGBAColor const &color) {
     if (inner.Empty()) {
@@ -224,7 +225,7 @@ void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRec
     bool const inTiles = repeats && image.width * image.height >= kSmallestTile;
     DeviceRect const solid = image.opaque ? DeviceRect{0, 0, image.width, image.height} : image.solid;
     if (inTiles && !solid.Empty() && !faded && port.state.darken == 0) {
-        ForEachVisible(box, [&](DeviceRect const &visible) {
+        ForEachVisible(box, image.opaque ? Hides::kAll : Hides::kNotAll, [&](DeviceRect const &visible) {
             ForEachTile(visible, left, top, image.width, image.height,
                         [&](DeviceRect const &part, int fromH, int fromV) {
                             CopyTile(image.pixels, fromH, fromV, solid, *port.surface, part);
@@ -239,7 +240,8 @@ void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRec
             pixman_image_composite32(operation, source, mask, target, fromH, fromV, fromH, fromV, part.left,
                                      part.top, part.Width(), part.Height());
         };
-        ForEachVisible(box, [&](DeviceRect const &part) {
+        bool const hides = operation == PIXMAN_OP_SRC;
+        ForEachVisible(box, hides ? Hides::kAll : Hides::kNotAll, [&](DeviceRect const &part) {
             if (inTiles)
                 ForEachTile(part, left, top, image.width, image.height, drawPart);
             else
@@ -254,6 +256,42 @@ void PixelScope::DrawImage(PixelImage const &image, int left, int top, DeviceRec
         compose(image.opaque ? PIXMAN_OP_SRC : PIXMAN_OP_OVER, image.pixels, nullptr);
 }
 
+pixman_image_t *PixelScope::InkImage() {
+    OS::RGBAColor const ink = port.Ink();
+    if (!device->inkImage || !DrawingPort::Device::Same(device->ink, ink)) {
+        if (device->inkImage)
+            pixman_image_unref(device->inkImage);
+        pixman_color_t const color = PremultipliedColor(ink);
+        device->inkImage = pixman_image_create_solid_fill(&color);
+        device->ink = ink;
+    }
+    return device->inkImage;
+}
+
+void PixelScope::DrawGlyphs(PlacedGlyphs const &glyphs, DeviceRect const &cut) {
+    DeviceRect const visible = glyphs.Ink().Intersected(device->clipBounds).Intersected(cut);
+    if (visible.Empty())
+        return;
+    pixman_image_t *const color = InkImage(), *const target = port.surface->PixmanImage();
+    if (!color)
+        return;
+    port.touched.Add(visible);
+    PrepareGround(visible, Hides::kNotAll);
+    bool const allVisible = device->clipIsBox && visible.Contains(glyphs.Ink());
+    if (!allVisible) {
+        pixman_region32_t clip;
+        pixman_region32_init(&clip);
+        pixman_region32_intersect_rect(&clip, &device->clip, visible.left, visible.top,
+                                       static_cast<unsigned>(visible.Width()),
+                                       static_cast<unsigned>(visible.Height()));
+        pixman_image_set_clip_region32(target, &clip);
+        pixman_region32_fini(&clip);
+    }
+    glyphs.Draw(target, color);
+    if (!allVisible)
+        pixman_image_set_clip_region32(target, nullptr);
+}
+
 void PixelScope::FillThrough(pixman_image_t *mask, int fromH, int fromV, DeviceRect const &box,
                              OS::RGBAColor const &color) {
     if (!mask || !Meets(box))
@@ -265,7 +303,7 @@ void PixelScope::FillThrough(pixman_image_t *mask, int fromH, int fromV, DeviceR
         return;
     }
     SolidImage const solid(PremultipliedColor(ink));
-    ForEachVisible(box, [&](DeviceRect const &part) {
+    ForEachVisible(box, Hides::kNotAll, [&](DeviceRect const &part) {
         pixman_image_composite32(PIXMAN_OP_OVER, solid.Get(), mask, port.surface->PixmanImage(), 0, 0,
                                  part.left - box.left + fromH, part.top - box.top + fromV, part.left,
                                  part.top, part.Width(), part.Height());

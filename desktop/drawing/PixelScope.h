@@ -1,7 +1,9 @@
 // Drawing in whole device pixels.
 #pragma once
 #include "desktop/drawing/DrawingPort.h"
+#include "desktop/drawing/PlacedGlyphs.h"
 #include "desktop/drawing/PortDevice.h"
+#include "desktop/drawing/Surface.h"
 #include <cstdint>
 #include <pixman.h>
 
@@ -51,13 +53,17 @@ public:
         // clip of one box.
         if (device->clipIsBox && device->solid && device->IsColor(color) && port.state.darken == 0) {
             port.touched.Add(box);
-            FillPixels(box, device->pixel);
+            if (device->ground.Waits())
+                device->ground.Cover(box, device->clip);
+            port.surface->Fill(box, device->pixel);
         } else {
             FillBox(box, port.state.darken != 0 ? port.Ink() : color);
         }
     }
     // All of the clip, without regard to darkening.
     void Cover(OS::RGBAColor const &);
+    // The same, as the ground of what is drawn next, in a colour that is opaque.
+    void LayGround(OS::RGBAColor const &);
     // The four bars between the outer and the inner box, which must not reach beyond the outer. An empty
     // inner box fills all.
     void FillFrame(DeviceRect const &outer, DeviceRect const &inner, OS::RGBAColor const &);
@@ -70,10 +76,22 @@ public:
     void FillThrough(pixman_image_t *mask, int fromH, int fromV, DeviceRect const &box,
                      OS::RGBAColor const &);
 
+    // Whether glyphs can be drawn as masks: not on paper, nor where the clip has smooth edges.
+    bool TakesGlyphs() const { return !port.page && !port.clipPath; }
+    // Of a point in local coordinates, in device pixels.
+    double GlyphH(double h) const { return (h + port.originH) * port.scale.Factor(); }
+    double GlyphV(double v) const { return (v + port.originV) * port.scale.Factor(); }
+    // In the ink of the port, as far as they lie in `cut`.
+    void DrawGlyphs(PlacedGlyphs const &, DeviceRect const &cut);
+
 private:
     void FillBox(DeviceRect const &, OS::RGBAColor const &);
-    void FillPixels(DeviceRect const &, std::uint32_t pixel);
-    template <class Draw> void ForEachVisible(DeviceRect const &, Draw);
+    pixman_image_t *InkImage(); // null when memory was wanting
+    // Whether what is drawn leaves nothing of what was there before.
+    enum class Hides { kAll, kNotAll };
+    template <class Draw> void ForEachVisible(DeviceRect const &, Hides, Draw);
+    void PrepareGround(DeviceRect const &visible, Hides);
+    void FindPixel(OS::RGBAColor const &);
 
     DrawingPort &port;
     DrawingPort::Device *device;

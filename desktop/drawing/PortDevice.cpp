@@ -10,6 +10,8 @@ DrawingPort::Device::Device() { pixman_region32_init(&clip); }
 DrawingPort::Device::~Device() {
     ForgetSurface();
     pixman_region32_fini(&clip);
+    if (inkImage)
+        pixman_image_unref(inkImage);
 }
 
 void DrawingPort::Device::ForgetClip() {
@@ -19,6 +21,7 @@ void DrawingPort::Device::ForgetClip() {
 
 void DrawingPort::Device::ForgetSurface() {
     ForgetClip();
+    ground.Forget();
     if (context)
         cairo_destroy(context);
     context = nullptr;

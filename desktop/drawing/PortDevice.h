@@ -1,6 +1,7 @@
 // What a port keeps about its surface between drawing calls.
 #pragma once
 #include "desktop/drawing/DrawingPort.h"
+#include "desktop/drawing/Ground.h"
 #include <cstdint>
 #include <pixman.h>
 
@@ -31,12 +32,19 @@ struct DrawingPort::Device {
     cairo_t *context = nullptr;
     bool contextClipKnown = false;
 
-    bool IsColor(OS::RGBAColor const &c) const {
-        return c.r == color.r && c.g == color.g && c.b == color.b && c.a == color.a;
+    static bool Same(OS::RGBAColor const &a, OS::RGBAColor const &b) {
+        return a.r == b.r && a.g == b.g && a.b == b.b && a.a == b.a;
     }
+    bool IsColor(OS::RGBAColor const &c) const { return Same(c, color); }
 
     // The last colour drawn in, as a premultiplied pixel.
     OS::RGBAColor color;
     std::uint32_t pixel = 0xFF000000u;
     bool solid = true; // has full alpha
+
+    Ground ground; // of the surface
+
+    // The last ink that glyphs were drawn in, and an image of nothing else; null before there was any.
+    OS::RGBAColor ink;
+    pixman_image_t *inkImage = nullptr;
 };

@@ -4,6 +4,7 @@
 #include <array>
 #include <cairo.h>
 #include <cstring>
+#include <cwchar>
 #include <fstream>
 #include <pixman.h>
 
@@ -37,6 +38,21 @@ pixman_image_t *NewImage(std::uint32_t *pixels, int width, int height) {
     if (!image)
         throw std::bad_alloc();
     return image;
+}
+
+// Of so few pixels a row is done before a function of the C library has begun: frames, scroll bars, carets.
+constexpr int kNarrow = 16;
+
+// The C library fills wide characters as fast as the machine can, and a pixel is as large as one.
+static_assert(sizeof(wchar_t) == sizeof(std::uint32_t), "a pixel and a wide character have the same size");
+void FillRow(std::uint32_t *row, int width, std::uint32_t pixel) {
+    std::wmemset(reinterpret_cast<wchar_t *>(row), static_cast<wchar_t>(pixel),
+                 static_cast<std::size_t>(width));
+}
+
+void FillNarrowRow(std::uint32_t *row, int width, std::uint32_t pixel) {
+    for (int i = 0; i < width; ++i)
+        row[i] = pixel;
 }
 
 struct CairoSurfaceFree {
@@ -95,6 +111,16 @@ cairo_surface_t *Surface::CairoSurface() {
                                                     CAIRO_FORMAT_ARGB32, width, height,
                                                     width * static_cast<int>(sizeof(std::uint32_t)));
     return cairo;
+}
+
+void Surface::Fill(DeviceRect const &r, std::uint32_t pixel) {
+    int const across = r.Width();
+    std::uint32_t *row = Row(r.top) + r.left;
+    for (int y = r.top; y < r.bottom; ++y, row += width)
+        if (across <= kNarrow)
+            FillNarrowRow(row, across, pixel);
+        else
+            FillRow(row, across, pixel);
 }
 
 bool Surface::IsOpaque() const {

@@ -31,6 +31,9 @@ public:
         return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
     }
 
+    // The rectangle must lie within.
+    void Fill(DeviceRect const &, std::uint32_t pixel);
+
     pixman_image_t *PixmanImage() const { return image; }
     // Made at the first call: a window without text or curves needs none.
     cairo_surface_t *CairoSurface();

@@ -334,6 +334,7 @@ void Glog::DrawDamage(OSRgn const &region) {
             glog.updateRegion = &region_;
         }
         ~Updating() {
+            glog.port.FinishGround();
             if (!done)
                 glog.port.DamageWindow(*glog.updateRegion);
             glog.updateRegion = nullptr;
@@ -345,7 +346,7 @@ void Glog::DrawDamage(OSRgn const &region) {
     Updating updating(*this, region);
     port.SetOrigin(0, 0);
     port.SetBoundary(region);
-    port.FillClip(ToRGBA(GetContentColor()));
+    port.LayGround(ToRGBA(GetContentColor()));
     OSRgn local(region);
     ForEachItem([&](GlogPane &pane) { PaneAccess::Draw(pane, &local); });
     updating.done = true;
@@ -361,6 +362,7 @@ void Glog::MoveShown(bool outlineChanged) {
 }
 
 void Glog::Present(std::vector<DeviceRect> const &rects) {
+    port.FinishGround(); // for whoever has the window shown while it is being drawn
     std::vector<PixelOverlay> const menus = MenuTracker::DrawnOver(*this);
     WithOutline const outlined(*surface, scale, outline);
     WithOverlays const covered(*surface, menus);

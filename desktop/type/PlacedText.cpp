@@ -1,5 +1,6 @@
 #include "desktop/type/PlacedText.h"
 #include "desktop/drawing/DrawingPort.h"
+#include "desktop/drawing/PixelScope.h"
 #include <algorithm>
 #include <cairo.h>
 #include <cmath>
@@ -43,9 +44,23 @@ struct Lie {
     float scale;
 };
 
+// False where Cairo has to draw.
+bool DrawAsMasks(DrawingPort &port, ShapedText const &text, Lie const &lie, Rect const &bounds) {
+    if (lie.scale != 1 || !port.Visible(bounds))
+        return lie.scale == 1;
+    PixelScope scope(port);
+    if (!scope.CanDraw())
+        return true;
+    if (!scope.TakesGlyphs() || !text.HasMasks(port.Scale()))
+        return false;
+    text.DrawMasks(scope, port.Scale(), lie.left, lie.baseline, lie.width, lie.alignment,
+                   scope.ToDevice(bounds));
+    return true;
+}
+
 void DrawWithin(ShapedText const &text, Lie const &lie, Rect const &bounds, Rect const *cut) {
     DrawingPort *port = DrawingPort::CurrentPort();
-    if (!port)
+    if (!port || DrawAsMasks(*port, text, lie, bounds))
         return;
     CairoScope const scope(*port, bounds);
     cairo_t *context = scope.Context();

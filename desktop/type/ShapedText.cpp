@@ -1,4 +1,7 @@
 #include "desktop/type/ShapedText.h"
+#include "desktop/drawing/GlyphMasks.h"
+#include "desktop/drawing/PixelScope.h"
+#include "desktop/drawing/PlacedGlyphs.h"
 #include "desktop/type/FontLibrary.h"
 #include "desktop/type/PlainShaper.h"
 #include "desktop/type/TextSanitizer.h"
@@ -279,5 +282,35 @@ void ShapedText::DrawRuns(cairo_t *context, Run const *&run, Glyph const *&glyph
                               baseline + static_cast<double>(glyph->v) / PANGO_SCALE});
         cairo_set_scaled_font(context, run->font);
         cairo_show_glyphs(context, placed.data(), static_cast<int>(placed.size()));
+    }
+}
+
+bool ShapedText::HasMasks(DeviceScale scale) const {
+    if (layout)
+        return false;
+    Glyph const *glyph = glyphs.data();
+    for (Run const &run : runs) {
+        GlyphMasks &masks = GlyphMasks::Of(run.font, scale);
+        for (Glyph const *const last = glyph + run.glyphs; glyph != last; ++glyph)
+            if (!masks.Find(glyph->index))
+                return false;
+    }
+    return true;
+}
+
+void ShapedText::DrawMasks(PixelScope &scope, DeviceScale scale, int h, int baseline, int boxWidth,
+                           TextSettings::Alignment alignment, DeviceRect const &cut) const {
+    Run const *run = runs.data();
+    Glyph const *glyph = glyphs.data();
+    for (Line const &line : lines) {
+        int const start = h + LineStart(line.width, boxWidth, alignment, line.rightToLeft);
+        for (Run const *const end = run + line.runs; run != end; ++run) {
+            PlacedGlyphs placed(GlyphMasks::Of(run->font, scale));
+            for (Glyph const *const last = glyph + run->glyphs; glyph != last; ++glyph)
+                placed.Add(glyph->index, scope.GlyphH(start + static_cast<double>(glyph->h) / PANGO_SCALE),
+                           scope.GlyphV(baseline + static_cast<double>(glyph->v) / PANGO_SCALE));
+            scope.DrawGlyphs(placed, cut);
+        }
+        baseline += lineHeight;
     }
 }

@@ -1,5 +1,6 @@
 // A text turned into glyphs and lines.
 #pragma once
+#include "desktop/drawing/DeviceScale.h"
 #include "desktop/type/FontSpec.h"
 #include "host/Geometry.h"
 #include "host/TextSettings.h"
@@ -17,6 +18,8 @@ typedef struct _PangoGlyphString PangoGlyphString;
 typedef struct _PangoLayout PangoLayout;
 typedef struct _PangoLayoutLine PangoLayoutLine;
 typedef struct _PangoRectangle PangoRectangle;
+
+class PixelScope;
 
 // All that shaping depends on beside the text.
 struct TextShape {
@@ -64,6 +67,11 @@ public:
 
     // Draws with the first baseline at the point, each line placed within `boxWidth` from it.
     void Draw(cairo_t *, int h, int baseline, int boxWidth, TextSettings::Alignment) const;
+    // Draws the same as masks, as far as they lie in `cut`; only where HasMasks says so.
+    void DrawMasks(PixelScope &, DeviceScale, int h, int baseline, int boxWidth, TextSettings::Alignment,
+                   DeviceRect const &cut) const;
+    // Whether all glyphs are masks at that scale.
+    bool HasMasks(DeviceScale) const;
     // Where a line of that width begins within the box, counted from its left edge; negative when it is
     // centred or right and too wide.
     static int LineStart(int lineWidth, int boxWidth, TextSettings::Alignment, bool rightToLeft);

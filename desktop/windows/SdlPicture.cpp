@@ -219,8 +219,7 @@ bool SdlPicture::Move(PixelMove const &move) {
     XCopyArea(shared->display, shared->window, shared->window, shared->context, from.left, from.top,
               static_cast<unsigned int>(to.Width()), static_cast<unsigned int>(to.Height()), to.left, to.top);
     shared->pixels->Forget(to);
-    XFlush(shared->display);
-    return true;
+    return true; // the request goes along with that for what is new
 }
 
 void SdlPicture::Forget() {

@@ -14,7 +14,9 @@ ShownPixels::ShownPixels(std::uint32_t *memory_, int width_, int height_)
     , width(width_)
     , height(height_)
     , tiles(static_cast<std::size_t>(TilesAcross()) *
-            static_cast<std::size_t>(TilesFor(height_, kTileHeight))) {}
+            static_cast<std::size_t>(TilesFor(height_, kTileHeight))) {
+    ForgetAll();
+}
 
 int ShownPixels::TilesAcross() const { return TilesFor(width, kTileWidth); }
 
@@ -33,28 +35,41 @@ static DeviceRect TilesOf(DeviceRect const &area) {
             TilesFor(area.bottom, kTileHeight)};
 }
 
-static bool SameSize(DeviceRect const &a, DeviceRect const &b) {
-    return a.Width() == b.Width() && a.Height() == b.Height();
+// Row by row through all tiles beside each other, in the order of the memory: the processor then fetches what
+// comes next by itself. What is unknown of a tile stays so until all of it is taken: a tile may lie half in a
+// view that scrolls, and half in a bar beside it that stays as it is.
+void ShownPixels::TakeTiles(Surface const &surface, DeviceRect const &area, DeviceRect const &range,
+                            int row) {
+    parts.clear();
+    for (int column = range.left; column < range.right; ++column) {
+        DeviceRect const place = Place(column, row).Intersected(area);
+        Tile &tile = At(column, row);
+        tile.top = tile.bottom = place.top;
+        parts.push_back({&tile, place, place.Intersected(tile.unknown).Empty()});
+    }
+    DeviceRect const band = parts.front().place;
+    for (int y = band.top; y < band.bottom; ++y) {
+        std::uint32_t const *const from = surface.Row(y);
+        std::uint32_t *const to = memory + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
+        for (Part const &part : parts)
+            TakeRow(from, to, part, y);
+    }
+    for (Part const &part : parts)
+        if (!part.known && part.place.Contains(part.tile->unknown))
+            part.tile->unknown = {0, 0, 0, 0};
 }
 
-// A tile of which a part is taken stays unknown if it was.
-void ShownPixels::TakeTile(Surface const &surface, DeviceRect const &area, int column, int row) {
-    Tile &tile = At(column, row);
-    DeviceRect const place = Place(column, row), part = place.Intersected(area);
-    std::size_t const bytes = static_cast<std::size_t>(part.Width()) * sizeof(std::uint32_t);
-    tile.top = tile.bottom = part.top;
-    for (int y = part.top; y < part.bottom; ++y) {
-        std::uint32_t const *const from = surface.Row(y) + part.left;
-        std::uint32_t *const to =
-            memory + static_cast<std::size_t>(y) * static_cast<std::size_t>(width) + part.left;
-        if (tile.known && std::memcmp(to, from, bytes) == 0)
-            continue;
-        std::memcpy(to, from, bytes);
-        if (tile.top == tile.bottom)
-            tile.top = y;
-        tile.bottom = y + 1;
-    }
-    tile.known = tile.known || SameSize(part, place);
+void ShownPixels::TakeRow(std::uint32_t const *from, std::uint32_t *to, Part const &part, int y) {
+    std::size_t const bytes = static_cast<std::size_t>(part.place.Width()) * sizeof(std::uint32_t);
+    from += part.place.left;
+    to += part.place.left;
+    if (part.known && std::memcmp(to, from, bytes) == 0)
+        return;
+    std::memcpy(to, from, bytes);
+    Tile &tile = *part.tile;
+    if (tile.top == tile.bottom)
+        tile.top = y;
+    tile.bottom = y + 1;
 }
 
 // Runs of differing rows down each column of tiles; what is alike in neighbouring columns becomes one.
@@ -94,13 +109,14 @@ void ShownPixels::Take(Surface const &surface, DeviceRect const &area, std::vect
         return;
     DeviceRect const range = TilesOf(area);
     for (int row = range.top; row < range.bottom; ++row)
-        for (int column = range.left; column < range.right; ++column)
-            TakeTile(surface, area, column, row);
+        TakeTiles(surface, area, range, row);
     std::size_t const first = changed.size();
     Collect(range, changed);
     for (std::size_t i = first; i < changed.size(); ++i)
         changed[i] = changed[i].Intersected(area);
 }
+
+static void Unite(DeviceRect &all, DeviceRect const &part) { all = all.Empty() ? part : all.United(part); }
 
 void ShownPixels::Forget(DeviceRect const &rect) {
     DeviceRect const part = rect.Intersected({0, 0, width, height});
@@ -109,7 +125,7 @@ void ShownPixels::Forget(DeviceRect const &rect) {
     DeviceRect const range = TilesOf(part);
     for (int row = range.top; row < range.bottom; ++row)
         for (int column = range.left; column < range.right; ++column)
-            At(column, row).known = false;
+            Unite(At(column, row).unknown, part.Intersected(Place(column, row)));
 }
 
 void ShownPixels::ForgetAll() { Forget({0, 0, width, height}); }

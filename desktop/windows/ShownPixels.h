@@ -28,16 +28,23 @@ public:
 private:
     // A part of the picture that is looked at in one go.
     struct Tile {
-        bool known = false;      // all of it is shown as it stands here
+        DeviceRect unknown;      // in the picture; all else of the tile is shown as it stands here
         int top = 0, bottom = 0; // rows that differ; equal: none
     };
     int TilesAcross() const;
     Tile &At(int column, int row);
     DeviceRect Place(int column, int row) const;
-    void TakeTile(Surface const &, DeviceRect const &area, int column, int row);
+    void TakeTiles(Surface const &, DeviceRect const &area, DeviceRect const &range, int row);
+    struct Part { // of a tile, to be taken
+        Tile *tile;
+        DeviceRect place;
+        bool known; // all of it
+    };
+    static void TakeRow(std::uint32_t const *from, std::uint32_t *to, Part const &, int y);
     void Collect(DeviceRect const &tiles, std::vector<DeviceRect> &changed);
 
     std::uint32_t *memory;
     int width, height;
     std::vector<Tile> tiles; // row by row
+    std::vector<Part> parts; // that are being taken; kept for its memory
 };

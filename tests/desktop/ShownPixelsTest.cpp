@@ -110,6 +110,15 @@ TEST_F(ShownPixelsTest, WhatWasForgottenIsShownAgain) {
     ExpectOnly(TakeAll(), {0, 0, kWidth, kHeight});
 }
 
+TEST_F(ShownPixelsTest, WhatIsKnownOfATileStaysSoBesideWhatWasForgotten) {
+    TakeAll();
+    shown.Forget({0, 0, 44, kHeight}); // a view that has scrolled; the bar beside it begins in the same tile
+    EXPECT_TRUE(Take({44, 0, 60, kHeight}).empty());
+    Paint({50, 20, 51, 21}, 0xFFFF0000u);
+    ExpectOnly(Take({44, 0, 60, kHeight}), {44, 20, 60, 21});
+    ExpectOnly(Take({0, 40, 44, 50}), {0, 40, 44, 50});
+}
+
 TEST_F(ShownPixelsTest, APartOfATileThatIsNotKnownIsShownEachTime) {
     ExpectOnly(Take({10, 5, 20, 9}), {10, 5, 20, 9});
     ExpectOnly(Take({10, 5, 20, 9}), {10, 5, 20, 9});

@@ -144,8 +144,9 @@ TEST(ScrollRect, AScrolledPictureIsTheSameAsADrawnOne) {
         ScrollBy({0, 0, 60, 40}, 0, -14);
         OSRgn const damage = scrolled.port.TakeDamage();
         scrolled.port.SetClip(damage);
-        scrolled.port.FillClip({1, 1, 1, 1});
+        scrolled.port.LayGround({1, 1, 1, 1});
         draw(24);
+        scrolled.port.FinishGround();
         Canvas drawn(40, 60, factor);
         draw(24);
         EXPECT_EQ(scrolled.Pixels(), drawn.Pixels()) << factor;
