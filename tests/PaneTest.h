@@ -8,6 +8,7 @@
 #include "host/GlogStyleSheet.h"
 #include "host/PortSavers.h"
 #include "host/UString.h"
+#include "host/VelaDrawing.h"
 #include "host/XMLLib.h"
 #include "host/glogRec.h"
 #include <boost/make_shared.hpp>
@@ -98,6 +99,19 @@ protected:
         return desktop.TakeDrawing();
     }
 
+    // Makes the port of another window the current one.
+    void LeaveForAnotherPort() {
+        if (!other)
+            other = desktop.NewGlog(GlogOptions().Size(40, 30));
+        SetPortToGlog(other);
+    }
+    // Whether the port of the test's own window is.
+    bool IsInItsPort() const {
+        OSPort *port = nullptr;
+        VelaDrawing::GetPort(&port);
+        return port == glog->GetPort();
+    }
+
     // The drawing calls of the whole pane.
     template <class Pane> Lines DrawingOf(Pane &pane) {
         return Traced(pane, [&] { (pane.*&Opened<Pane>::DrawGuts)(nullptr); });
@@ -141,6 +155,9 @@ protected:
 
     SimulatedDesktop desktop;
     glogRec *glog;
+
+private:
+    glogRec *other = nullptr;
 };
 
 // An item as a dialog's loader makes it, for creators that read one.

@@ -659,6 +659,14 @@ TEST_F(BoxSelect, AMarkIsDrawnInPartWhenPartOfItIsUpdated) {
     EXPECT_TRUE(pane->ReadOne(0));
 }
 
+TEST_F(BoxSelect, MarksComeIntoItsOwnWindowWhateverPortIsTheCurrentOne) {
+    BoxSelectPane *const pane = New(kOneAtATime);
+    OSRgn region(kAround);
+    LeaveForAnotherPort();
+    (pane->*&Opened<BoxSelectPane>::DrawGuts)(&region);
+    EXPECT_TRUE(IsInItsPort());
+}
+
 TEST_F(BoxSelect, MarksLeaveTheColoursOfThePortToTheHost) {
     New(kOneAtATime, BoxSelectPane::kHighlight);
     Rect below = {100, 10, 120, 30};

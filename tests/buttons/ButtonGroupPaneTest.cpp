@@ -61,6 +61,13 @@ TEST_F(ButtonGroup, AddsItsOperationsInOrder) {
                   &OpenBoxes::TrackButton, &OpenBoxes::GetReleaseIcon, &OpenBoxes::AutoSetButton);
 }
 
+TEST_F(ButtonGroup, HasTheNumberZero) {
+    EXPECT_EQ(NewBoxes()->GetID(), 0);
+    EXPECT_EQ(ThreeBoxes()->GetID(), 0);
+    EXPECT_EQ(NewRadios()->GetID(), 0);
+    EXPECT_EQ(ThreeRadios()->GetID(), 0);
+}
+
 TEST_F(ButtonGroup, IsAbstract) { EXPECT_TRUE(std::is_abstract<ButtonGroupPane>::value); }
 
 // Buttons made in code

@@ -115,6 +115,22 @@ TEST_F(IconPane, StartsInStateZeroEnabledWithoutDecalUnderNumberZero) {
     EXPECT_EQ(pane->GetID(), 0);
 }
 
+TEST_F(IconPane, WhatASubclassHasSetBeforehandIsAsAtTheStart) {
+    class Early : public GIconPane {
+    public:
+        using GIconPane::InitGIconPane;
+    };
+    Early *const pane = new Early;
+    pane->SetCurState(2);
+    pane->SetEnabled(0);
+    pane->SetDecalProc(DrawDecal);
+    GIconResRec record = RecordOf(kFamily);
+    pane->InitGIconPane(glog, record);
+    EXPECT_EQ(pane->GetCurState(), 0);
+    EXPECT_TRUE(pane->GetEnabled());
+    EXPECT_EQ(pane->GetDecalProc(), nullptr);
+}
+
 TEST_F(IconPane, IsNotMadeWithoutAGlog) {
     GIconResRec record = RecordOf(kFamily);
     EXPECT_EQ(GIconPane::NewGIconPane(nullptr, &record), nullptr);

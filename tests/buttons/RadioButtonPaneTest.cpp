@@ -39,6 +39,16 @@ TEST_F(RadioButtons, FromASheetBeginWithTheFirst) {
     EXPECT_EQ(IconsOf(*group), (Icons{0, 2, 2}));
 }
 
+TEST_F(RadioButtons, FromASheetDrawNothingWhileTheyAreMade) {
+    Show();
+    LeaveForAnotherPort();
+    desktop.TakeDrawing();
+    RadioButtonPane *const group = ThreeRadios();
+    EXPECT_FALSE(IsInItsPort());
+    EXPECT_EQ(Only("InvalRect", desktop.TakeDrawing()), Lines());
+    EXPECT_EQ(IconsOf(*group), (Icons{0, 2, 2}));
+}
+
 TEST_F(RadioButtons, FromASheetWithoutButtonsAreMade) {
     GroupItem item;
     RadioButtonPane *const group = RadioButtonPane::NewRadioButtonPane(glog, item.Sheet());

@@ -153,6 +153,14 @@ TEST_F(GLinePaneTest, InALayoutASquarePlaceHasAnUprightLine) {
     EXPECT_EQ(DrawingOf(*pane), Drawn(*pane, {place.top, column}, {place.bottom, column}));
 }
 
+TEST_F(GLinePaneTest, IsDrawnInItsOwnPort) {
+    GLinePane *const pane = MadeFrom({10, 20, 10, 120});
+    Show();
+    LeaveForAnotherPort();
+    (pane->*&Opened<GLinePane>::DrawGuts)(nullptr);
+    EXPECT_TRUE(IsInItsPort());
+}
+
 TEST_F(GLinePaneTest, ShowsInItsBox) {
     GLinePane *const pane = Made(Record(20, 10, 20, 110));
     Show();

@@ -91,6 +91,19 @@ TEST_F(MouseTrackingIndicatorTest, ComesUpWhenItIsMoved) {
     EXPECT_EQ(Damaged(), std::vector<Rect>{Box(60)});
 }
 
+TEST_F(MouseTrackingIndicatorTest, IsDrawnBeforeItsPlaceIsInvalidated) {
+    Rect const here = Box(30), there = Box(60);
+    EXPECT_EQ(Traced(*ground, [&] { marker.Show(here); }), Traced(*ground, [&] {
+                  VelaDrawing::FrameRect(&here);
+                  VelaDrawing::InvalRect(&here);
+              }));
+    EXPECT_EQ(Traced(*ground, [&] { marker.Move(there); }), Traced(*ground, [&] {
+                  VelaDrawing::InvalRect(&here);
+                  VelaDrawing::FrameRect(&there);
+                  VelaDrawing::InvalRect(&there);
+              }));
+}
+
 TEST_F(MouseTrackingIndicatorTest, IsDrawnByTheRedrawWhileItShows) {
     marker.Show(Box(30));
     marker.drawn.clear();

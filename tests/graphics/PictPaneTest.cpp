@@ -176,6 +176,17 @@ TEST_F(PictPaneTest, KeepsACopyOfItsClip) {
     EXPECT_EQ(Only("NarrowClip", DrawingOf(*pane)).size(), 1u);
 }
 
+TEST_F(PictPaneTest, IsDrawnInItsOwnPortAndNotAtAllWithoutAnImage) {
+    PictPane *const pane = Empty();
+    Show();
+    LeaveForAnotherPort();
+    (pane->*&Opened<PictPane>::DrawGuts)(nullptr);
+    EXPECT_FALSE(IsInItsPort());
+    pane->SetImageNoUpdate(NewImage());
+    (pane->*&Opened<PictPane>::DrawGuts)(nullptr);
+    EXPECT_TRUE(IsInItsPort());
+}
+
 TEST_F(PictPaneTest, WhatIsDrawnAfterwardsIsNotClipped) {
     PictPane *const pane = Empty();
     pane->SetImage(NewImage());
@@ -203,6 +214,20 @@ TEST_F(PictPaneTest, AnotherImageIsRepainted) {
     EXPECT_EQ(Repainted(), std::vector<Rect>{kBox});
     pane->SetImage(NewImage());
     EXPECT_EQ(pane->GetPictureID(), 0);
+}
+
+TEST_F(PictPaneTest, AnotherImageMakesItsPortTheCurrentOneUnlessItOnlyStores) {
+    PictPane *const pane = Empty();
+    Show();
+    LeaveForAnotherPort();
+    pane->SetImageNoUpdate(NewImage());
+    pane->SetPngImageNoUpdate(kWaveform);
+    EXPECT_FALSE(IsInItsPort());
+    pane->SetImage(NewImage());
+    EXPECT_TRUE(IsInItsPort());
+    LeaveForAnotherPort();
+    pane->SetPngImage(kWaveform);
+    EXPECT_TRUE(IsInItsPort());
 }
 
 TEST_F(PictPaneTest, WithoutUpdateAnotherImageOnlyStores) {

@@ -249,6 +249,21 @@ TEST_F(ThreeDPaneTrackingTest, FarFromItsLineTheCoordinateGoesBackAndComesAgain)
     EXPECT_EQ(log.values[2].x, log.values[0].x);
 }
 
+TEST_F(ThreeDPaneTrackingTest, FarFromItsLineTheCursorIsThatOfMovingAgain) {
+    Cube *const cube = AsInDialogs();
+    cube->SetValue({0.5, 0.2, 0.1});
+    Show();
+    Point const zero = cube->AxisZeroPoint(kAxisX), middle = Middle(*cube);
+    int const way = zero.h - middle.h;
+    std::string const toZero = "press " + Spot(middle, 4, 0) + "\nmove " + Spot(middle, 4 + way, 0);
+    desktop.Play(toZero);
+    ASSERT_EQ(Cursor(), 654);
+    cube->SetValue({0.5, 0.2, 0.1});
+    desktop.Play(toZero + "\nmove " + Spot(middle, 4 + way, 95));
+    EXPECT_EQ(cube->GetOneCoordinate(kAxisX), 0.5);
+    EXPECT_EQ(Cursor(), 650);
+}
+
 TEST_F(ThreeDPaneTrackingTest, ADragIsDetachedBeyondSeventyTwoPixels) {
     Cube *const cube = FromTheFront(0.2);
     cube->SetValue({0.0, 0.5, 0.0}); // the line along x is level

@@ -190,6 +190,21 @@ TEST_F(DurationNote, AClickChoosesAndGivesMinusOne) {
     EXPECT_EQ(ear.count, 1);
 }
 
+TEST_F(DurationNote, ItsMenuComesUpInItsOwnPort) {
+    Show();
+    EventRecordAdapter event;
+    event.where = {25, 40};
+    desktop.Script("menu 5");
+    LeaveForAnotherPort();
+    EXPECT_EQ((pane->*&Opened<DurationNotePane>::HandleClick)(&event), -1);
+    EXPECT_EQ(pane->GetDurationValue(), DurationValue(1, 16));
+    EXPECT_TRUE(IsInItsPort());
+    pane->SetEnable(false);
+    LeaveForAnotherPort();
+    EXPECT_EQ((pane->*&Opened<DurationNotePane>::HandleClick)(&event), -1);
+    EXPECT_FALSE(IsInItsPort()) << "nothing comes up";
+}
+
 TEST_F(DurationNote, OffersTheDurationsThatItWasGiven) {
     pane->SetMenuDurations({{1, 2}, {3, 4}});
     Show();

@@ -437,6 +437,22 @@ TEST_F(PopMPaneTest, AnAgentTakesTheClick) {
     pane->SetAgent(nullptr);
 }
 
+TEST_F(PopMPaneTest, AClickThatAnAgentTakesLeavesThePortAsItIs) {
+    PopMPane *const pane = Make();
+    TestAgent agent;
+    pane->SetAgent(&agent);
+    pane->EnableMenu(false); // so that it does not open
+    Show();
+    EventRecordAdapter event;
+    LeaveForAnotherPort();
+    EXPECT_EQ((pane->*&Opened<PopMPane>::HandleClick)(&event), 42);
+    EXPECT_FALSE(IsInItsPort());
+    agent.takes = false;
+    EXPECT_EQ((pane->*&Opened<PopMPane>::HandleClick)(&event), -1);
+    EXPECT_TRUE(IsInItsPort());
+    pane->SetAgent(nullptr);
+}
+
 TEST_F(PopMPaneTest, AnAgentNamesTheItemAndDecidesOnItsLook) {
     PopMPane *const pane = Make();
     class Naming : public TestAgent {

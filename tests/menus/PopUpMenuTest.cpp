@@ -528,6 +528,16 @@ TEST_F(PopUpMenuTest, AnEmptyOrDisabledMenuDoesNotOpen) {
     EXPECT_EQ(menu.GetLastPopupResult(), -1);
 }
 
+TEST_F(PopUpMenuTest, AMenuThatDoesNotOpenHasNoResultOfAnEarlierChoice) {
+    ShowWindow();
+    Add(menu, {"a", "b"});
+    EXPECT_EQ(Do(menu, "menu 2"), 2);
+    EXPECT_EQ(menu.GetLastPopupResult() & 0xFFFF, 2);
+    menu.SetEnableItem(0, 0);
+    EXPECT_EQ(menu.DoMenu(), -1);
+    EXPECT_EQ(menu.GetLastPopupResult(), -1);
+}
+
 TEST_F(PopUpMenuTest, AChoiceFromASubmenuSelectsItsItem) {
     ShowWindow();
     Add(menu, {"a", "b"});

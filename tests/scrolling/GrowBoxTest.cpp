@@ -132,6 +132,13 @@ TEST_F(GrowBoxTest, AResizeInvalidatesTheOldAndTheNewPlace) {
     EXPECT_EQ(Repainted(), (std::vector<Rect>{elsewhere, kCorner}));
 }
 
+TEST_F(GrowBoxTest, AResizeIsMadeInItsOwnPort) {
+    GrowBox *const box = New(0, 0, 0);
+    LeaveForAnotherPort();
+    box->Resize({0, 0});
+    EXPECT_TRUE(IsInItsPort());
+}
+
 TEST_F(GrowBoxTest, InALayoutItStaysWhereTheLayoutHasIt) {
     GrowBox *const box = New(0, 0, 0);
     ProbeContainer *const container = new ProbeContainer(glog, {0, 0, 100, 100});

@@ -55,6 +55,15 @@ protected:
 
 // Frame
 
+TEST_F(ScrollBarDrawing, ErasesNothingBeforeItPaints) {
+    ScrollBarPane *const bar = Upright();
+    Show();
+    bar->Inval();
+    desktop.TakeDrawing();
+    UpdateGlog(glog);
+    EXPECT_EQ(Only("EraseRect", desktop.TakeDrawing()), Lines());
+}
+
 TEST_F(ScrollBarDrawing, PaintsItsBackgroundAndFramesItsBox) {
     ExpectBackground(*Upright(), UprightBox(130));
 }

@@ -115,6 +115,17 @@ TEST_F(ScrollGridPlusTest, ALateralMoveTellsTheMembersMovesPixelsAndUpdatesAtOnc
     EXPECT_TRUE(Only("ScrollRect", desktop.TakeDrawing()).empty());
 }
 
+TEST_F(ScrollGridPlusTest, ALateralMoveIsMadeInItsOwnPort) {
+    Fill(20);
+    Show();
+    LeaveForAnotherPort();
+    grid->LateralScrollTo(10);
+    EXPECT_TRUE(IsInItsPort());
+    LeaveForAnotherPort();
+    grid->LateralScrollTo(10);
+    EXPECT_TRUE(IsInItsPort()) << "also when nothing moves";
+}
+
 TEST_F(ScrollGridPlusTest, AnArrowMovesAPixelAcrossAndAPageFourFifths) {
     EXPECT_EQ(grid->LateralScrollDelta(1), 1);
     EXPECT_EQ(grid->LateralScrollDelta(0), 80);

@@ -216,6 +216,15 @@ TEST_F(ScrollGridTest, MovesNoPixelsWhileAnotherGlogsPortIsTheCurrentOne) {
     EXPECT_EQ(desktop.TakePresented(glog), Rects{kView});
 }
 
+TEST_F(ScrollGridTest, ForItsBarItMovesPixelsWhateverPortIsTheCurrentOne) {
+    Fill(20);
+    Show();
+    LeaveForAnotherPort();
+    desktop.TakeDrawing();
+    grid->ScrollTo(bar, 10);
+    EXPECT_EQ(ScrollRects().size(), 1u);
+}
+
 TEST_F(ScrollGridTest, AMoveTellsEveryMemberAndUpdatesTheGlogAtOnce) {
     Fill(20);
     Show();
@@ -540,6 +549,28 @@ TEST_F(ScrollGridTest, AResizeShowsThePositionAnew) {
     grid->SetBox(&larger);
     grid->AutoResize(0, 0);
     EXPECT_EQ(bar->GetRange(), 220);
+}
+
+TEST_F(ScrollGridTest, AResizeRepaintsWhatTheGridHasLeft) {
+    // As a layout of the program's own would do it.
+    class Narrowing : public ProbePane {
+    public:
+        using ProbePane::ProbePane;
+        void AutoResize(short dh, short dv) override {
+            Rect box;
+            container->GetBox(&box);
+            box.right = static_cast<short>(box.right + dh);
+            box.bottom = static_cast<short>(box.bottom + dv);
+            container->SetBox(&box);
+        }
+    };
+    grid->Add(new Narrowing(glog, {0, 0, 20, 100}, calls, "narrowing"), -1);
+    Show();
+    grid->AutoResize(0, -70);
+    EXPECT_EQ(BoxOf(*grid), (Rect{0, 10, 90, 110}));
+    EXPECT_EQ(Repainted(), (Rects{{90, 10, 160, 110}}));
+    grid->AutoResize(0, 70);
+    EXPECT_EQ(Repainted(), Rects()) << "what it gains is the members' affair";
 }
 
 // Suppression

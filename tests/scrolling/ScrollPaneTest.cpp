@@ -291,6 +291,26 @@ TEST_F(ScrollPaneTest, AnotherBoxBringsThePositionsBackIntoTheArea) {
     EXPECT_EQ(h->GetRange(), 700);
 }
 
+TEST_F(ScrollPaneTest, AnotherBoxSetsTheVerticalPositionFirst) {
+    class Noting : public ScrollPane {
+    public:
+        using ScrollPane::ScrollPane;
+        void SetHScrollPos(int position) override {
+            order += 'h';
+            ScrollPane::SetHScrollPos(position);
+        }
+        void SetVScrollPos(int position) override {
+            order += 'v';
+            ScrollPane::SetVScrollPos(position);
+        }
+        std::string order;
+    };
+    Noting *const noting = new Noting(glog);
+    Rect box = kView;
+    noting->SetBox(&box);
+    EXPECT_EQ(noting->order, "vh");
+}
+
 TEST_F(ScrollPaneTest, ASubpaneThatHearsOfANewBoxMayDeleteIt) {
     class Deleting : public ProbePane {
     public:

@@ -81,6 +81,14 @@ TEST_F(TabPaneDrawingTest, TabsAreDrawnPieceByPieceWithTheirNames) {
               }));
 }
 
+TEST_F(TabPaneDrawingTest, TabsAreDrawnInTheirOwnPort) {
+    TabPane *const pane = Make();
+    Show();
+    LeaveForAnotherPort();
+    (pane->*&Opened<TabPane>::DrawGuts)(nullptr);
+    EXPECT_TRUE(IsInItsPort());
+}
+
 TEST_F(TabPaneDrawingTest, HasAnIconForEveryPieceAndPlace) {
     TabPane *const pane = Make();
     struct Case {

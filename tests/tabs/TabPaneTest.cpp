@@ -301,6 +301,23 @@ TEST_F(TabPaneTest, TheRowIsTheNaturalSizeInALayout) {
     EXPECT_EQ(Width(pane->GetDrawRectangle()), Width(pane->GetOptimalRect()) + 1);
 }
 
+TEST_F(TabPaneTest, FromASheetTheRowIsTheNaturalSizeFromTheStart) {
+    CompoundPane *const column = new CompoundPane;
+    column->CompoundPaneInit(glog, 5);
+    column->SetUseLayout(true);
+    column->SetSizeToLayout(true);
+    TestItem item;
+    item.Box("BoundsRect", {20, 30, 37, 330});
+    boost::shared_ptr<XMLLib::ContainerItem> const names = XMLLib::CreateContainer(Text("Items"));
+    names->AddUStringItem(Text("Tab"), Text("Notes"));
+    item.Container()->AddItem(Text("Items"), names);
+    TabPane *const pane = new TabPane(glog, item.Sheet());
+    column->Add(pane, -1);
+    Show();
+    EXPECT_LT(Width(pane->GetDrawRectangle()), 300);
+    EXPECT_EQ(Width(pane->GetDrawRectangle()), Width(pane->GetOptimalRect()) + 1);
+}
+
 TEST_F(TabPaneTest, AnEmptyRowSetsNoNaturalSize) {
     CompoundPane *const column = new CompoundPane;
     column->CompoundPaneInit(glog, 5);

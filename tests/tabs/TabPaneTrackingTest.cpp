@@ -219,6 +219,20 @@ TEST_F(TabPaneTrackingTest, MayBeDeletedWhileItIsTracked) {
     EXPECT_FALSE(watch.PaneExists());
 }
 
+TEST_F(TabPaneTrackingTest, EachStepIsMadeInItsOwnPort) {
+    TabPane *const pane = Make();
+    Show();
+    CountingHooks hooks;
+    std::vector<bool> inItsPort;
+    hooks.then = [&] {
+        inItsPort.push_back(IsInItsPort());
+        LeaveForAnotherPort();
+    };
+    desktop.Play("press" + Middle(*pane, 1) + "\nmove" + Middle(*pane, 2) + "\nmove" + Middle(*pane, 0) +
+                 "\nrelease");
+    EXPECT_EQ(inItsPort, (std::vector<bool>{true, true, true}));
+}
+
 TEST_F(TabPaneTrackingTest, MayLoseItsItemsWhileItIsTracked) {
     TabPane *const pane = Make();
     Show();
@@ -252,6 +266,26 @@ TEST_F(TabPaneTrackingTest, TheMenuHasTheFullNamesOfWhatIsHidden) {
     EXPECT_THROW(desktop.Play("click" + Middle(*pane, 1) + "\nmenu 3"), ScriptError) << "there are two";
     desktop.Play("click" + Middle(*pane, 1) + "\nkey t\nkey h\nkey Return");
     EXPECT_EQ(pane->GetSelectedItem(), 2);
+}
+
+TEST_F(TabPaneTrackingTest, TheMenuComesUpInItsOwnPort) {
+    TabPane *const pane = MakeOverflowing();
+    Show();
+    EventRecordAdapter event;
+    Rect const tab = pane->GetItemBox(1);
+    event.where = {static_cast<short>(tab.top + 5), static_cast<short>(tab.left + 5)};
+    desktop.Script("menu 2");
+    LeaveForAnotherPort();
+    EXPECT_EQ((pane->*&Opened<TabPane>::HandleClick)(&event), -1);
+    EXPECT_EQ(pane->GetSelectedItem(), 2);
+    EXPECT_TRUE(IsInItsPort());
+}
+
+TEST_F(TabPaneTrackingTest, TheMenuComesUpWithItsFirstItemHighlighted) {
+    OpenTabs *const pane = MakeOverflowing();
+    Show();
+    desktop.Play("click" + Middle(*pane, 1) + "\nkey Return");
+    EXPECT_EQ(pane->GetSelectedItem(), 1);
 }
 
 TEST_F(TabPaneTrackingTest, ADismissedMenuChangesNothing) {
