@@ -4,8 +4,10 @@
 #include "dialogs/ItemRegistry.h"
 #include "dialogs/LoadGlog.h"
 #include "dialogs/PaneMaker.h"
+#include "dialogs/RecordFile.h"
 #include "fuzz/storm/OpenWindow.h"
 #include "fuzz/storm/RandomItem.h"
+#include "fuzz/storm/RandomRecord.h"
 #include "fuzz/storm/Stage.h"
 #include "fuzz/storm/StormWindows.h"
 #include "fuzz/support/Require.h"
@@ -83,6 +85,8 @@ public:
     GlogPane *AddPane(Chance &chance) override {
         if (!Window())
             return nullptr;
+        if (chance.OneIn(4))
+            return AddFromRecord(chance);
         Dialog const dialog =
             DialogReader::ReadText(Wrapped(OneItem(chance, Cell(chance.Below(kColumns * kRows)))), kName);
         GlogPane *pane = nullptr;
@@ -106,6 +110,26 @@ private:
             Collect(*container->Get(i), loose);
     }
 
+    GlogPane *AddFromRecord(Chance &chance) {
+        std::string const bytes = RandomRecord::Of(chance, Cell(chance.Below(kColumns * kRows)));
+        short const before = CountGlogItems(Window());
+        try {
+            RecordFile(bytes.data(), bytes.size(), kName).MakePanes(Window());
+            desktop.FinishGlog(Window());
+        } catch (std::exception const &) {
+            return nullptr; // as from an item
+        }
+        if (!Window() || CountGlogItems(Window()) == before)
+            return nullptr;
+        GlogPane *const pane = Panes().back();
+        pane->SetID(nextID);
+        Number(nextID + 1);
+        return pane;
+    }
+
+    // The next random item has this number, or the first one again.
+    void Number(int id) { nextID = id > kLastID ? kFirstLoose : id; }
+
     // That can be loaded.
     std::string OneItem(Chance &chance, Rect const &place, std::vector<int> const &bars = {}) {
         for (int i = 0; i < kTries; ++i) {
@@ -113,9 +137,7 @@ private:
             std::string const written = item.Write(place);
             if (!IsLoadable(written))
                 continue;
-            nextID = item.NextID();
-            if (nextID > kLastID)
-                nextID = kFirstLoose;
+            Number(item.NextID());
             return written;
         }
         return kSpacer;
