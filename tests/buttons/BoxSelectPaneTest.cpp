@@ -770,6 +770,21 @@ TEST_F(BoxSelect, InAGroupWithoutLayoutItsBoxesStayAsTheyAre) {
     EXPECT_TRUE(pane->ReadOne(0));
 }
 
+TEST_F(BoxSelect, KeepsTheContainerThatItIsGiven) {
+    class Knowing : public Subclass {
+    public:
+        using Subclass::Subclass;
+        CompoundPane *Container() const { return container; }
+    };
+    boxSelResRec record = {boxSelResRec::kKind, 1, 0, 0};
+    Knowing *const pane = new Knowing(glog, &record);
+    Group *const group = new Group(glog, true);
+    pane->SetContainer(group);
+    EXPECT_EQ(pane->Container(), group);
+    pane->SetContainer(nullptr);
+    EXPECT_EQ(pane->Container(), nullptr);
+}
+
 TEST_F(BoxSelect, InALayoutItsBoxesCountFromItsTopLeftCorner) {
     Group *const group = new Group(glog, true);
     Rect above = {0, 0, 30, 50};

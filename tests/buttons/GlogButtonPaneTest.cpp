@@ -274,6 +274,25 @@ TEST_F(ButtonPane, FlashPressesTheButtonWithTheMouseUp) {
     EXPECT_EQ(listener.sources.size(), 1u);
 }
 
+TEST_F(ButtonPane, FlashWithoutAKeyFollowsAMouseThatIsHeldDown) {
+    class Flasher : public GlogPane {
+    public:
+        Flasher(glogRec *owner, ProbeButton *flashed)
+            : button(flashed) {
+            GlogPaneInit(owner, 0);
+            Rect box = {100, 100, 120, 140};
+            SetBox(&box);
+        }
+        int HandleClick(EventRecordAdapter *) override { return button->Flash(0); }
+        void DrawGuts(OSRgn *) override {}
+        ProbeButton *button;
+    };
+    new Flasher(glog, button);
+    EXPECT_EQ(ResultOfClick("press 110 110\nwait 0.3\nmove 111 111\nwait 0.2\nrelease"), -1);
+    EXPECT_EQ(button->changes, (Changes{"depress", "release while tracking"}));
+    EXPECT_TRUE(listener.sources.empty());
+}
+
 TEST_F(ButtonPane, FlashOfAButtonThatIsNotEnabledIsHandledAndDoesNothing) {
     for (unsigned char mode : {1, 2, 255}) {
         button->SetMode(mode);

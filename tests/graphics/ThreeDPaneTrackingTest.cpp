@@ -242,11 +242,12 @@ TEST_F(ThreeDPaneTrackingTest, FarFromItsLineTheCoordinateGoesBackAndComesAgain)
     // A point 90 pixels below the line, and off its ends: more than 72 from it.
     desktop.Play("press " + Spot(middle, 6, 0) + "\nmove " + Spot(middle, 6 + way, 0) + "\nmove " +
                  Spot(middle, 6 + way, 90) + "\nmove " + Spot(middle, 7 + way, 91) + "\nmove " +
-                 Spot(middle, 6 + way, 0));
-    ASSERT_EQ(log.values.size(), 3u) << "there, back, and there again";
+                 Spot(middle, 6 + way, 0) + "\nmove " + Spot(middle, 6 + way, 90));
+    ASSERT_EQ(log.values.size(), 4u) << "there, back, there again, and back again";
     EXPECT_NE(log.values[0].x, 0.3);
     EXPECT_EQ(log.values[1].x, 0.3);
     EXPECT_EQ(log.values[2].x, log.values[0].x);
+    EXPECT_EQ(log.values[3].x, 0.3);
 }
 
 TEST_F(ThreeDPaneTrackingTest, FarFromItsLineTheCursorIsThatOfMovingAgain) {

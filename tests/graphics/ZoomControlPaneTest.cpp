@@ -124,9 +124,12 @@ TEST_F(ZoomControlPaneTest, TheClientTellsWhenItsAnswersChange) {
     EXPECT_TRUE(ZoomIn().IsEnabled());
     client.UpdateControlPane();
     EXPECT_FALSE(ZoomIn().IsEnabled());
+    EXPECT_TRUE(ZoomOut().IsEnabled());
     client.canZoomIn = true;
+    client.canZoomOut = false;
     pane->UpdateControls();
     EXPECT_TRUE(ZoomIn().IsEnabled());
+    EXPECT_FALSE(ZoomOut().IsEnabled());
 }
 
 TEST_F(ZoomControlPaneTest, AClientCanZoomUnlessItSaysOtherwise) {

@@ -92,6 +92,16 @@ TEST_F(GListPaneDrawingTest, TheFrameHasTheColorOfScrollBars) {
     EXPECT_EQ(Lines(drawn.begin(), drawn.begin() + static_cast<std::ptrdiff_t>(expected.size())), expected);
 }
 
+TEST_F(GListPaneDrawingTest, AListOfDialogStyleLeavesTheClipInsideItsFrame) {
+    OpenList *const list = NewOpen(100);
+    Show();
+    list->Prepare();
+    list->DrawVisibleLines(nullptr);
+    OSRgn clip;
+    VelaDrawing::GetClip(&clip);
+    EXPECT_EQ(CarbonUtils::GetRgnBounds(&clip), (Rect{21, 31, 119, 229}));
+}
+
 TEST_F(GListPaneDrawingTest, ASmallListHasNeitherFrameNorShadowBesideTheOneBelowItsRows) {
     OpenList *const list = NewOpen(100, glistResRec::kSmallStyle);
     Show();

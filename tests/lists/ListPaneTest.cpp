@@ -73,6 +73,16 @@ protected:
 
 } // namespace
 
+TEST_F(ListPaneTest, ItsLinesAreDrawnByAPaneOfNumberZeroInItsOwnPort) {
+    NotingList *const list = NewList(20, 3);
+    GlogPane *const helper = list->Get(0);
+    EXPECT_EQ(helper->GetID(), 0);
+    Show();
+    LeaveForAnotherPort();
+    (helper->*&Opened<GlogPane>::DrawGuts)(nullptr);
+    EXPECT_TRUE(IsInItsPort());
+}
+
 TEST_F(ListPaneTest, AddsItsOperationsAfterThoseOfAScrolledPane) {
     class Added : public ScrollPane {
     public:

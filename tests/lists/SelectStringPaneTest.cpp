@@ -46,6 +46,29 @@ protected:
     }
 };
 
+TEST_F(SelectStringPaneTest, IsDrawnInItsOwnPort) {
+    SelectStringPane *const pane = Make("Verse");
+    LeaveForAnotherPort();
+    (pane->*&Opened<SelectStringPane>::DrawGuts)(nullptr);
+    EXPECT_TRUE(IsInItsPort());
+}
+
+TEST_F(SelectStringPaneTest, IsMeasuredAndDrawnInItsOwnFontWhateverThePortHas) {
+    SelectStringPane *const pane = Make("Verse");
+    auto const textIn = [&](int font) {
+        return Only("DrawStringInRect", Traced(*pane, [&] {
+                        SetFontData(GetIndVelaFont(font));
+                        (pane->*&Opened<SelectStringPane>::DrawGuts)(nullptr);
+                    }));
+    };
+    EXPECT_EQ(textIn(9), textIn(5));
+    SetFontData(GetIndVelaFont(9));
+    pane->SetText(Text("Chorus"));
+    Point const size = SizeOf(" Chorus ");
+    EXPECT_EQ(BoxOf(*pane).right - BoxOf(*pane).left, size.h);
+    EXPECT_EQ(BoxOf(*pane).bottom - BoxOf(*pane).top, size.v);
+}
+
 TEST_F(SelectStringPaneTest, IsAttachedUnderItsNumber) {
     SelectStringPane *const pane = Make("Verse");
     EXPECT_EQ(pane->GetID(), 3);

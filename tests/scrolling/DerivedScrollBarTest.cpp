@@ -229,6 +229,13 @@ TEST_F(Thumb, KeepsItsLeastLengthInATroughThatIsShorter) {
     EXPECT_EQ(UprightThumb(5, 10), (Rect{9, 1, 25, 17}));
 }
 
+TEST_F(Thumb, OfNoLessThanItsLeastLengthEndsWithAShorterTrough) {
+    Rect box = UprightBox(40); // the trough has 10 pixels
+    upright->SetBox(&box);
+    EXPECT_EQ(LengthAt(1.59), 16);
+    EXPECT_EQ(LengthAt(1.6), 10);
+}
+
 TEST_F(Thumb, IsSixteenPixelsAcrossInABroaderBar) {
     Rect box = {10, 20, 140, 80};
     upright->SetBox(&box);

@@ -571,6 +571,8 @@ TEST_F(ScrollGridTest, AResizeRepaintsWhatTheGridHasLeft) {
     EXPECT_EQ(Repainted(), (Rects{{90, 10, 160, 110}}));
     grid->AutoResize(0, 70);
     EXPECT_EQ(Repainted(), Rects()) << "what it gains is the members' affair";
+    grid->Resize({70, 0});
+    EXPECT_EQ(Repainted(), Rects()) << "the box stays";
 }
 
 // Suppression
