@@ -22,7 +22,7 @@ constexpr double kShadowAlpha[] = {0.20, 0.11, 0.05, 0.02};
 constexpr int kShadowDepth = static_cast<int>(sizeof kShadowAlpha / sizeof kShadowAlpha[0]);
 
 // Text wells: how much the outline differs from the paper, and the shade below its upper edge.
-constexpr double kWellBorderAlpha = 0.30, kWellTopBorderAlpha = 0.10, kWellShadowAlpha = 0.06;
+constexpr double kWellBorderAlpha = 0.42, kWellTopBorderAlpha = 0.10, kWellShadowAlpha = 0.06;
 
 OS::RGBAColor Shade(double alpha) { return {0, 0, 0, alpha}; }
 

@@ -15,12 +15,12 @@ constexpr RGBColor Rgb(unsigned rgb) {
 } // namespace
 
 RGBColor kDialogActiveTextColor = Rgb(0x1D1F23);
-RGBColor kDialogInactiveTextColor = Rgb(0x6A707B);
+RGBColor kDialogInactiveTextColor = Rgb(0x636974);
 RGBColor kDialogButtonActiveTextColor = Rgb(0x1D1F23);
 RGBColor kDialogButtonInactiveTextColor = Rgb(0x787E89);
 RGBColor kDialogListBackgroundColor = Rgb(0xFFFFFF);
 RGBColor kDialogListTextColor = Rgb(0x1D1F23);
-RGBColor kDialogListInactiveTextColor = Rgb(0x757B86);
+RGBColor kDialogListInactiveTextColor = Rgb(0x6B717C);
 RGBColor kListBackgroundColor = Rgb(0xF5F6F8);
 RGBColor kListItemColor = Rgb(0xFFFFFF);
 RGBColor kSmallListActiveTextColor = Rgb(0x1D1F23);
@@ -37,7 +37,7 @@ RGBColor kSystemHiliteColor = Rgb(0xB9D4FB);
 RGBColor kTooltipBackgroundColor = Rgb(0x2B2E34);
 RGBColor kTooltipTextColor = Rgb(0xF5F6F8);
 RGBColor kTooltipBorderColor = Rgb(0x17191C);
-RGBColor kFocusRingColor = Rgb(0x4D8EF0);
+RGBColor kFocusRingColor = Rgb(0x3478E5);
 RGBColor kMenuBackgroundColor = Rgb(0xFBFCFD);
 RGBColor kMenuBorderColor = Rgb(0xA9B0BB);
 RGBColor kMenuTextColor = Rgb(0x1D1F23);

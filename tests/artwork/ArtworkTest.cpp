@@ -14,7 +14,7 @@ namespace {
 constexpr int kAntiAliasing = 8;
 
 constexpr double kReadable = 4.5;     // contrast of text that has to be read
-constexpr double kRecognisable = 3.0; // contrast of text that is dimmed
+constexpr double kRecognisable = 3.0; // of text that is dimmed, and of controls and marks
 
 std::filesystem::path const kSource = GLOG_ARTWORK_SOURCE_DIR;
 constexpr char const *kThemes[] = {"light", "dark"};
@@ -238,12 +238,76 @@ TEST_F(Artwork, SetsReadableTextOnEveryGround) {
                                 {"kSmallListActiveTextColor", "kSystemHiliteColor"},
                                 {"kTextWellTextColor", "kTextWellBackgroundColor"},
                                 {"kTextWellTextColor", "kSystemHiliteColor"},
+                                {"kDialogInactiveTextColor", "kWindowBackgroundColor"}, // also of notes
+                                {"kDialogInactiveTextColor", "kDialogListBackgroundColor"},
+                                {"kDialogInactiveTextColor", "kListItemColor"},
+                                {"kDialogListInactiveTextColor", "kDialogListBackgroundColor"},
+                                {"kDialogListInactiveTextColor", "kListBackgroundColor"},
+                                {"kDialogListInactiveTextColor", "kListItemColor"},
+                                {"kDialogListTextColor", "kSystemHiliteColor"},
+                                {"kDialogActiveTextColor", "kDialogListBackgroundColor"},
+                                {"kDialogActiveTextColor", "kScrollBarBackgroundColor"},
+                                {"kDialogActiveTextColor", "kSystemHiliteColor"},
+                                {"kDialogButtonActiveTextColor", "tab-top"},
+                                {"kDialogButtonActiveTextColor", "tab-bottom"},
+                                {"kDialogButtonActiveTextColor", "kPopupFaceTopColor"},
+                                {"kDialogButtonActiveTextColor", "kPopupFaceBottomColor"},
+                                {"kMenuTextColor", "kMenuBackgroundColor"},
+                                {"kMenuHiliteTextColor", "kMenuHiliteColor"},
                                 {"kTooltipTextColor", "kTooltipBackgroundColor"},
                                 {"ink", "on-top"},
                                 {"ink", "on-bottom"},
                                 {"ink", "face-bottom"}})
             EXPECT_GE(Contrast(Colour(theme, pair.text), Colour(theme, pair.ground)), kReadable)
                 << name << ": " << pair.text << " on " << pair.ground;
+    }
+}
+
+TEST_F(Artwork, TellsControlsAndMarksFromTheirGround) {
+    struct Pair {
+        char const *mark, *ground;
+    };
+    for (char const *name : kThemes) {
+        Theme const theme(kSource / "themes" / (std::string(name) + ".xml"));
+        for (Pair const pair : {Pair{"choice-border-top", "kDialogListBackgroundColor"},
+                                {"choice-border-top", "kWindowBackgroundColor"},
+                                {"choice-border-bottom", "kDialogListBackgroundColor"},
+                                {"choice-border-bottom", "kWindowBackgroundColor"},
+                                {"choice-on-border", "kDialogListBackgroundColor"},
+                                {"choice-on-border", "kWindowBackgroundColor"},
+                                {"ink-on", "on-top"},
+                                {"ink-on", "on-bottom"},
+                                {"ink", "face-top"},
+                                {"ink", "pressed-top"},
+                                {"ink", "pressed-bottom"},
+                                {"ink-soft", "face-top"},
+                                {"ink-soft", "face-bottom"},
+                                {"ink-soft", "scroll-ground"},
+                                {"ink-soft", "kDialogListBackgroundColor"},
+                                {"record", "face-top"},
+                                {"record", "face-bottom"},
+                                {"record-on", "armed-top"},
+                                {"record-on", "armed-bottom"},
+                                {"accent", "kDialogListBackgroundColor"},
+                                {"badge", "kDialogListBackgroundColor"},
+                                {"scroll-thumb", "scroll-channel"},
+                                {"scroll-thumb", "scroll-ground"},
+                                {"field-border-top", "field-ground"},
+                                {"field-border-bottom", "field-ground"},
+                                {"field-mark", "field-ground"},
+                                {"field-cancel", "field-ground"},
+                                {"groove-border-top", "kDialogListBackgroundColor"},
+                                {"groove-border-bottom", "kDialogListBackgroundColor"},
+                                {"progress-top", "groove-top"},
+                                {"progress-top", "groove-bottom"},
+                                {"progress-bottom", "groove-top"},
+                                {"progress-bottom", "groove-bottom"},
+                                {"slider-fill", "slider-wedge"},
+                                {"kHiliteColor", "kDialogListBackgroundColor"},
+                                {"kFocusRingColor", "kWindowBackgroundColor"},
+                                {"kFocusRingColor", "kDialogListBackgroundColor"}})
+            EXPECT_GE(Contrast(Colour(theme, pair.mark), Colour(theme, pair.ground)), kRecognisable)
+                << name << ": " << pair.mark << " on " << pair.ground;
     }
 }
 

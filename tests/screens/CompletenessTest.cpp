@@ -119,6 +119,7 @@ TEST(Completeness, ThePageOfTextFieldsHasEveryKeyOfThem) {
 TEST(Completeness, EveryClassOfPanesIsShown) {
     SimulatedDesktop desktop;
     GalleryItems::Add();
+    GalleryFiles().AddResources();
     Names shown, missing;
     for (std::string const &path : Dialogs()) {
         glogRec *const glog = LoadGlog(path);

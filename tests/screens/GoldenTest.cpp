@@ -33,6 +33,7 @@ TEST_P(GoldenPage, LooksAsItDid) {
     auto const &[page, look] = GetParam();
     SimulatedDesktop desktop(OptionsFor(look));
     GalleryItems::Add();
+    GalleryFiles().AddResources();
     glogRec *const glog = LoadGlog(page.path);
     ShowGlog(glog, kShowGlog);
     EXPECT_TRUE(GoldenPicture::Matches(*Glog::From(glog).Pixels(), page.name + '-' + look.Name()));
@@ -159,6 +160,7 @@ TEST_P(GoldenPress, LooksAsItDid) {
     std::string const picture = directory.Path() + "/picture.png";
     SimulatedDesktop desktop(OptionsFor(look));
     GalleryItems::Add();
+    GalleryFiles().AddResources();
     ShowGlog(LoadGlog(TreeDirectory() + "/tests/screens/" + press.dialog + "-states.xml"), kShowGlog);
     desktop.Play(std::string(press.script) + "wait 0.5\nsnapshot " + picture);
     std::string error;

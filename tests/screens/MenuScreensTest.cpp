@@ -52,6 +52,7 @@ TEST_P(GoldenMenu, LooksAsItDid) {
     SimulatedDesktop desktop(DesktopOptions().Theme(look.theme).Scale(look.scale));
     static_cast<SimulatedWindowSystem &>(desktop.Windows()).SetPlacesPopups(false);
     GalleryItems::Add();
+    GalleryFiles().AddResources();
     ShowGlog(LoadGlog(TreeDirectory() + "/tests/screens/menu-states.xml"), kShowGlog);
     desktop.Play(std::string(menu.script) + "snapshot " + picture + "\nkey Escape\n");
     std::string error;
@@ -77,6 +78,7 @@ TEST(MenuWindows, ShowWhatIsDrawnOverAWindow) {
         SimulatedDesktop desktop;
         static_cast<SimulatedWindowSystem &>(desktop.Windows()).SetPlacesPopups(places);
         GalleryItems::Add();
+        GalleryFiles().AddResources();
         ShowGlog(LoadGlog(TreeDirectory() + "/tests/screens/menu-states.xml"), kShowGlog);
         desktop.Play("click 90 80\nwait 0.5\nmove 90 131\nwait 0.5\nsnapshot " + picture + "\nmenu 0\n");
         std::string error;

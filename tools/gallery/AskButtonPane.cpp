@@ -5,6 +5,7 @@
 #include "host/GlogStyleSheet.h"
 #include "host/PaneWatch.h"
 #include "tools/gallery/LabelText.h"
+#include "tools/gallery/Phrases.h"
 #include <memory>
 #include <new>
 
@@ -14,7 +15,7 @@ namespace {
 short const kBounceWindow = 600, kFormatWindow = 601;
 short const kReplaceBox = 3, kComplaint = 4, kFormatButton = 5;
 
-char const *const kAnswers[] = {"The dialog could not be opened", "Bounced", "Cancelled"};
+Phrase const kAnswers[] = {Phrase::kNotOpened, Phrase::kBounced, Phrase::kCancelled};
 
 class FormatDialog : public ModalGlogClass {
 public:
@@ -45,7 +46,7 @@ private:
         CheckBoxPane *const box = dynamic_cast<CheckBoxPane *>(GetGlogItem(GlogP(), kReplaceBox));
         if (box && box->ReadOne(0))
             return true;
-        LabelText::Show(GlogP(), kComplaint, ResourceKey("The old file is still there: check the box."));
+        LabelText::Show(GlogP(), kComplaint, Phrases::Get(Phrase::kFileIsThere));
         return false;
     }
 };
@@ -72,6 +73,6 @@ int AskButtonPane::HandleClick(EventRecordAdapter *event) {
         return result;
     short const answer = BounceDialog().Ask();
     if (watch.PaneExists())
-        LabelText::Show(GetGlog(), labelID, ResourceKey(kAnswers[answer < 0 ? 0 : answer]));
+        LabelText::Show(GetGlog(), labelID, Phrases::Get(kAnswers[answer < 0 ? 0 : answer]));
     return result;
 }

@@ -6,6 +6,7 @@
 #include "host/OSPort.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
+#include "tools/gallery/Phrases.h"
 #include <boost/make_shared.hpp>
 #include <memory>
 #include <new>
@@ -18,13 +19,14 @@ double const kCorner = 5;                          // diameter
 double const kFrameAlpha = 0.35;
 
 struct NamedColor {
-    char const *name;
+    Phrase name;
     OS::RGBAColor color;
 };
 NamedColor const kColors[] = {
-    {"Blue", {0.32, 0.56, 0.93, 1}},   {"Teal", {0.20, 0.68, 0.68, 1}},  {"Green", {0.33, 0.70, 0.42, 1}},
-    {"Amber", {0.92, 0.68, 0.24, 1}},  {"Coral", {0.90, 0.45, 0.36, 1}}, {"Rose", {0.86, 0.42, 0.62, 1}},
-    {"Violet", {0.58, 0.46, 0.86, 1}}, {"Slate", {0.48, 0.53, 0.60, 1}},
+    {Phrase::kBlue, {0.32, 0.56, 0.93, 1}},   {Phrase::kTeal, {0.20, 0.68, 0.68, 1}},
+    {Phrase::kGreen, {0.33, 0.70, 0.42, 1}},  {Phrase::kAmber, {0.92, 0.68, 0.24, 1}},
+    {Phrase::kCoral, {0.90, 0.45, 0.36, 1}},  {Phrase::kRose, {0.86, 0.42, 0.62, 1}},
+    {Phrase::kViolet, {0.58, 0.46, 0.86, 1}}, {Phrase::kSlate, {0.48, 0.53, 0.60, 1}},
 };
 short const kColorCount = sizeof kColors / sizeof kColors[0];
 
@@ -71,7 +73,7 @@ ColorMenuPane *ColorMenuPane::NewColorMenuPane(glogRec *owner, GlogStyleSheet *s
 
 void ColorMenuPane::AddColors() {
     for (short i = 0; i < kColorCount; ++i) {
-        AddItem(ResourceKey(kColors[i].name), kDashIsText);
+        AddItem(Phrases::Get(kColors[i].name), kDashIsText);
         ApplyDecoratorToItem(static_cast<short>(i + 1),
                              boost::make_shared<SwatchDecorator>(kColors[i].color));
     }

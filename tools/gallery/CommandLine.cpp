@@ -16,6 +16,7 @@ bool CommandLine::Parse(int argc, char **argv, int &status) {
     CLI::Option *const pictureOption = app.add_option(
         "--png-dir", pictures, "Write every page, in both themes and at 1x and 2x, to this directory");
     app.add_option("--theme", desktop.theme, "light or dark")->check(CLI::IsMember({"light", "dark"}));
+    app.add_option("--language", desktop.language, "en or de")->check(CLI::IsMember({"en", "de"}));
     app.add_option("--scale", desktop.scale, "Device pixels per pixel")
         ->check(CLI::Range(kSmallestScale, kLargestScale));
     app.add_option("--script", script, "Carry out the steps of this file without a display and end")

@@ -124,5 +124,5 @@ void EnvelopePane::ShowPoint(int index) {
     GraphDataPoint const point = envelope->GetPoint(index);
     char text[64];
     std::snprintf(text, sizeof text, "%d ms, %d dB", point.horizontal, point.vertical);
-    LabelText::Show(GetGlog(), labelID, ResourceKey(text));
+    LabelText::Show(GetGlog(), labelID, LabelText::WithMinus(text));
 }

@@ -4,6 +4,7 @@
 #include "host/glogRec.h"
 #include "scrolling/ScrollBarPane.h"
 #include "tools/gallery/LabelText.h"
+#include "tools/gallery/Phrases.h"
 #include <algorithm>
 #include <memory>
 #include <new>
@@ -16,10 +17,12 @@ double const kThumbRatio = 0.12;
 
 std::vector<TabPane::Item> Pages() {
     std::vector<TabPane::Item> pages;
-    char const *const names[][2] = {
-        {"Notes", "N"}, {"Modulation", "Mod"}, {"Automation", "Auto"}, {"Effects", "FX"}};
-    for (char const *const *name : names)
-        pages.push_back(TabPane::Item(ResourceKey(name[0]), ResourceKey(name[1])));
+    Phrase const names[][2] = {{Phrase::kNotes, Phrase::kNotesShort},
+                               {Phrase::kModulation, Phrase::kModulationShort},
+                               {Phrase::kAutomation, Phrase::kAutomationShort},
+                               {Phrase::kEffects, Phrase::kEffectsShort}};
+    for (Phrase const *name : names)
+        pages.push_back(TabPane::Item(Phrases::Get(name[0]), Phrases::Get(name[1])));
     return pages;
 }
 
@@ -62,9 +65,7 @@ void FittedTabsPane::Fit(int newWidth) {
     FitIntoRect(target);
     if (barWatch.PaneExists())
         bar->Set(width - kLeastWidth, GetMaxScrollValue(bar));
-    UString text = LabelText::OfNumber(width);
-    text += ResourceKey(" pixels");
-    LabelText::Show(GetGlog(), labelID, text);
+    LabelText::Show(GetGlog(), labelID, Phrases::Fill(Phrase::kPixels, {width}));
 }
 
 int FittedTabsPane::GetMaxScrollValue(ScrollBarPane *) { return widest.right - widest.left - kLeastWidth; }

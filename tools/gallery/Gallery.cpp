@@ -6,7 +6,6 @@
 #include "buttons/GIconButtonPane.h"
 #include "buttons/RadioButtonPane.h"
 #include "buttons/TwistDownButton.h"
-#include "desktop/resources/Resources.h"
 #include "dialogs/LoadGlog.h"
 #include "dialogs/Utf8.h"
 #include "graphics/PictPane.h"
@@ -17,6 +16,7 @@
 #include "tools/gallery/ChoiceButtonPane.h"
 #include "tools/gallery/GalleryItems.h"
 #include "tools/gallery/LabelText.h"
+#include "tools/gallery/Phrases.h"
 
 namespace {
 
@@ -46,32 +46,30 @@ int const kFill = 3;                // alignment: as wide as the group
 
 glogRec *LoadFrame(PageFiles const &files) {
     GalleryItems::Add();
-    Resources::Instance().AddDirectory(files.Directory());
+    files.AddResources();
     return LoadGlog(files.Frame());
 }
 
 // What a hit pane without a name of its own is called.
-char const *KindOf(GlogPane *pane) {
+Phrase KindOf(GlogPane *pane) {
     if (dynamic_cast<FrameButtonPane *>(pane))
-        return "Frame button";
+        return Phrase::kFrameButton;
     if (dynamic_cast<BoxSelectPane *>(pane))
-        return "Box select";
+        return Phrase::kBoxSelect;
     if (dynamic_cast<TwistDownButton *>(pane))
-        return "Triangle";
+        return Phrase::kTriangle;
     if (dynamic_cast<CheckBoxPane *>(pane))
-        return "Check boxes";
+        return Phrase::kCheckBoxes;
     if (dynamic_cast<RadioButtonPane *>(pane))
-        return "Radio buttons";
+        return Phrase::kRadioButtons;
     if (dynamic_cast<GIconButton *>(pane) || dynamic_cast<GIconButtonPane *>(pane))
-        return "Icon button";
+        return Phrase::kIconButton;
     if (dynamic_cast<PopMPane *>(pane))
-        return "Pop-up menu";
+        return Phrase::kPopUpMenu;
     if (dynamic_cast<PictPane *>(pane))
-        return "Picture";
-    return dynamic_cast<GIconPane *>(pane) ? "Icon" : "Button";
+        return Phrase::kPicture;
+    return dynamic_cast<GIconPane *>(pane) ? Phrase::kIcon : Phrase::kButton;
 }
-
-UString Text(char const *utf8) { return Utf8::ToUString(utf8); }
 
 } // namespace
 
@@ -115,7 +113,7 @@ void Gallery::ShowPage(std::size_t index) {
         place->Del(0);
     page = index;
     MarkChoices();
-    SetStatus(Text("Press something"));
+    SetStatus(Phrases::Get(Phrase::kPressSomething));
 }
 
 void Gallery::Choose(int id, bool on) {
@@ -181,21 +179,15 @@ void Gallery::Report(GlogPane *pane, int item, int value) {
     UString name;
     if (button)
         button->GetButtonText(name);
-    UString text = name.empty() ? Text(KindOf(pane)) : name;
-    text += Text(", item ");
-    text += LabelText::OfNumber(item);
-    text += Text(", was pressed and answered ");
-    text += LabelText::OfNumber(value);
-    SetStatus(text);
+    if (name.empty())
+        name = Phrases::Get(KindOf(pane));
+    SetStatus(
+        Phrases::Fill(Phrase::kWasPressed, {name, LabelText::OfNumber(item), LabelText::OfNumber(value)}));
 }
 
 void Gallery::ReportCommand(CommandSpecifier const &command) {
-    UString text = Text("Command ");
-    text += LabelText::OfNumber(command.commandID);
-    text += Text(" of class ");
-    text += LabelText::OfNumber(command.classID);
-    text += Text(" was sent");
-    SetStatus(text);
+    SetStatus(Phrases::Fill(Phrase::kCommandSent,
+                            {LabelText::OfNumber(command.commandID), LabelText::OfNumber(command.classID)}));
 }
 
 void Gallery::SetStatus(UString const &text) { LabelText::Show(window, kStatus, text); }

@@ -14,6 +14,7 @@
 #include "tools/gallery/HoldButtonPane.h"
 #include "tools/gallery/LinesPane.h"
 #include "tools/gallery/PannerPane.h"
+#include "tools/gallery/Phrases.h"
 #include "tools/gallery/SoundListPane.h"
 #include "tools/gallery/StepperPane.h"
 #include "tools/gallery/TakeListPane.h"
@@ -53,12 +54,8 @@ GlogPane *MakeBarMenu(glogRec *glog, GlogStyleSheet *sheet) {
     Rect bounds = OptionalRect(sheet->GetItemRes(), "BoundsRect");
     PopMPane *const pane = PopMPane::NewPopMPane(glog, 0, 0, &bounds, kEmptyMenu);
     int const count = sheet->GetSInt32ItemValue(ResourceKey("Num"));
-    for (int bar = 1; pane && bar <= count; ++bar) {
-        UString name = ResourceKey("Bar "), number;
-        tarn::NumToUString(bar, tarn::kPlainNumber, number);
-        name += number;
-        pane->AddItem(name, PopUpMenu::kDashIsText);
-    }
+    for (int bar = 1; pane && bar <= count; ++bar)
+        pane->AddItem(Phrases::Fill(Phrase::kBarNumber, {bar}), PopUpMenu::kDashIsText);
     return pane;
 }
 

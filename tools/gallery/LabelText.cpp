@@ -1,6 +1,8 @@
 #include "tools/gallery/LabelText.h"
+#include "dialogs/Utf8.h"
 #include "host/glogRec.h"
 #include "text/LabelPane.h"
+#include <string>
 
 void LabelText::Show(glogRec *glog, int labelID, UString const &text) {
     Show(GetGlogItem(glog, static_cast<short>(labelID)), text);
@@ -15,4 +17,15 @@ UString LabelText::OfNumber(int number) {
     UString text;
     tarn::NumToUString(number, tarn::kPlainNumber, text);
     return text;
+}
+
+UString LabelText::WithMinus(char const *ascii) {
+    std::string text;
+    for (; *ascii; ++ascii) {
+        if (*ascii == '-')
+            text += "\u2212";
+        else
+            text += *ascii;
+    }
+    return Utf8::ToUString(text);
 }

@@ -11,6 +11,7 @@ namespace LabelText {
 void Show(glogRec *, int labelID, UString const &);
 // The same for a pane that is a label; any other, and null, has no effect.
 void Show(GlogPane *, UString const &);
-UString OfNumber(int); // in digits
+UString OfNumber(int);                // in digits
+UString WithMinus(char const *ascii); // with a minus sign in place of each hyphen
 
 } // namespace LabelText

@@ -8,6 +8,7 @@
 #include "lists/ListPane.h"
 #include "scrolling/GutterPane.h"
 #include "tools/gallery/LabelText.h"
+#include "tools/gallery/Phrases.h"
 #include "tools/gallery/WellPane.h"
 #include <iterator>
 #include <memory>
@@ -17,12 +18,11 @@ namespace {
 
 short const kBarThickness = 16, kBorder = 1, kMargin = 6, kNumberWidth = 24; // pixels
 short const kFirstBar = 904;                                                 // item number
-int const kLineHeight = 18, kListWidth = 420;                                // pixels
+int const kLineHeight = 18, kListWidth = 720;                                // pixels
 int const kFont = 0;                                                         // index in the font table
 int const kCentredVertically = 1;
-char const *const kSections[] = {"Intro, drums and a little noise", "Verse, with bass and the first guitar",
-                                 "Chorus, everybody, strings an octave higher the second time",
-                                 "Bridge, piano alone"};
+Phrase const kSections[] = {Phrase::kFirstSection, Phrase::kSecondSection, Phrase::kThirdSection,
+                            Phrase::kFourthSection};
 
 short Pixel(int value) { return static_cast<short>(value); }
 
@@ -47,7 +47,7 @@ public:
         VelaDrawing::RGBForeColor(kDialogListInactiveTextColor);
         Draw(LabelText::OfNumber(line + 1), number, TextSettings::kAlignRight);
         VelaDrawing::RGBForeColor(kDialogListTextColor);
-        Draw(ResourceKey(kSections[line % static_cast<int>(std::size(kSections))]), text,
+        Draw(Phrases::Get(kSections[line % static_cast<int>(std::size(kSections))]), text,
              TextSettings::kAlignLeft);
     }
 

@@ -1,4 +1,5 @@
 #include "tools/gallery/PageFiles.h"
+#include "desktop/resources/Resources.h"
 #include <algorithm>
 #include <cstdlib>
 #include <filesystem>
@@ -47,6 +48,13 @@ PageFiles::PageFiles(std::string const &given) {
     std::sort(found.begin(), found.end(), ComesBefore);
     for (fs::path const &page : found)
         pages.push_back({NameOf(page), page.string()});
+}
+
+void PageFiles::AddResources() const {
+    Resources &resources = Resources::Instance();
+    std::vector<std::string> const known = resources.Directories();
+    if (std::find(known.begin(), known.end(), directory) == known.end())
+        resources.AddDirectory(directory);
 }
 
 std::size_t PageFiles::Find(std::string const &name) const {

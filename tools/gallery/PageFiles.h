@@ -18,8 +18,12 @@ public:
     // share/glogpanes/gallery beside the program's own directory, where sounds/ is too.
     static std::string OwnDirectory();
 
-    std::string const &Directory() const { return directory; } // also of the windows that pages open
-    std::string const &Frame() const { return frame; }         // the dialog round the pages
+    // Adds strings/ and the windows that pages open to the resources of the desktop, if they are not there
+    // yet; to be called once it is open, and before a page is loaded.
+    void AddResources() const;
+
+    std::string const &Directory() const { return directory; }
+    std::string const &Frame() const { return frame; } // the dialog round the pages
     std::vector<PageFile> const &Pages() const { return pages; }
     // The place of the page in Pages(). Throws std::runtime_error, naming the pages there are.
     std::size_t Find(std::string const &name) const;

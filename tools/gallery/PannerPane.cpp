@@ -25,7 +25,7 @@ private:
         Point3D const place = readout.pane.GetValue();
         char text[64];
         std::snprintf(text, sizeof text, "x %.2f   y %.2f   z %.2f", place.x, place.y, place.z);
-        LabelText::Show(readout.pane.GetGlog(), readout.labelID, ResourceKey(text));
+        LabelText::Show(readout.pane.GetGlog(), readout.labelID, LabelText::WithMinus(text));
     }
 
     ThreeDPane &pane;

@@ -6,8 +6,9 @@ class PageFiles;
 
 namespace Pictures {
 
-// Writes NAME-THEME-SCALE.png for every page, in both themes, at 1x and 2x, into the directory, which is made
-// when it is not there, and prints the paths. Throws std::runtime_error, LoadError too, with what went wrong.
-void WriteAll(PageFiles const &, std::string const &directory);
+// Writes NAME-THEME-SCALE.png for every page, in the language ("en" or "de"), in both themes, at 1x and 2x,
+// into the directory, which is made when it is not there, and prints the paths. Throws std::runtime_error,
+// LoadError too, with what went wrong.
+void WriteAll(PageFiles const &, std::string const &language, std::string const &directory);
 
 } // namespace Pictures

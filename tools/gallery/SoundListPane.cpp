@@ -12,6 +12,7 @@
 #include "scrolling/ScrollBarPane.h"
 #include "text/SearchFieldPane.h"
 #include "tools/gallery/LabelText.h"
+#include "tools/gallery/Phrases.h"
 #include <algorithm>
 #include <boost/make_shared.hpp>
 #include <memory>
@@ -148,11 +149,9 @@ void SoundListPane::Choose(int row) {
 void SoundListPane::SelectionDone(GListPane *) { TellChosen(); }
 
 void SoundListPane::TellFound() {
-    UString text = Grouped(sounds.CountFound());
-    text += Utf8::ToUString(" of ");
-    text += Grouped(SoundNames::kCount);
-    text += Utf8::ToUString(" sounds");
-    LabelText::Show(container->FindByID(foundID), text);
+    LabelText::Show(
+        container->FindByID(foundID),
+        Phrases::Fill(Phrase::kSoundsFound, {Grouped(sounds.CountFound()), Grouped(SoundNames::kCount)}));
 }
 
 void SoundListPane::TellChosen() {
@@ -160,7 +159,7 @@ void SoundListPane::TellChosen() {
     bool const isChosen =
         list->NumSelected() > 0 && list->GetFirstSelectedItem(row) && row < sounds.CountFound();
     LabelText::Show(container->FindByID(chosenID),
-                    isChosen ? sounds.Name(row) : Utf8::ToUString("Nothing is chosen"));
+                    isChosen ? sounds.Name(row) : Phrases::Get(Phrase::kNothingChosen));
 }
 
 // Drawing

@@ -15,6 +15,7 @@
 #include "scrolling/ScrollBarPane.h"
 #include "tools/gallery/LabelText.h"
 #include "tools/gallery/ListHeaderPane.h"
+#include "tools/gallery/Phrases.h"
 #include <algorithm>
 #include <filesystem>
 #include <initializer_list>
@@ -41,8 +42,6 @@ short const kModeCount = sizeof kModes / sizeof *kModes;
 GListSelectionMode const kFirstMode = kListSelectSeveral;
 
 short Pixel(int value) { return static_cast<short>(value); }
-
-UString Text(char const *utf8) { return Utf8::ToUString(utf8); }
 
 } // namespace
 
@@ -99,10 +98,11 @@ TakeListPane::TakeListPane(GlogStyleSheet *sheet, int count)
     , takes(count)
     , columns(new ColumnList(kColumns)) {
     SetNoErase(1);
-    char const *const names[] = {"No.", "Take", "Length", "Keep"};
+    Phrase const names[] = {Phrase::kNumberHeading, Phrase::kTakeHeading, Phrase::kLengthHeading,
+                            Phrase::kKeepHeading};
     int left = 0;
     for (int column = 0; column < kColumns; ++column) {
-        columns->SetName(column, Text(names[column]));
+        columns->SetName(column, Phrases::Get(names[column]));
         columns->SetColumnMargin(column, kMargin);
         columns->SetBothEdges(column, left, left + kFirstWidths[column]);
         left = columns->GetRightEdge(column);
@@ -180,24 +180,23 @@ void TakeListPane::ActOn(int line, int column, Point where) {
             return;
         takes.Move(line, to);
         list->Inval(); // also of what scrolled
-        Tell(Text("The row was moved"));
+        Tell(Phrases::Get(Phrase::kRowMoved));
     } else if (column == kKept && list->TrackCol(line, column)) {
         takes.SetKept(line, !takes.IsKept(line));
         list->InvalRow(line);
-        Tell(takes.IsKept(line) ? Text("The take is kept") : Text("The take may go"));
+        Tell(Phrases::Get(takes.IsKept(line) ? Phrase::kTakeIsKept : Phrase::kTakeMayGo));
     }
 }
 
 void TakeListPane::PrintToFile() {
     try {
         std::string const path = (std::filesystem::temp_directory_path() / kPrintedFile).string();
-        int const pages = Desktop::Current()->Print(list, path, PrintOptions().Header("Takes", "", ""));
-        UString text = LabelText::OfNumber(pages);
-        text += Text(pages == 1 ? " page in " : " pages in ");
-        text += Text(kPrintedFile);
-        Tell(text);
+        std::string const heading = Utf8::FromUString(Phrases::Get(Phrase::kTakes));
+        int const pages = Desktop::Current()->Print(list, path, PrintOptions().Header(heading, "", ""));
+        Tell(Phrases::Fill(pages == 1 ? Phrase::kPageIn : Phrase::kPagesIn,
+                           {LabelText::OfNumber(pages), Utf8::ToUString(kPrintedFile)}));
     } catch (std::runtime_error const &error) {
-        Tell(Text(error.what()));
+        Tell(Utf8::ToUString(error.what()));
     }
 }
 
@@ -207,11 +206,7 @@ void TakeListPane::Tell(UString const &text) {
 }
 
 void TakeListPane::TellSelected() {
-    UString text = LabelText::OfNumber(list->NumSelected());
-    text += Text(" of ");
-    text += LabelText::OfNumber(takes.Count());
-    text += Text(" selected");
-    Tell(text);
+    Tell(Phrases::Fill(Phrase::kSelected, {list->NumSelected(), takes.Count()}));
 }
 
 // Drawing
@@ -251,7 +246,7 @@ void TakeListPane::DrawLine(int line, Rect *rowBox, bool hilite) {
     Rect const cell = CellIn(*rowBox, kKept);
     if (printed) {
         if (takes.IsKept(line))
-            DrawText(Text("kept"), *rowBox, kKept);
+            DrawText(Phrases::Get(Phrase::kKept), *rowBox, kKept);
         return;
     }
     Draw1Icon(kCheckFamily, takes.IsKept(line) ? kCheckOn : kCheckOff,

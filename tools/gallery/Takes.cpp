@@ -1,12 +1,14 @@
 #include "tools/gallery/Takes.h"
 #include "dialogs/Utf8.h"
 #include "tools/gallery/LabelText.h"
+#include "tools/gallery/Phrases.h"
 #include <algorithm>
 #include <numeric>
 
 namespace {
 
-char const *const kParts[] = {"Intro", "Verse", "Chorus", "Verse", "Bridge", "Solo", "Chorus", "Outro"};
+Phrase const kParts[] = {Phrase::kIntro,  Phrase::kVerse, Phrase::kChorus, Phrase::kVerse,
+                         Phrase::kBridge, Phrase::kSolo,  Phrase::kChorus, Phrase::kOutro};
 unsigned const kPartCount = sizeof kParts / sizeof *kParts;
 unsigned const kSecondsInMinute = 60, kShortest = 12, kSpread = 260; // seconds
 unsigned const kKeptOneIn = 5;
@@ -31,10 +33,8 @@ UString Takes::Number(int row) const { return LabelText::OfNumber(Take(row) + 1)
 
 UString Takes::Name(int row) const {
     int const take = Take(row);
-    UString name = Utf8::ToUString(kParts[Scattered(take) % kPartCount]);
-    name += Utf8::ToUString(", take ");
-    name += LabelText::OfNumber(take % 24 + 1);
-    return name;
+    UString const part = Phrases::Get(kParts[Scattered(take) % kPartCount]);
+    return Phrases::Fill(Phrase::kTakeName, {part, LabelText::OfNumber(take % 24 + 1)});
 }
 
 UString Takes::Length(int row) const {

@@ -1,7 +1,6 @@
 #include "tools/gallery/TrackListPane.h"
 #include "buttons/ButtonGroupPane.h"
 #include "buttons/GlogButtonPane.h"
-#include "dialogs/Utf8.h"
 #include "frame/ResourceReading.h"
 #include "host/GlogStyleSheet.h"
 #include "host/NamedColors.h"
@@ -10,6 +9,7 @@
 #include "host/VelaDrawing.h"
 #include "scrolling/ScrollGridPlus.h"
 #include "tools/gallery/LabelText.h"
+#include "tools/gallery/Phrases.h"
 #include "tools/gallery/TrackRowPane.h"
 #include "tools/gallery/WellPane.h"
 #include <algorithm>
@@ -314,13 +314,11 @@ void TrackListPane::Choose(TrackRowPane *row) {
 short TrackListPane::ChosenIndex() const { return chosen ? rows->Find(chosen) : short(-1); }
 
 void TrackListPane::TellChosen() {
-    UString text = chosen ? chosen->Name() : Utf8::ToUString("No track");
-    if (chosen) {
-        text += Utf8::ToUString(", row ");
-        text += LabelText::OfNumber(ChosenIndex() + 1);
-    }
-    text += Utf8::ToUString(" of ");
-    text += LabelText::OfNumber(rows->NumSubpanes());
-    if (container)
-        LabelText::Show(container->FindByID(labelID), text);
+    if (!container)
+        return;
+    UString const count = LabelText::OfNumber(rows->NumSubpanes());
+    LabelText::Show(container->FindByID(labelID),
+                    chosen ? Phrases::Fill(Phrase::kTrackRow,
+                                           {chosen->Name(), LabelText::OfNumber(ChosenIndex() + 1), count})
+                           : Phrases::Fill(Phrase::kNoTrack, {count}));
 }

@@ -10,13 +10,15 @@
 #include "host/VelaDrawing.h"
 #include "text/LabelPane.h"
 #include "tools/gallery/LabelText.h"
+#include "tools/gallery/Phrases.h"
 #include <memory>
 #include <new>
 #include <utility>
 
 namespace {
 
-char const *const kInstruments[] = {"Drums", "Percussion", "Bass", "Guitar", "Piano", "Strings", "Voice"};
+Phrase const kInstruments[] = {Phrase::kDrums, Phrase::kPercussion, Phrase::kBass, Phrase::kGuitar,
+                               Phrase::kPiano, Phrase::kStrings,    Phrase::kVoice};
 short const kColours[] = {0, 0, 1, 2, 3, 4, 1}; // icons of kClipFamily
 int const kInstrumentCount = sizeof kInstruments / sizeof *kInstruments;
 
@@ -79,7 +81,7 @@ TrackRowPane *TrackRowPane::NewTrackRowPane(glogRec *owner, int number, int bars
 }
 
 TrackRowPane::TrackRowPane(int number_, Listener listener_)
-    : name(Utf8::ToUString(kInstruments[(number_ - 1) % kInstrumentCount]))
+    : name(Phrases::Get(kInstruments[(number_ - 1) % kInstrumentCount]))
     , listener(std::move(listener_))
     , number(number_) {
     SetNoErase(1);
@@ -118,9 +120,7 @@ void TrackRowPane::SetBars(int to) {
     int clips = 0;
     for (int bar = 0; bar < bars; ++bar)
         clips += HasClip(bar);
-    UString text = LabelText::OfNumber(clips);
-    text += Utf8::ToUString(clips == 1 ? " clip" : " clips");
-    count->SetText(text);
+    count->SetText(Phrases::Fill(clips == 1 ? Phrase::kClip : Phrase::kClips, {clips}));
     Rect box;
     GetBox(&box);
     box.right = static_cast<short>(box.left + WidthOf(bars));

@@ -10,6 +10,7 @@
 #include "scrolling/ScrollBarPane.h"
 #include "tools/gallery/LabelText.h"
 #include "tools/gallery/PageFiles.h"
+#include "tools/gallery/Phrases.h"
 #include "tools/gallery/WellPane.h"
 #include <algorithm>
 #include <cmath>
@@ -27,6 +28,12 @@ float const kStep = 1.0f / 12.0f; // of the zoom
 double const kSamplesPerSecond = 11025;
 int const kLoudest = 32768;
 char const kRecording[] = "/sounds/loop.wav";
+
+UString InSeconds(int sample) {
+    char text[32];
+    std::snprintf(text, sizeof text, "%.2f", sample / kSamplesPerSecond);
+    return ResourceKey(text);
+}
 
 } // namespace
 
@@ -185,11 +192,11 @@ void WaveViewPane::Scroll(ScrollBarPane *, int &amount, int &multiplier) {
 
 void WaveViewPane::ShowPlace() {
     bar->Set(first, GetMaxScrollValue(bar));
-    char text[64];
-    std::snprintf(text, sizeof text, "%.2f s to %.2f s", first / kSamplesPerSecond,
-                  (first + Shown()) / kSamplesPerSecond);
-    LabelText::Show(GetGlog(), labelID, ResourceKey(text));
-    GlogPane *const progress = GetGlogItem(GetGlog(), static_cast<short>(progressID));
+    if (!container)
+        return;
+    LabelText::Show(container->FindByID(labelID),
+                    Phrases::Fill(Phrase::kStretch, {InSeconds(first), InSeconds(first + Shown())}));
+    GlogPane *const progress = container->FindByID(progressID);
     if (ProgressBarPane *const shown = dynamic_cast<ProgressBarPane *>(progress))
         shown->SetProgress(first + Shown(), std::max(All(), 1));
 }

@@ -49,10 +49,10 @@ int Run(CommandLine const &line) {
     if (!line.script.empty())
         return RunScript(line, files);
     if (!line.pictures.empty())
-        return Pictures::WriteAll(files, line.pictures), 0;
+        return Pictures::WriteAll(files, line.desktop.language, line.pictures), 0;
     if (std::unique_ptr<Desktop> const desktop = OpenDesktop(line))
         return Show(*desktop, line, files);
-    return Pictures::WriteAll(files, kPictureDirectory), 0;
+    return Pictures::WriteAll(files, line.desktop.language, kPictureDirectory), 0;
 }
 
 } // namespace
