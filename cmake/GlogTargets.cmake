@@ -37,8 +37,16 @@ function(glog_program name)
   target_link_libraries(${name} PRIVATE glog_flags)
 endfunction()
 
-# glog_add_test(NAME FOLDER LIBS...): one GoogleTest program from all sources of tests/FOLDER. Its tests are known to
-# ctest, each a process of its own; with GLOG_TEST_SHARDS it runs in so many processes instead.
+# What tests and tools do is done by the libraries: a sanitizer's checks are compiled into them three times as fast
+# without optimisation.
+set(glog_quick_options "")
+if(GLOG_SANITIZE)
+  set(glog_quick_options -O0)
+endif()
+
+# glog_add_test(NAME FOLDER LIBS...): one GoogleTest program from all sources of tests/FOLDER. ctest knows each of its
+# tests by name, as a process of its own, labelled "alone". Many processes take long, so with
+# "ctest -C together -LE alone" the program runs in two halves instead, NAME.0 and NAME.1.
 function(glog_add_test name folder)
   file(GLOB sources CONFIGURE_DEPENDS ${CMAKE_SOURCE_DIR}/tests/${folder}/*.cpp)
   if(NOT sources)
@@ -46,18 +54,23 @@ function(glog_add_test name folder)
   endif()
   glog_program(${name} ${sources})
   target_include_directories(${name} PRIVATE ${CMAKE_SOURCE_DIR})
-  target_link_libraries(${name} PRIVATE ${ARGN} GTest::gtest GTest::gtest_main)
-  target_precompile_headers(${name} PRIVATE <gtest/gtest.h>)
+  target_link_libraries(${name} PRIVATE ${ARGN} test_main)
+  if(TARGET artwork)
+    add_dependencies(${name} artwork)
+  endif()
+  target_compile_options(${name} PRIVATE ${glog_quick_options})
+  target_precompile_headers(${name} REUSE_FROM test_headers)
   target_compile_definitions(${name} PRIVATE GLOG_TEST_SOURCE_DIR="${CMAKE_SOURCE_DIR}/tests"
                              GLOG_TEST_OUTPUT_DIR="${CMAKE_BINARY_DIR}/test-output")
-  if(NOT GLOG_TEST_SHARDS)
-    gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 120)
-    return()
+  gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 120 LABELS alone)
+  # Without a sanitizer in another order, so that no test lives on what an earlier one left.
+  set(order "")
+  if(NOT GLOG_SANITIZE)
+    set(order ";GTEST_SHUFFLE=1;GTEST_RANDOM_SEED=1")
   endif()
-  math(EXPR last "${GLOG_TEST_SHARDS} - 1")
-  foreach(shard RANGE ${last})
-    add_test(NAME ${name}.${shard} COMMAND ${name})
-    set_tests_properties(${name}.${shard} PROPERTIES TIMEOUT 600 ENVIRONMENT
-                         "GTEST_TOTAL_SHARDS=${GLOG_TEST_SHARDS};GTEST_SHARD_INDEX=${shard}")
+  foreach(half 0 1)
+    add_test(NAME ${name}.${half} COMMAND ${name} CONFIGURATIONS together)
+    set_tests_properties(${name}.${half} PROPERTIES TIMEOUT 600 ENVIRONMENT
+                         "GTEST_BRIEF=1;GTEST_TOTAL_SHARDS=2;GTEST_SHARD_INDEX=${half}${order}")
   endforeach()
 endfunction()
