@@ -97,18 +97,22 @@ void FrameTextWell(Rect const &r) {
     PixelScope pixels(*port);
     if (!pixels.CanDraw())
         return;
-    Rect inside = r;
-    VelaDrawing::InsetRect(&inside, 1, 1);
-    // Text begins a little inside of the frame, and its paper with it.
-    Rect text = inside;
-    VelaDrawing::InsetRect(&text, 1, 1);
-    if (VelaDrawing::EmptyRect(&text))
-        text = {inside.top, inside.left, inside.top, inside.left};
-    pixels.FillFrame(pixels.ToDevice(inside), pixels.ToDevice(text), ToRGBA(kTextWellBackgroundColor));
-    pixels.FillFrame(pixels.ToDevice(r), pixels.ToDevice(inside), Outline(kWellBorderAlpha));
+    // As thick on every side, wherever the edges are rounded to.
+    int const line = std::max(1, port->Scale().Edge(1));
+    DeviceRect const outer = pixels.ToDevice(r);
+    DeviceRect const inside = {outer.left + line, outer.top + line, outer.right - line, outer.bottom - line};
+    pixels.FillFrame(outer, inside, Outline(kWellBorderAlpha));
     // The well lies deeper than its surroundings: light from above leaves its upper edge in the shade.
-    pixels.Fill(pixels.ToDevice(r.left, r.top, r.right, r.top + 1), Shade(kWellTopBorderAlpha));
-    if (!VelaDrawing::EmptyRect(&inside))
-        pixels.Fill(pixels.ToDevice(inside.left, inside.top, inside.right, inside.top + 1),
-                    Shade(kWellShadowAlpha));
+    pixels.Fill({outer.left, outer.top, outer.right, std::min(outer.top + line, outer.bottom)},
+                Shade(kWellTopBorderAlpha));
+    if (inside.Empty())
+        return;
+    // Text begins a little inside of the frame, and its paper with it.
+    Rect text = r;
+    VelaDrawing::InsetRect(&text, 2, 2);
+    DeviceRect const paper = pixels.ToDevice(text);
+    pixels.FillFrame(inside, paper, ToRGBA(kTextWellBackgroundColor));
+    int const below = paper.Empty() ? inside.bottom : paper.top;
+    pixels.Fill({inside.left, inside.top, inside.right, std::min(inside.top + line, below)},
+                Shade(kWellShadowAlpha));
 }

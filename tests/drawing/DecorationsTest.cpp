@@ -112,6 +112,26 @@ TEST(FrameTextWell, TheOutlineShowsOnDarkPaperToo) {
     EXPECT_GT(Brightness(canvas.At(8, 1)), 0x20 + 40);
 }
 
+TEST(FrameTextWell, TheOutlineIsAsThickOnEverySideAtEveryScale) {
+    for (double scale : {1.0, 1.25, 1.5, 1.75, 2.0, 3.0})
+        for (short shift = 0; shift < 4; ++shift) {
+            Canvas canvas(30, 30, scale);
+            FrameTextWell({static_cast<short>(4 + shift), static_cast<short>(5 + shift),
+                           static_cast<short>(21 + shift), static_cast<short>(22 + shift)});
+            int const middle = DeviceScale(scale).Edge(13 + shift);
+            int left = 0, right = 0, bottom = 0;
+            for (int i = 0; i < DeviceScale(scale).Edge(30); ++i) {
+                bool const isOutlined = Brightness(canvas.At(i, middle)) < 200;
+                left += isOutlined && i < middle;
+                right += isOutlined && i > middle;
+                bottom += Brightness(canvas.At(middle, i)) < 200 && i > middle;
+            }
+            EXPECT_EQ(left, right) << scale << ' ' << shift;
+            EXPECT_EQ(left, bottom) << scale << ' ' << shift;
+            EXPECT_GT(left, 0) << scale << ' ' << shift;
+        }
+}
+
 TEST(FrameTextWell, SmallRectanglesAreHarmless) {
     for (short side = -1; side < 3; ++side) {
         Canvas canvas(6, 6);
