@@ -116,6 +116,12 @@ void DrawingPort::SetSurface(Surface *newSurface, DeviceScale newScale) {
     device->ForgetSurface();
 }
 
+void DrawingPort::ExchangeSurface(Surface &other) {
+    FinishGround();
+    surface = &other;
+    device->ForgetContext();
+}
+
 void DrawingPort::SetExtent(int width, int height) {
     extent = {0, 0, SaturatedPixel(std::max(height, 0)), SaturatedPixel(std::max(width, 0))};
     Region::IntersectRect(damage, extent);
@@ -380,10 +386,23 @@ void DrawingPort::MoveDevicePixels(OSRgn const &destination, int dh, int dv) {
         return;
     NoteMove(boxes, dx, dy);
     FinishGround();
+    if (boxes.size() == 1 && dx == 0 &&
+        ScrollPixels({boxes[0].x1, boxes[0].y1, boxes[0].x2, boxes[0].y2}, dy))
+        return;
     pixman_region32_t region;
     pixman_region32_init_rects(&region, boxes.data(), static_cast<int>(boxes.size()));
     MovePixels(*surface, region, dx, dy);
     pixman_region32_fini(&region);
+}
+
+// False where it is not worth while.
+bool DrawingPort::ScrollPixels(DeviceRect const &to, int dy) {
+    int const kLeastPixels = 0x8000; // that moving takes longer for than all else
+    DeviceRect const from = PixelMove{to, 0, dy}.From(), all = to.United(from);
+    if (!surface->Scrolls() || to.Width() * to.Height() < kLeastPixels || 2 * std::abs(dy) >= all.Height())
+        return false;
+    surface->Scroll(all, dy);
+    return true;
 }
 
 // Moves in several boxes, and after something else that is not shown yet, are rare: those are shown by their

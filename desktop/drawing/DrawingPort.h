@@ -59,6 +59,8 @@ public:
     // called, if need be with null, before the surface dies.
     void SetSurface(Surface *, DeviceScale);
     Surface *GetSurface() const { return surface; }
+    // Another surface of the same size from here on, for the same pixels. Clip and state stay.
+    void ExchangeSurface(Surface &);
     // A page of paper instead of pixels: everything becomes shapes, text and images on it. What the surface
     // takes for a pixel must be one of the scale. Not owned; null, like another surface, ends it.
     void SetPage(cairo_surface_t *, DeviceScale);
@@ -160,6 +162,7 @@ private:
     // `line` is the width of a frame in device pixels; 0 fills.
     void DrawRoundRect(Rect const &bounds, OS::Size const &corner, int line);
     void MoveDevicePixels(OSRgn const &destination, int dh, int dv);
+    bool ScrollPixels(DeviceRect const &to, int dy);
     void NoteMove(std::vector<pixman_box32> const &boxes, int dx, int dy);
     static DrawingPort *current;
 

@@ -22,6 +22,10 @@ void DrawingPort::Device::ForgetClip() {
 void DrawingPort::Device::ForgetSurface() {
     ForgetClip();
     ground.Forget();
+    ForgetContext();
+}
+
+void DrawingPort::Device::ForgetContext() {
     if (context)
         cairo_destroy(context);
     context = nullptr;

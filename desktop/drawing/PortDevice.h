@@ -12,6 +12,7 @@ struct DrawingPort::Device {
     Device &operator=(Device const &) = delete;
 
     void ForgetClip();
+    void ForgetContext();
     void ForgetSurface();
     // The boxes of the port's clip in device pixels, and the smallest box around them. Cached until
     // ForgetClip.

@@ -94,8 +94,32 @@ Surface::Surface(int width_, int height_)
     : width(std::max(width_, 1))
     , height(std::max(height_, 1))
     , pixels(NewPixels(width, height))
+    , memory{pixels.data(), width}
     , image(NewImage(pixels.data(), width, height))
     , cairo(nullptr) {}
+
+Surface::Surface(Surface const &whole, std::uint32_t *pixels_)
+    : width(whole.width)
+    , height(whole.height)
+    , memory{pixels_, width}
+    , image(NewImage(pixels_, width, height))
+    , cairo(nullptr) {}
+
+// Of the rows that the place of the first one tells, only those of the part are in the memory.
+std::unique_ptr<Surface> Surface::PartOf(DeviceRect const &part) {
+    if (!ring.IsTurned())
+        return nullptr;
+    std::optional<int> const shift = ring.Shift(part);
+    if (!shift) {
+        Settle();
+        return nullptr;
+    }
+    std::uintptr_t const first = reinterpret_cast<std::uintptr_t>(pixels.data());
+    std::ptrdiff_t const bytes =
+        static_cast<std::ptrdiff_t>(*shift) * width * static_cast<std::ptrdiff_t>(sizeof(std::uint32_t));
+    return std::unique_ptr<Surface>(
+        new Surface(*this, reinterpret_cast<std::uint32_t *>(first + static_cast<std::uintptr_t>(bytes))));
+}
 
 Surface::~Surface() {
     if (cairo) {
@@ -106,8 +130,9 @@ Surface::~Surface() {
 }
 
 cairo_surface_t *Surface::CairoSurface() {
+    Settle();
     if (!cairo)
-        cairo = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(pixels.data()),
+        cairo = cairo_image_surface_create_for_data(reinterpret_cast<unsigned char *>(memory.pixels),
                                                     CAIRO_FORMAT_ARGB32, width, height,
                                                     width * static_cast<int>(sizeof(std::uint32_t)));
     return cairo;

@@ -1,6 +1,7 @@
 // A window's pixels, on which integer drawing and curves both work.
 #pragma once
 #include "desktop/drawing/DeviceScale.h"
+#include "desktop/drawing/RowRing.h"
 #include <cstddef>
 #include <cstdint>
 #include <memory>
@@ -22,19 +23,44 @@ public:
 
     int Width() const { return width; }
     int Height() const { return height; }
-    std::uint32_t *Pixels() { return pixels.data(); }
-    std::uint32_t const *Pixels() const { return pixels.data(); }
+    std::uint32_t *Pixels() { return Row(0); }
+    std::uint32_t const *Pixels() const { return Row(0); }
     std::uint32_t *Row(int y) {
-        return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
+        Settle();
+        return memory.Row(y);
     }
     std::uint32_t const *Row(int y) const {
-        return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
+        Settle();
+        return memory.Row(y);
     }
+
+    // Whether Scroll may be used: whoever shows the pixels then should look at them by RowOf.
+    bool Scrolls() const { return scrolls; }
+    void AllowScrolling(bool allow) { scrolls = allow; }
+    // Moves what the box shows by less than half its height, down if the distance is positive. The rows that
+    // nothing moves into keep their pixels. The pixels stay where they are until one of the other operations
+    // asks for them.
+    void Scroll(DeviceRect const &box, int distance) { ring.Turn(memory, box, distance); }
+    // The row, of which only the columns of the part may be looked at. After PrepareRows of the same part;
+    // what has scrolled need not be moved for it.
+    std::uint32_t const *RowOf(DeviceRect const &part, int y) const {
+        return memory.Row(part.Intersected(ring.Box()).Empty() ? y : ring.Place(y));
+    }
+    void PrepareRows(DeviceRect const &part) const {
+        if (!ring.HasWholeRows(part))
+            Settle();
+    }
+    // The same pixels, to draw on the part alone: without what has scrolled being moved. Null where this
+    // surface does as well. Must not be used any more when this one's pixels have been asked for.
+    std::unique_ptr<Surface> PartOf(DeviceRect const &part);
 
     // The rectangle must lie within.
     void Fill(DeviceRect const &, std::uint32_t pixel);
 
-    pixman_image_t *PixmanImage() const { return image; }
+    pixman_image_t *PixmanImage() const {
+        Settle();
+        return image;
+    }
     // Made at the first call: a window without text or curves needs none.
     cairo_surface_t *CairoSurface();
 
@@ -51,8 +77,17 @@ public:
     static std::unique_ptr<Surface> ReadPng(std::string const &path, std::string &error);
 
 private:
+    Surface(Surface const &, std::uint32_t *pixels); // somebody else's
+    void Settle() const {
+        if (ring.IsTurned())
+            ring.Settle(memory);
+    }
+
     int width, height;
     std::vector<std::uint32_t> pixels;
+    RowRing::Memory memory;
+    mutable RowRing ring; // where a row stands is nobody's business
+    bool scrolls = false;
     pixman_image_t *image;
     cairo_surface_t *cairo;
 };

@@ -55,8 +55,8 @@ void CompoundPane::CompoundRep::Remove(GlogPane *pane) {
     ForgetReaches();
 }
 
-bool CompoundPane::CompoundRep::Has(GlogPane *pane, unsigned long changesThen) const {
-    return changes == changesThen || std::find(list->begin(), list->end(), pane) != list->end();
+bool CompoundPane::CompoundRep::IsAmong(GlogPane *pane) const {
+    return std::find(list->begin(), list->end(), pane) != list->end();
 }
 
 // Asking for a place may settle the layout and so move what was asked before.

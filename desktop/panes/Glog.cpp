@@ -325,6 +325,17 @@ void Glog::Update() {
 
 bool Glog::NeedsUpdate() const { return shown && (layoutInvalid || !Region::IsEmpty(port.GetDamage())); }
 
+DeviceRect Glog::DeviceBounds(OSRgn const &region) const {
+    Rect const bounds = Region::Bounds(region);
+    return scale.ToDevice(bounds.left, bounds.top, bounds.right, bounds.bottom);
+}
+
+// The surface itself again, after an update of a part, or when it is needed in the middle of one.
+void Glog::DrawOnSurface() {
+    if (surface && port.GetSurface() != surface.get())
+        port.ExchangeSurface(*surface);
+}
+
 void Glog::DrawDamage(OSRgn const &region) {
     // The region is the glog's for the time of the update. When a pane throws, what it left undrawn stays
     // damaged.
@@ -335,17 +346,22 @@ void Glog::DrawDamage(OSRgn const &region) {
         }
         ~Updating() {
             glog.port.FinishGround();
+            glog.DrawOnSurface();
             if (!done)
                 glog.port.DamageWindow(*glog.updateRegion);
             glog.updateRegion = nullptr;
         }
         Glog &glog;
         bool done = false;
+        std::unique_ptr<Surface> part; // null when the surface itself is drawn on
     };
     PortKeeper const keeper(port);
     Updating updating(*this, region);
+    updating.part = surface->PartOf(DeviceBounds(region));
     port.SetOrigin(0, 0);
     port.SetBoundary(region);
+    if (updating.part)
+        port.ExchangeSurface(*updating.part);
     port.LayGround(ToRGBA(GetContentColor()));
     OSRgn local(region);
     ForEachItem([&](GlogPane &pane) { PaneAccess::Draw(pane, &local); });
@@ -363,10 +379,12 @@ void Glog::MoveShown(bool outlineChanged) {
 
 void Glog::Present(std::vector<DeviceRect> const &rects) {
     port.FinishGround(); // for whoever has the window shown while it is being drawn
+    DrawOnSurface();
     std::vector<PixelOverlay> const menus = MenuTracker::DrawnOver(*this);
     WithOutline const outlined(*surface, scale, outline);
     WithOverlays const covered(*surface, menus);
     window->Present(*surface, rects.data(), rects.size());
+    surface->AllowScrolling(window->CanMove());
 }
 
 void Glog::PresentAll() {

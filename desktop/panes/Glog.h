@@ -104,6 +104,8 @@ private:
     // meanwhile.
     template <class Operation> void ForEachItem(Operation);
     void DrawDamage(OSRgn const &);
+    DeviceRect DeviceBounds(OSRgn const &) const;
+    void DrawOnSurface();
     void Present(std::vector<DeviceRect> const &);
     void MoveShown(bool outlineChanged);
     void MakeSurface();

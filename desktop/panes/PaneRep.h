@@ -42,15 +42,20 @@ struct CompoundPane::CompoundRep {
     void ForEachOf(CompoundPane &container, Panes const &some, Operation operation) const {
         PaneWatch const watch(&container);
         unsigned long const before = changes;
-        for (GlogPane *pane : some) {
-            if (Has(pane, before))
-                operation(*pane);
+        for (std::size_t i = 0; i < some.size(); ++i) {
+            // Of thousands of panes most are in slow memory; to wait for each would be most of the work.
+            if (i + kPanesAhead < some.size())
+                __builtin_prefetch(some[i + kPanesAhead]);
+            if (Has(some[i], before))
+                operation(*some[i]);
             if (!watch.PaneExists())
                 return;
         }
     }
     // Whether a subpane of then is still one. Looking it up takes longer than most operations.
-    bool Has(GlogPane *, unsigned long changesThen) const;
+    bool Has(GlogPane *pane, unsigned long changesThen) const {
+        return changes == changesThen || IsAmong(pane);
+    }
 
     // The subpanes that are shown and draw somewhere in the rectangle. Whoever scrolls through thousands asks
     // none of those that are out of sight.
@@ -65,6 +70,9 @@ struct CompoundPane::CompoundRep {
     bool hasFrame = false;
 
 private:
+    static std::size_t const kPanesAhead = 8;
+
+    bool IsAmong(GlogPane *) const;
     Panes &OwnList();
     void LearnReaches();
 

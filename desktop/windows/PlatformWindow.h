@@ -39,6 +39,8 @@ public:
     // Copies the rectangles of the surface to the screen. They may reach beyond the surface; what does is not
     // copied. The screen may change only after the call has returned, but the surface is not read any more.
     virtual void Present(Surface const &, DeviceRect const *, std::size_t count) = 0;
+    // Whether Move may do what it is asked for.
+    virtual bool CanMove() const { return false; }
     // Moves what the screen shows as the pixels of the surface that was presented have been moved. False
     // where that cannot be done: then the box is to be presented.
     virtual bool Move(PixelMove const &) { return false; }

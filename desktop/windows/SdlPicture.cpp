@@ -30,14 +30,16 @@ struct SdlPicture::Shared {
     std::unique_ptr<ShownPixels> pixels;
     bool lost = true;                // the window does not show all that was taken
     std::vector<DeviceRect> changed; // of one call; kept for its memory
-    unsigned long shown = 0;         // number of the last request to the server that shows pixels
+    unsigned long read = 0;          // number of the last request for which the server reads our memory
 
     ~Shared();
     bool FindWindow(SDL_Window *);
     bool MakeImage(int width, int height);
     bool MakeMemory();
     bool Attach();
-    void Put(DeviceRect const &);  // the server reads our memory when it gets to it
+    void Put(DeviceRect const &); // the server reads our memory when it gets to it
+    bool IsBeingRead() const;
+    void AwaitReading();
     void Send(DeviceRect const &); // the pixels go along
 };
 
@@ -152,6 +154,14 @@ static bool IsBehind(Display *display, unsigned long request) {
 void SdlPicture::Shared::Put(DeviceRect const &rect) {
     XShmPutImage(display, window, context, image, rect.left, rect.top, rect.left, rect.top,
                  static_cast<unsigned int>(rect.Width()), static_cast<unsigned int>(rect.Height()), False);
+    read = NextRequest(display) - 1;
+}
+
+bool SdlPicture::Shared::IsBeingRead() const { return IsBehind(display, read); }
+
+void SdlPicture::Shared::AwaitReading() {
+    if (IsBeingRead())
+        XSync(display, False);
 }
 
 void SdlPicture::Shared::Send(DeviceRect const &rect) {
@@ -190,10 +200,9 @@ void SdlPicture::Show(Surface const &surface, DeviceRect const *rects, std::size
         XFlush(display);
         return;
     }
-    bool const behind = IsBehind(display, shared->shown);
+    bool const behind = shared->IsBeingRead();
     for (DeviceRect const &rect : shared->changed)
         shared->Put(rect);
-    shared->shown = NextRequest(display) - 1;
     if (behind)
         XSync(display, False);
     else
@@ -202,7 +211,6 @@ void SdlPicture::Show(Surface const &surface, DeviceRect const *rects, std::size
 
 void SdlPicture::ShowAll() {
     shared->Put({0, 0, Width(), Height()});
-    shared->shown = NextRequest(shared->display) - 1;
     XFlush(shared->display);
 }
 
@@ -214,7 +222,7 @@ bool SdlPicture::Move(PixelMove const &move) {
         SdlScreen::WatchMoves(shared->of);
         shared->watched = true;
     }
-    Finish();
+    shared->AwaitReading();
     DeviceRect const from = move.From(), &to = move.to;
     XCopyArea(shared->display, shared->window, shared->window, shared->context, from.left, from.top,
               static_cast<unsigned int>(to.Width()), static_cast<unsigned int>(to.Height()), to.left, to.top);
@@ -228,6 +236,6 @@ void SdlPicture::Forget() {
 }
 
 void SdlPicture::Finish() {
-    if (IsBehind(shared->display, shared->shown))
+    if (IsBehind(shared->display, NextRequest(shared->display) - 1))
         XSync(shared->display, False);
 }

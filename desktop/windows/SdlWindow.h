@@ -55,6 +55,7 @@ public:
     double Scale() const override { return scale.Factor(); }
     void Present(Surface const &, DeviceRect const *, std::size_t count) override;
     bool Move(PixelMove const &) override;
+    bool CanMove() const override { return picture != nullptr; }
     void Finish() override;
     void StartTextInput(Rect const &caret) override;
     void StopTextInput() override;

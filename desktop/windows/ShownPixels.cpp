@@ -49,7 +49,7 @@ void ShownPixels::TakeTiles(Surface const &surface, DeviceRect const &area, Devi
     }
     DeviceRect const band = parts.front().place;
     for (int y = band.top; y < band.bottom; ++y) {
-        std::uint32_t const *const from = surface.Row(y);
+        std::uint32_t const *const from = surface.RowOf(area, y);
         std::uint32_t *const to = memory + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
         for (Part const &part : parts)
             TakeRow(from, to, part, y);
@@ -107,6 +107,7 @@ void ShownPixels::Collect(DeviceRect const &range, std::vector<DeviceRect> &chan
 void ShownPixels::Take(Surface const &surface, DeviceRect const &area, std::vector<DeviceRect> &changed) {
     if (area.Empty())
         return;
+    surface.PrepareRows(area);
     DeviceRect const range = TilesOf(area);
     for (int row = range.top; row < range.bottom; ++row)
         TakeTiles(surface, area, range, row);
