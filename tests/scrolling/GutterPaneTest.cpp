@@ -51,6 +51,12 @@ TEST_F(GutterPaneTest, KnowsItsTypeAndItsContainersSize) {
     EXPECT_EQ(gutter->GetContainerWidth(), 200);
 }
 
+TEST_F(GutterPaneTest, IsAttachedUnderNumberZero) {
+    Gutter *const gutter = new Gutter(glog, GutterPane::kBottomGutter);
+    EXPECT_EQ(gutter->GetGlog(), glog);
+    EXPECT_EQ(gutter->GetID(), 0);
+}
+
 TEST_F(GutterPaneTest, WithoutAContainerTheContainersSizeIsZero) {
     Gutter *const gutter = new Gutter(glog, GutterPane::kBottomGutter);
     EXPECT_EQ(gutter->GetContainerHeight(), 0);

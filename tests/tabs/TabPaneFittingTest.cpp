@@ -426,6 +426,10 @@ TEST_F(TabPaneFittingTest, WhereThePaneWasAndWhereItIsAreRepainted) {
     std::vector<Rect> const repainted = Repainted();
     ASSERT_EQ(repainted.size(), 1u);
     EXPECT_EQ(repainted[0], (Rect{20, 10, 37, 310}));
+    Rect const narrow = BoxOf(*pane);
+    pane->FitIntoRect(Target(300));
+    ASSERT_GT(BoxOf(*pane).right, narrow.right);
+    EXPECT_EQ(Repainted(), std::vector<Rect>{BoxOf(*pane)}) << "where it is now";
 }
 
 TEST_F(TabPaneFittingTest, ManyTabsFitAnyWidth) {
