@@ -19,6 +19,7 @@ OURS = "glog"
 OURS_IN_PANES = "panes"  # a pane for each check box: shown below the others, and without a goal
 PEERS = ("qt", "fltk", "gtk")
 FEW_BOXES, MANY_BOXES = 400, 1600
+NOTIFY_WAYS = ("qt", "gtk", "boost", "sigc", "fltk", "virtual")  # to tell listeners, beside ours
 LONGEST_RUN_SECONDS = 120
 
 # Goals are for our value over a peer's.
@@ -46,6 +47,11 @@ ROWS = (
     Row("first build and frame", "first-frame", "us", 1e3),
 )
 
+NOTIFY_LISTENERS = (1, 10, 1000)
+# A message has to be ahead of these. A callback of FLTK and a bare virtual call are only shown: they keep no list, or
+# none that may change meanwhile.
+NOTIFY_AHEAD = ("qt", "gtk", "boost", "sigc")
+
 
 def measure(program, *arguments):
     """What one run of the program prints: values by name, in the order of their printing."""
@@ -69,6 +75,29 @@ def run_round(directory, peer, server, values):
     resident = {boxes: measure(program, "memory", boxes)[f"resident-{boxes}"][0] for boxes in (FEW_BOXES, MANY_BOXES)}
     growth = (resident[MANY_BOXES] - resident[FEW_BOXES]) / (MANY_BOXES - FEW_BOXES)
     values.setdefault((peer, "memory"), []).append(growth)
+
+
+def run_notify_round(directory, values):
+    for way in (OURS,) + NOTIFY_WAYS:
+        for name, measured in measure(os.path.join(directory, f"notify_{way}")).items():
+            values.setdefault((way, name), []).append(statistics.median(measured))
+
+
+def print_notifications(medians):
+    """Prints what a message costs by the number of listeners; how many goals are missed."""
+    missed = 0
+    print("message to listeners, ns".ljust(31) + "".join(f"{way:>11}" for way in (OURS,) + NOTIFY_WAYS))
+    for listeners in NOTIFY_LISTENERS:
+        ours = medians[OURS, f"notify-{listeners}"]
+        figures, ratios = f"{ours / 1e3:11.1f}", " " * 11
+        for way in NOTIFY_WAYS:
+            theirs = medians.get((way, f"notify-{listeners}"))
+            figures += f"{theirs / 1e3:11.1f}" if theirs else f"{'-':>11}"
+            over = theirs and way in NOTIFY_AHEAD and ours > theirs
+            missed += bool(over)
+            ratios += f"{ours / theirs:6.2f}{' over' if over else '':5}" if theirs else f"{'-':>11}"
+        print(f"{listeners:<31,}{figures}\n{'  ours / theirs':31}{ratios}".rstrip())
+    return missed
 
 
 def print_heading(ours):
@@ -116,6 +145,8 @@ def conditions(rounds):
                 "Cairo": output_of("pkg-config", "--modversion", "cairo"),
                 "Pango": output_of("pkg-config", "--modversion", "pango"),
                 "g++": output_of("g++", "-dumpfullversion"),
+                "libsigc++": output_of("pkg-config", "--modversion", "sigc++-3.0"),
+                "Boost": output_of("dpkg-query", "-W", "-f", "${Version}", "libboost-dev"),
                 "X server": output_of("dpkg-query", "-W", "-f", "${Version}", "xvfb")}
     named = ", ".join(f"{name} {version.strip() or '?'}" for name, version in versions.items())
     return [f"- {os.cpu_count()} processors: {processor}", f"- {system}", f"- {named}",
@@ -144,12 +175,15 @@ def main():
     for _ in range(options.rounds):
         for peer in (OURS, OURS_IN_PANES) + PEERS:
             run_round(options.directory, peer, options.server, values)
+        run_notify_round(options.directory, values)
     medians = {key: statistics.median(measured) for key, measured in values.items()}
 
     table = io.StringIO()
     with contextlib.redirect_stdout(table):
         print_heading(OURS)
         missed = sum(print_row(row, medians) for row in ROWS)
+        print()
+        missed += print_notifications(medians)
         print()
         print_heading(OURS_IN_PANES)
         for row in ROWS:
