@@ -327,8 +327,11 @@ void Meddler::Move(Chance &chance) {
     CompoundPane *const into = chance.OfMany(containers);
     if (LiesIn(into, pane))
         return;
+    PaneWatch const watch(into);
     pane->Inval();
     into->Add(pane, static_cast<short>(chance.Between(-1, into->NumSubpanes())));
+    if (watch.PaneExists())
+        into->Inval(); // a pane of a negative height lets a grid move the rest backward
 }
 
 void Meddler::Add(Chance &chance) {
