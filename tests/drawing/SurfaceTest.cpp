@@ -124,6 +124,19 @@ TEST(Surface, CairoAndPixmanSeeTheSamePixels) {
     EXPECT_EQ(canvas.Count(Canvas::kBlack), 48);
 }
 
+TEST(Surface, FillsRectanglesOfEveryWidthAndNothingBesideThem) {
+    for (int width = 0; width < 40; ++width) {
+        Surface surface(44, 5);
+        surface.Fill({2, 1, 2 + width, 4}, 0xFF123456u);
+        for (int y = 0; y < 5; ++y)
+            for (int x = 0; x < 44; ++x) {
+                bool const filled = x >= 2 && x < 2 + width && y >= 1 && y < 4;
+                ASSERT_EQ(surface.Row(y)[x], filled ? 0xFF123456u : 0xFF000000u)
+                    << width << ": " << x << ' ' << y;
+            }
+    }
+}
+
 TEST(Surface, KnowsTheOpaquePartThatHasNothingRoundIt) {
     Surface surface(6, 4);
     EXPECT_EQ(surface.OpaquePart().Width(), 6) << "a new one is opaque";
