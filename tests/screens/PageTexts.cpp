@@ -119,6 +119,7 @@ private:
         Rect const shown = Common(text.box, text.clip);
         if (IsEmpty(Middle(shown)))
             return;
+        Port().FinishGround(); // which waits for somebody to draw on it
         text.contrast = WorstContrast(text.color, Middle(shown));
         texts.push_back(text);
     }
