@@ -5,8 +5,7 @@
 #include <memory>
 #include <vector>
 
-typedef struct _cairo_scaled_font
-    cairo_scaled_font_t; // NOLINT(bugprone-reserved-identifier): Cairo's own name
+typedef struct _cairo_scaled_font cairo_scaled_font_t; // NOLINT(bugprone-reserved-identifier)
 typedef struct pixman_glyph_cache_t pixman_glyph_cache_t;
 
 // Cairo asks a hundred questions before it draws a text: what its operator does beyond the ink, whether the
