@@ -50,9 +50,16 @@ void FillRow(std::uint32_t *row, int width, std::uint32_t pixel) {
                  static_cast<std::size_t>(width));
 }
 
-void FillNarrowRow(std::uint32_t *row, int width, std::uint32_t pixel) {
-    for (int i = 0; i < width; ++i)
-        row[i] = pixel;
+// Each row by two blocks of as many pixels, which may overlap.
+template <int kBlock>
+void FillByBlocks(std::uint32_t *row, int stride, DeviceRect const &r, std::uint32_t pixel) {
+    std::array<std::uint32_t, kBlock> block;
+    block.fill(pixel);
+    int const second = r.Width() - kBlock;
+    for (int y = r.top; y < r.bottom; ++y, row += stride) {
+        std::memcpy(row, block.data(), sizeof block);
+        std::memcpy(row + second, block.data(), sizeof block);
+    }
 }
 
 struct CairoSurfaceFree {
@@ -139,13 +146,19 @@ cairo_surface_t *Surface::CairoSurface() {
 }
 
 void Surface::Fill(DeviceRect const &r, std::uint32_t pixel) {
-    int const across = r.Width();
+    int const kBlock = kNarrow / 2;
     std::uint32_t *row = Row(r.top) + r.left;
-    for (int y = r.top; y < r.bottom; ++y, row += width)
-        if (across <= kNarrow)
-            FillNarrowRow(row, across, pixel);
-        else
-            FillRow(row, across, pixel);
+    if (r.Width() > kNarrow)
+        for (int y = r.top; y < r.bottom; ++y, row += width)
+            FillRow(row, r.Width(), pixel);
+    else if (r.Width() >= kBlock)
+        FillByBlocks<kBlock>(row, width, r, pixel);
+    else if (r.Width() >= kBlock / 2)
+        FillByBlocks<kBlock / 2>(row, width, r, pixel);
+    else
+        for (int y = r.top; y < r.bottom; ++y, row += width)
+            for (int i = 0; i < r.Width(); ++i)
+                row[i] = pixel;
 }
 
 bool Surface::IsOpaque() const {

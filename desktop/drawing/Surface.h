@@ -34,21 +34,31 @@ public:
         return memory.Row(y);
     }
 
-    // Whether Scroll may be used: whoever shows the pixels then should look at them by RowOf.
+    // Whether Scroll may be used: whoever shows the pixels then should look at them by RowsOf.
     bool Scrolls() const { return scrolls; }
     void AllowScrolling(bool allow) { scrolls = allow; }
     // Moves what the box shows by less than half its height, down if the distance is positive. The rows that
     // nothing moves into keep their pixels. The pixels stay where they are until one of the other operations
     // asks for them.
     void Scroll(DeviceRect const &box, int distance) { ring.Turn(memory, box, distance); }
-    // The row, of which only the columns of the part may be looked at. After PrepareRows of the same part;
-    // what has scrolled need not be moved for it.
-    std::uint32_t const *RowOf(DeviceRect const &part, int y) const {
-        return memory.Row(part.Intersected(ring.Box()).Empty() ? y : ring.Place(y));
-    }
-    void PrepareRows(DeviceRect const &part) const {
+    // The rows of a part, of which only the part's columns may be looked at: without what has scrolled being
+    // moved. Until somebody changes the pixels.
+    class Rows {
+    public:
+        std::uint32_t const *operator[](int y) const { return memory.Row(ring ? ring->Place(y) : y); }
+
+    private:
+        friend class Surface;
+        Rows(RowRing::Memory const &memory_, RowRing const *ring_)
+            : memory(memory_)
+            , ring(ring_) {}
+        RowRing::Memory memory;
+        RowRing const *ring; // null where rows stand as they are shown
+    };
+    Rows RowsOf(DeviceRect const &part) const {
         if (!ring.HasWholeRows(part))
             Settle();
+        return Rows(memory, ring.IsTurned() && !part.Intersected(ring.Box()).Empty() ? &ring : nullptr);
     }
     // The same pixels, to draw on the part alone: without what has scrolled being moved. Null where this
     // surface does as well. Must not be used any more when this one's pixels have been asked for.

@@ -38,7 +38,7 @@ static DeviceRect TilesOf(DeviceRect const &area) {
 // Row by row through all tiles beside each other, in the order of the memory: the processor then fetches what
 // comes next by itself. What is unknown of a tile stays so until all of it is taken: a tile may lie half in a
 // view that scrolls, and half in a bar beside it that stays as it is.
-void ShownPixels::TakeTiles(Surface const &surface, DeviceRect const &area, DeviceRect const &range,
+void ShownPixels::TakeTiles(Surface::Rows const &rows, DeviceRect const &area, DeviceRect const &range,
                             int row) {
     parts.clear();
     for (int column = range.left; column < range.right; ++column) {
@@ -49,7 +49,7 @@ void ShownPixels::TakeTiles(Surface const &surface, DeviceRect const &area, Devi
     }
     DeviceRect const band = parts.front().place;
     for (int y = band.top; y < band.bottom; ++y) {
-        std::uint32_t const *const from = surface.RowOf(area, y);
+        std::uint32_t const *const from = rows[y];
         std::uint32_t *const to = memory + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
         for (Part const &part : parts)
             TakeRow(from, to, part, y);
@@ -107,10 +107,10 @@ void ShownPixels::Collect(DeviceRect const &range, std::vector<DeviceRect> &chan
 void ShownPixels::Take(Surface const &surface, DeviceRect const &area, std::vector<DeviceRect> &changed) {
     if (area.Empty())
         return;
-    surface.PrepareRows(area);
+    Surface::Rows const rows = surface.RowsOf(area);
     DeviceRect const range = TilesOf(area);
     for (int row = range.top; row < range.bottom; ++row)
-        TakeTiles(surface, area, range, row);
+        TakeTiles(rows, area, range, row);
     std::size_t const first = changed.size();
     Collect(range, changed);
     for (std::size_t i = first; i < changed.size(); ++i)

@@ -1,10 +1,9 @@
 // What of a window's pixels has to be shown anew.
 #pragma once
 #include "desktop/drawing/DeviceScale.h"
+#include "desktop/drawing/Surface.h"
 #include <cstdint>
 #include <vector>
-
-class Surface;
 
 // A copy of the pixels that a window shows, in memory that whoever shows them reads as well. That memory is
 // far away for two processors at once: to compare with it is cheap, to write to it and to have it read is
@@ -34,7 +33,7 @@ private:
     int TilesAcross() const;
     Tile &At(int column, int row);
     DeviceRect Place(int column, int row) const;
-    void TakeTiles(Surface const &, DeviceRect const &area, DeviceRect const &range, int row);
+    void TakeTiles(Surface::Rows const &, DeviceRect const &area, DeviceRect const &range, int row);
     struct Part { // of a tile, to be taken
         Tile *tile;
         DeviceRect place;

@@ -55,20 +55,20 @@ TEST_F(ScrolledSurface, CanBeLookedAtInPartsBeforeItIsPutInOrder) {
     Scroll(box, -4);
     DeviceRect const inside = {3, 4, 8, 16}, beside = {9, 0, kWidth, kHeight};
     for (DeviceRect const &part : {inside, beside}) {
-        ring.PrepareRows(part);
+        Surface::Rows const rows = ring.RowsOf(part);
         for (int y = part.top; y < part.bottom; ++y)
             for (int x = part.left; x < part.right; ++x)
-                ASSERT_EQ(ring.RowOf(part, y)[x], plain.Row(y)[x]) << x << ' ' << y;
+                ASSERT_EQ(rows[y][x], plain.Row(y)[x]) << x << ' ' << y;
     }
 }
 
 TEST_F(ScrolledSurface, IsPutInOrderForAPartThatLiesHalfInWhatScrolled) {
     Scroll(box, -5);
     DeviceRect const part = {0, 0, 5, kHeight};
-    ring.PrepareRows(part);
+    Surface::Rows const rows = ring.RowsOf(part);
     for (int y = 0; y < kHeight; ++y)
         for (int x = 0; x < 5; ++x)
-            ASSERT_EQ(ring.RowOf(part, y)[x], plain.Row(y)[x]) << x << ' ' << y;
+            ASSERT_EQ(rows[y][x], plain.Row(y)[x]) << x << ' ' << y;
 }
 
 TEST_F(ScrolledSurface, NeedsNoPartToDrawOnWhileNothingHasScrolled) { EXPECT_EQ(ring.PartOf(box), nullptr); }
@@ -124,8 +124,7 @@ TEST_F(ScrolledSurface, IsTheSameWhateverIsDoneWithIt) {
         else
             ring.Fill(part, pixel);
         plain.Fill(part, pixel);
-        ring.PrepareRows(part);
-        ASSERT_EQ(ring.RowOf(part, part.top)[part.left], pixel);
+        ASSERT_EQ(ring.RowsOf(part)[part.top][part.left], pixel);
         if (below(50) == 0) {
             ASSERT_EQ(PixelsOf(ring), PixelsOf(plain)) << i;
         }
