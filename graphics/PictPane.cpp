@@ -38,6 +38,7 @@ PictPane::PictPane(glogRec *owner, short id, gpicResRec *record)
         return;
     if (record->pictureID > kNoPicture)
         SetPngImageNoUpdate(record->pictureID);
+    std::unique_ptr<tarn::image> owned(image); // until the destructor will run: memory may run out before
     useImageSize = record->useImageSize != 0;
     Rect box = record->bounds;
     if (useImageSize && image) {
@@ -46,6 +47,7 @@ PictPane::PictPane(glogRec *owner, short id, gpicResRec *record)
         SetNaturalSize(*this, Width(frame), Height(frame));
     }
     GlogPane::SetBox(&box); // whatever a subclass makes of a change
+    owned.release();
 }
 
 PictPane *PictPane::NewPictPane(glogRec *owner, GlogStyleSheet *sheet) {
