@@ -330,8 +330,10 @@ DeviceRect Glog::DeviceBounds(OSRgn const &region) const {
     return scale.ToDevice(bounds.left, bounds.top, bounds.right, bounds.bottom);
 }
 
-// The surface itself again, after an update of a part, or when it is needed in the middle of one.
-void Glog::DrawOnSurface() {
+// All that was drawn is in the surface itself, and what comes next goes there: after an update, or for
+// whoever looks at the pixels in the middle of one.
+void Glog::CompleteSurface() {
+    port.FinishGround();
     if (surface && port.GetSurface() != surface.get())
         port.ExchangeSurface(*surface);
 }
@@ -345,8 +347,7 @@ void Glog::DrawDamage(OSRgn const &region) {
             glog.updateRegion = &region_;
         }
         ~Updating() {
-            glog.port.FinishGround();
-            glog.DrawOnSurface();
+            glog.CompleteSurface();
             if (!done)
                 glog.port.DamageWindow(*glog.updateRegion);
             glog.updateRegion = nullptr;
@@ -378,8 +379,7 @@ void Glog::MoveShown(bool outlineChanged) {
 }
 
 void Glog::Present(std::vector<DeviceRect> const &rects) {
-    port.FinishGround(); // for whoever has the window shown while it is being drawn
-    DrawOnSurface();
+    CompleteSurface();
     std::vector<PixelOverlay> const menus = MenuTracker::DrawnOver(*this);
     WithOutline const outlined(*surface, scale, outline);
     WithOverlays const covered(*surface, menus);
@@ -409,6 +409,7 @@ bool Glog::WritePng(std::string const &path, std::string &error) {
         return false;
     }
     Update();
+    CompleteSurface();
     WithOutline const outlined(*surface, scale, outline);
     WithOverlays const menus(*surface, MenuTracker::OpenOver(*this));
     return surface->WritePng(path, error);

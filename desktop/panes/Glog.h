@@ -105,7 +105,7 @@ private:
     template <class Operation> void ForEachItem(Operation);
     void DrawDamage(OSRgn const &);
     DeviceRect DeviceBounds(OSRgn const &) const;
-    void DrawOnSurface();
+    void CompleteSurface();
     void Present(std::vector<DeviceRect> const &);
     void MoveShown(bool outlineChanged);
     void MakeSurface();
