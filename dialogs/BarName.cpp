@@ -14,9 +14,12 @@ BarName::BarName(GlogStyleSheet *sheet, char const *key_)
 ScrollBarPane *BarName::FindFor(GlogPane &scrolled) const {
     if (number == 0)
         return nullptr;
-    ScrollBarPane *const bar = dynamic_cast<ScrollBarPane *>(Nearest(scrolled));
+    GlogPane *const named = Nearest(scrolled);
+    if (!named)
+        throw KeyFault(key, "there is no item " + std::to_string(number), &scrolled);
+    ScrollBarPane *const bar = dynamic_cast<ScrollBarPane *>(named);
     if (!bar)
-        throw KeyFault(key, "there is no scroll bar of the number " + std::to_string(number));
+        throw KeyFault(key, "item " + std::to_string(number) + " is no scroll bar", &scrolled);
     return bar;
 }
 

@@ -5,11 +5,13 @@
 #include "desktop/observe/TreeDump.h"
 #include "dialogs/IconFamilyKey.h"
 #include "dialogs/ItemRegistry.h"
+#include "dialogs/KeyFault.h"
 #include "dialogs/PressReporter.h"
 #include "dialogs/RecordBytes.h"
 #include "dialogs/StockItems.h"
 #include "frame/ResourceReading.h"
 #include "host/GlogStyleSheet.h"
+#include <string>
 
 namespace {
 
@@ -43,11 +45,22 @@ void SetModeFrom(GlogStyleSheet *sheet, GlogButtonPane *button) {
     gcSetModeBP(button, NumberUnder(sheet, "Mode"));
 }
 
+// A number that no label has would leave the button without one.
+void RequireLabel(GlogButtonPane *button, GlogStyleSheet *sheet, char const *key) {
+    UString label;
+    button->GetButtonText(label);
+    if (label.empty() && NumberUnder(sheet, key) != 0)
+        throw KeyFault(key, "there is no label of the number " + std::to_string(NumberUnder(sheet, key)));
+}
+
 GlogPane *MakeOval(glogRec *glog, GlogStyleSheet *sheet) {
     UString const text = TextUnder(sheet, "ButtonText");
     OvalButtonPane *const button = OvalButtonPane::NewOvalButtonPane(glog, sheet);
-    if (button && !text.empty())
+    if (!button)
+        return nullptr;
+    if (!text.empty())
         button->SetButtonText(text);
+    RequireLabel(button, sheet, "TextNum");
     return button;
 }
 
@@ -58,6 +71,7 @@ GlogPane *MakeStud(glogRec *glog, GlogStyleSheet *sheet) {
         return nullptr;
     if (!text.empty())
         button->SetLabel(text);
+    RequireLabel(button, sheet, "TextID");
     SetModeFrom(sheet, button);
     return button;
 }

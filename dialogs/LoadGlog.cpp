@@ -39,9 +39,8 @@ public:
     GrowingGlog &operator=(GrowingGlog const &) = delete;
 
     glogRec *Get() const { return glog; }
-    glogRec *Finish(std::string const &name) {
-        PaneMaker::Guard([&](std::string const &) { return WholeFile(name); },
-                         [&] { desktop.FinishGlog(glog); });
+    glogRec *Finish(PaneMaker::PlaceOfKey const &placeOf) {
+        PaneMaker::Guard(placeOf, [&] { desktop.FinishGlog(glog); });
         glogRec *const finished = glog;
         glog = nullptr;
         return finished;
@@ -51,6 +50,13 @@ private:
     Desktop &desktop;
     glogRec *glog;
 };
+
+// For what goes wrong once all panes stand.
+PaneMaker::PlaceOfKey PlacesIn(PaneMaker const &maker, std::string const &file) {
+    return [&maker, file](std::string const &key, GlogPane const *pane) {
+        return maker.PlaceOf(pane, key, WholeFile(file));
+    };
+}
 
 glogRec *MakeGlog(Dialog const &dialog) {
     GrowingGlog growing(OpenDesktop(), dialog.options);
@@ -62,7 +68,7 @@ glogRec *MakeGlog(Dialog const &dialog) {
         growing.Get()->SetMinSize(dialog.minWidth, dialog.minHeight);
     if (dialog.maxWidth || dialog.maxHeight)
         growing.Get()->SetMaxSize(dialog.maxWidth, dialog.maxHeight);
-    return growing.Finish(dialog.file);
+    return growing.Finish(PlacesIn(maker, dialog.file));
 }
 
 bool BeginsWithMagic(std::string const &path) {
@@ -104,7 +110,7 @@ glogRec *LoadGlogFromRecords(void const *bytes, std::size_t size, GlogOptions co
     RecordFile const records(bytes, size, name);
     GrowingGlog growing(desktop, GlogOptions(options).Size(records.Width(), records.Height()));
     records.MakePanes(growing.Get());
-    return growing.Finish(name);
+    return growing.Finish([&](std::string const &, GlogPane const *) { return WholeFile(name); });
 }
 
 glogRec *ReloadGlog(glogRec *shown, std::string const &path) {
@@ -131,7 +137,7 @@ void LoadItems(std::string const &path, CompoundPane *into) {
         panes.push_back(maker.Make(item));
     for (GlogPane *pane : panes)
         into->Add(pane, kOnTop);
-    PaneMaker::Guard([&](std::string const &) { return WholeFile(path); }, [&] { desktop.FinishGlog(glog); });
+    PaneMaker::Guard(PlacesIn(maker, path), [&] { desktop.FinishGlog(glog); });
 }
 
 GlogOptions ReadGlogOptions(std::string const &path) {

@@ -46,5 +46,10 @@ std::string NearestName::Of(std::string const &name, std::vector<std::string> co
 
 std::string NearestName::Hint(std::string const &name, std::vector<std::string> const &candidates) {
     std::string const nearest = Of(name, candidates);
-    return nearest.empty() ? nearest : "; did you mean " + nearest + "?";
+    if (!nearest.empty())
+        return "; did you mean " + nearest + "?";
+    std::string all;
+    for (std::string const &candidate : candidates)
+        all += (all.empty() ? "; possible: " : ", ") + candidate;
+    return all;
 }

@@ -21,23 +21,31 @@ void PaneMaker::Guard(PlaceOfKey const &placeOf, std::function<void()> const &ma
     } catch (LoadError const &) {
         throw;
     } catch (KeyFault const &fault) {
-        throw LoadError(placeOf(fault.Key()), fault.what());
+        throw LoadError(placeOf(fault.Key(), fault.Pane()), fault.what());
     } catch (TarnError const &) {
-        throw LoadError(placeOf(""), "a part that the pane needs is missing, or memory has run out");
+        throw LoadError(placeOf("", nullptr), "a part that the pane needs is missing, or memory has run out");
     } catch (std::bad_alloc const &) {
-        throw LoadError(placeOf(""), "memory has run out");
+        throw LoadError(placeOf("", nullptr), "memory has run out");
     } catch (std::exception const &error) {
-        throw LoadError(placeOf(""), error.what());
+        throw LoadError(placeOf("", nullptr), error.what());
     }
+}
+
+LoadError::Place PaneMaker::PlaceOf(GlogPane const *pane, std::string const &key,
+                                    LoadError::Place const &other) const {
+    auto const found = made.find(pane);
+    return found == made.end() ? other : found->second->PlaceOf(key);
 }
 
 GlogPane *PaneMaker::Make(DialogItem const &item) {
     GrowingPanes growing(glog);
     GlogPane *pane = nullptr;
-    Guard([&](std::string const &key) { return item.PlaceOf(key); }, [&] { pane = MakeAlone(item); });
+    Guard([&](std::string const &key, GlogPane const *) { return item.PlaceOf(key); },
+          [&] { made[pane = MakeAlone(item)] = &item; });
     MakeInside(pane, item);
     if (item.type->reporter)
-        Guard([&](std::string const &) { return item.place; }, [&] { item.type->reporter(pane); });
+        Guard([&](std::string const &, GlogPane const *) { return item.place; },
+              [&] { item.type->reporter(pane); });
     growing.Keep();
     return pane;
 }

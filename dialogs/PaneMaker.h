@@ -2,11 +2,14 @@
 #pragma once
 #include "dialogs/LoadError.h"
 #include <functional>
+#include <map>
+#include <string>
 
 class GlogPane;
 struct DialogItem;
 struct glogRec;
 
+// The items must outlive it.
 class PaneMaker {
 public:
     explicit PaneMaker(glogRec *glog_)
@@ -16,9 +19,12 @@ public:
     // was made by then is deleted.
     GlogPane *Make(DialogItem const &);
 
+    // Where the key of a pane that was made here stands; the other place for any other pane and for null.
+    LoadError::Place PlaceOf(GlogPane const *, std::string const &key, LoadError::Place const &other) const;
+
     // Calls the function, which makes something for the item, and turns whatever goes wrong in it into a
-    // LoadError.
-    typedef std::function<LoadError::Place(std::string const &key)> PlaceOfKey;
+    // LoadError. The pane is that of the fault, null when it names none.
+    typedef std::function<LoadError::Place(std::string const &key, GlogPane const *)> PlaceOfKey;
     static void Guard(PlaceOfKey const &, std::function<void()> const &);
 
 private:
@@ -26,4 +32,5 @@ private:
     void MakeInside(GlogPane *, DialogItem const &);
 
     glogRec *glog;
+    std::map<GlogPane const *, DialogItem const *> made;
 };

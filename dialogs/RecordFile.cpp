@@ -93,7 +93,7 @@ LoadError::Place RecordFile::PlaceOf(Entry const &entry, std::string const &key)
 }
 
 void RecordFile::Make(glogRec *glog, Entry const &entry, int id) const {
-    PaneMaker::Guard([&](std::string const &key) { return PlaceOf(entry, key); },
+    PaneMaker::Guard([&](std::string const &key, GlogPane const *) { return PlaceOf(entry, key); },
                      [&] {
                          RecordBytes record(entry.bytes, entry.size, entry.place);
                          GlogPane *const pane = entry.type->recordMaker(glog, record);

@@ -1,8 +1,11 @@
 #include "desktop/resources/XmlFile.h"
+#include "desktop/resources/XmlMarkup.h"
 #include "desktop/resources/XmlText.h"
 #include <algorithm>
+#include <cerrno>
 #include <charconv>
 #include <cstdio>
+#include <cstring>
 #include <memory>
 #include <pugixml.hpp>
 
@@ -143,14 +146,26 @@ void CheckElementCount(std::string const &name, std::string_view text) {
     }
 }
 
+// Throws what is wrong, if anything is.
+void Require(XmlTextFault const &fault, std::string const &name, std::string_view text) {
+    if (!fault.message.empty())
+        throw ErrorAtOffset(name, text, fault.offset, fault.message);
+}
+
 void CheckText(std::string const &name, std::string_view text) {
     if (text.size() > XmlFile::kMaxBytes)
         throw XmlError(name, 0, 0,
                        "the file is larger than " + std::to_string(XmlFile::kMaxBytes >> 20) + " MiB");
-    XmlTextFault const fault = FindXmlTextFault(text);
-    if (!fault.message.empty())
-        throw ErrorAtOffset(name, text, fault.offset, fault.message);
+    Require(FindXmlTextFault(text), name, text);
     CheckElementCount(name, text);
+}
+
+[[noreturn]] void Refuse(pugi::xml_parse_result const &result, std::string const &name,
+                         std::string_view text) {
+    if (result.status == pugi::status_end_element_mismatch)
+        Require(FindXmlTagFault(text), name, text);
+    throw ErrorAtOffset(name, text, static_cast<std::size_t>(std::max<std::ptrdiff_t>(result.offset, 0)),
+                        Describe(result.status));
 }
 
 pugi::xml_node OnlyRoot(pugi::xml_document const &document, std::string const &name, std::string_view text) {
@@ -174,7 +189,7 @@ struct CloseFile {
 std::string ReadBytes(std::string const &path) {
     std::unique_ptr<std::FILE, CloseFile> const file(std::fopen(path.c_str(), "rb"));
     if (!file)
-        throw XmlError(path, 0, 0, "the file cannot be opened");
+        throw XmlError(path, 0, 0, std::string("the file cannot be opened: ") + std::strerror(errno));
     std::string bytes;
     char block[1 << 16];
     while (std::size_t const count = std::fread(block, 1, sizeof block, file.get())) {
@@ -183,7 +198,7 @@ std::string ReadBytes(std::string const &path) {
             break; // the parser says so
     }
     if (std::ferror(file.get()))
-        throw XmlError(path, 0, 0, "the file cannot be read");
+        throw XmlError(path, 0, 0, std::string("the file cannot be read: ") + std::strerror(errno));
     return bytes;
 }
 
@@ -213,8 +228,8 @@ XmlFile XmlFile::Parse(std::string_view bytes, std::string const &name) {
     pugi::xml_parse_result const result =
         document.load_buffer(bytes.data(), bytes.size(), options, pugi::encoding_utf8);
     if (!result)
-        throw ErrorAtOffset(name, bytes, static_cast<std::size_t>(std::max<std::ptrdiff_t>(result.offset, 0)),
-                            Describe(result.status));
+        Refuse(result, name, bytes);
+    Require(FindXmlReferenceFault(bytes), name, bytes);
     XmlFile file(name);
     TreeBuilder(name, bytes).Build(OnlyRoot(document, name, bytes), file.root, 1);
     return file;

@@ -34,8 +34,8 @@ struct XmlNode {
     std::string const *Attribute(std::string_view attribute) const; // its value; null when absent
 };
 
-// A whole file. UTF-8 only, with or without a byte order mark. Document types are skipped and their entities
-// not known.
+// A whole file. UTF-8 only, with or without a byte order mark. Document types are skipped; their entities are
+// not known, and a reference to one is an error.
 class XmlFile {
 public:
     static constexpr std::size_t kMaxBytes = std::size_t(64) << 20;

@@ -167,7 +167,11 @@ TEST(ItemNames, AreNotNearWhenNothingIsAlike) {
     EXPECT_EQ(NearestName::Of("Zeppelin", names), "");
     EXPECT_EQ(NearestName::Of("", names), "");
     EXPECT_EQ(NearestName::Of(std::string(100000, 'x'), names), "");
-    EXPECT_EQ(NearestName::Hint("Zeppelin", names), "");
+}
+
+TEST(ItemNames, AreAllTheHintWhenNothingIsAlike) {
+    EXPECT_EQ(NearestName::Hint("Zeppelin", {"OvalButton", "Label"}), "; possible: OvalButton, Label");
+    EXPECT_EQ(NearestName::Hint("Zeppelin", {}), "");
 }
 
 } // namespace

@@ -279,7 +279,15 @@ TEST_F(ListItems, NeedABoxAndALineHeight) {
 
 TEST_F(ListItems, ABarThatIsNotThereIsAnError) {
     EXPECT_TRUE(Holds(ComplaintAboutItem("List", kPlace + "<ScrollItem>9</ScrollItem>"),
-                      "there is no scroll bar of the number 9"));
+                      "item 1 (List): key ScrollItem: there is no item 9"));
+}
+
+TEST_F(ListItems, AnItemThatIsNoBarIsAnErrorInItsPlace) {
+    EXPECT_EQ(ComplaintAbout("<Glog width=\"99\" height=\"99\"><Items><Item type=\"Group\"><Items>\n"
+                             "  <Item type=\"Spacer\" id=\"9\"/>\n  <Item type=\"List\" id=\"1\">" +
+                             kPlace +
+                             "\n    <ScrollItem>9</ScrollItem></Item></Items></Item></Items></Glog>"),
+              "test.xml:4:5: item 1 (List): key ScrollItem: item 9 is no scroll bar");
 }
 
 TEST_F(ListItems, NumbersOutOfRangeAreErrors) {

@@ -117,6 +117,13 @@ TEST_F(OvalButtonItem, TakesItsLabelFromTheListByTextNum) {
     EXPECT_EQ(TextOf(LoadOne<OvalButtonPane>("OvalButton", "<TextNum>2</TextNum>")), "Cancel");
 }
 
+TEST_F(OvalButtonItem, HasNoNumberThatNoLabelHas) {
+    EXPECT_TRUE(Holds(ComplaintAboutItem("OvalButton", "<TextNum>999</TextNum>"),
+                      "item 1 (OvalButton): key TextNum: there is no label of the number 999"));
+    EXPECT_TRUE(Holds(ComplaintAboutItem("StudButton", "<TextID>999</TextID>"),
+                      "item 1 (StudButton): key TextID: there is no label of the number 999"));
+}
+
 TEST_F(OvalButtonItem, PrefersButtonText) {
     EXPECT_EQ(
         TextOf(LoadOne<OvalButtonPane>("OvalButton", "<TextNum>2</TextNum><ButtonText>Größe</ButtonText>")),

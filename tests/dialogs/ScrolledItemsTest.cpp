@@ -38,11 +38,11 @@ TEST_F(ScrolledItems, TheDumpTellsHowFarAPaneIsScrolled) {
 TEST_F(ScrolledItems, ABarThatIsNotThereIsAnError) {
     for (std::string const key : {"HScrollBar", "VScrollBar"})
         EXPECT_TRUE(Holds(ComplaintAboutItem("ScrollPane", kPlace + "<" + key + ">9</" + key + ">"),
-                          "there is no scroll bar of the number 9"))
+                          "item 1 (ScrollPane): key " + key + ": there is no item 9"))
             << key;
     for (std::string const key : {"ScrollBar", "LateralScrollBar"})
         EXPECT_TRUE(Holds(ComplaintAboutItem("ScrollGrid", kPlace + "<" + key + ">1</" + key + ">"),
-                          "there is no scroll bar of the number 1"))
+                          "item 1 (ScrollGrid): key " + key + ": item 1 is no scroll bar"))
             << key;
 }
 

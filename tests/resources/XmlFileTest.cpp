@@ -6,6 +6,9 @@
 
 namespace {
 
+std::string const kUnknownReference =
+    "\"&\" begins no character that is known here; the sign itself is written &amp;";
+
 XmlNode Parse(std::string const &text) { return XmlFile::Parse(text, "test.xml").Root(); }
 
 // what() of the error that parsing the text gives.
@@ -71,14 +74,35 @@ TEST(XmlFile, KeepsWhiteSpaceInCdata) {
 
 TEST(XmlFile, ResolvesCharacterReferences) { EXPECT_EQ(Parse("<a>&#xe4;&lt;</a>").text, "\xC3\xA4<"); }
 
-TEST(XmlFile, SkipsDocumentTypesWithoutExpandingTheirEntities) {
-    XmlNode const root = Parse("<!DOCTYPE a [<!ENTITY x \"boom\">]><a>&x;</a>");
-    EXPECT_EQ(root.text, "&x;");
+TEST(XmlFile, SkipsDocumentTypesWithTheirEntities) {
+    EXPECT_EQ(Parse("<!DOCTYPE a [<!ENTITY x \"1 > 2 & 3\">]><a>&lt;</a>").text, "<");
+    EXPECT_EQ(ErrorOf("<!DOCTYPE a [<!ENTITY x \"boom\">]><a>&x;</a>"),
+              "test.xml:1:37: " + kUnknownReference);
+}
+
+TEST(XmlFile, RejectsAnAmpersandThatStandsForItself) {
+    EXPECT_EQ(ErrorOf("<a>\n  Drums & Bass</a>"), "test.xml:2:9: " + kUnknownReference);
+    EXPECT_EQ(ErrorOf("<a b=\"R&B\"/>"), "test.xml:1:8: " + kUnknownReference);
+    EXPECT_EQ(ErrorOf("<a>R&B<!-- ; --></a>"), "test.xml:1:5: " + kUnknownReference);
+    EXPECT_EQ(ErrorOf("<a>&#;</a>"), "test.xml:1:4: " + kUnknownReference);
+    EXPECT_EQ(ErrorOf("<a>&#x;</a>"), "test.xml:1:4: " + kUnknownReference);
+    EXPECT_EQ(ErrorOf("<a>&amp</a>"), "test.xml:1:4: " + kUnknownReference);
+}
+
+TEST(XmlFile, AnAmpersandMayStandForItselfWhereNothingIsRead) {
+    EXPECT_EQ(Parse("<?note a & b?><!-- R&B --><a b='&apos;&quot;'><![CDATA[R&B]]>&gt;&#38;&#x26;</a>").text,
+              "R&B>&&");
 }
 
 TEST(XmlFile, NamesFileLineAndColumnOfAMistake) {
-    EXPECT_EQ(ErrorOf("<a>\n  <b>\n</a>"),
-              "test.xml:3:3: a tag has no partner: start and end tags do not match");
+    EXPECT_EQ(ErrorOf("<a>\n  <b>\n</a>"), "test.xml:3:1: expected </b> for the <b> of line 2, found </a>");
+}
+
+TEST(XmlFile, NamesTheTagsThatAreNoPartners) {
+    EXPECT_EQ(ErrorOf("<a>\n <b/><!-- <c> --><d e='>'>\n <![CDATA[<f>]]></g>"),
+              "test.xml:3:17: expected </d> for the <d> of line 2, found </g>");
+    EXPECT_EQ(ErrorOf("<a>\n  <b></b>\n  <c>\n"), "test.xml:3:3: <c> is not closed");
+    EXPECT_EQ(ErrorOf("<a></a></b>"), "test.xml:1:8: </b> closes nothing: no element is open here");
 }
 
 TEST(XmlFile, RejectsTextThatIsNoXml) {

@@ -155,7 +155,7 @@ TEST_F(Glogview, EndsWithOneForABadDialog) {
 TEST_F(Glogview, EndsWithOneForAMissingDialog) {
     ProgramResult const result = Run("none.xml --png a.png");
     EXPECT_EQ(result.status, 1);
-    EXPECT_EQ(result.errors, "glogview: none.xml: the file cannot be opened\n");
+    EXPECT_EQ(result.errors, "glogview: none.xml: the file cannot be opened: No such file or directory\n");
 }
 
 TEST_F(Glogview, EndsWithOneForABadScript) {
@@ -163,7 +163,8 @@ TEST_F(Glogview, EndsWithOneForABadScript) {
     ProgramResult const result = Run("good.xml --script script");
     EXPECT_EQ(result.status, 1);
     EXPECT_TRUE(Holds(result.errors, "glogview: script:2: ")) << result.errors;
-    EXPECT_TRUE(Holds(Run("good.xml --script none").errors, "none: the file cannot be read"));
+    EXPECT_TRUE(Holds(Run("good.xml --script none").errors,
+                      "none: the file cannot be read: No such file or directory"));
 }
 
 TEST_F(Glogview, EndsWithOneForAScriptThatCannotGoOn) {

@@ -96,7 +96,7 @@ TEST_F(Watched, ForgetsTheErrorWhenTheDialogIsGoodAgain) {
 TEST_F(Watched, OutlivesTheLossOfItsFile) {
     std::filesystem::remove(path);
     dialog.Follow();
-    EXPECT_EQ(Banner(), path + ": the file cannot be opened");
+    EXPECT_EQ(Banner(), path + ": the file cannot be opened: No such file or directory");
     Save(Dialog("Back"));
     EXPECT_TRUE(Shows("Back"));
 }
