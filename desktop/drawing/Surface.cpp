@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <cairo.h>
+#include <cerrno>
 #include <cstring>
 #include <cwchar>
 #include <fstream>
@@ -189,9 +190,10 @@ bool Surface::WritePng(std::string const &path, std::string &error) const {
     CairoSurfaceHolder view(
         cairo_image_surface_create_for_data(data, IsOpaque() ? CAIRO_FORMAT_RGB24 : CAIRO_FORMAT_ARGB32,
                                             width, height, width * static_cast<int>(sizeof(std::uint32_t))));
+    errno = 0;
     cairo_status_t status = cairo_surface_write_to_png(view.get(), path.c_str());
     if (status != CAIRO_STATUS_SUCCESS)
-        error = path + ": " + cairo_status_to_string(status);
+        error = path + ": " + (errno ? std::strerror(errno) : cairo_status_to_string(status));
     return status == CAIRO_STATUS_SUCCESS;
 }
 

@@ -126,7 +126,7 @@ std::string Desktop::DumpTree(glogRec *glog) const { return TreeDump::Json(Glog:
 void Desktop::Snapshot(glogRec *record, std::string const &pngPath) {
     std::string error;
     if (!Glog::From(record).WritePng(pngPath, error))
-        throw std::runtime_error("cannot write the picture " + pngPath + ": " + error);
+        throw std::runtime_error("cannot write the picture " + error);
 }
 
 int Desktop::Print(glogRec *glog, std::string const &pdfPath, PrintOptions const &options) {

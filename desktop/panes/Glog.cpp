@@ -405,7 +405,7 @@ void Glog::PresentPart(Rect const &part) {
 
 bool Glog::WritePng(std::string const &path, std::string &error) {
     if (!surface) {
-        error = "its window has not been shown";
+        error = path + ": its window has not been shown";
         return false;
     }
     Update();
