@@ -21,6 +21,8 @@ public:
 //     press 120 40 shift      move 130 44       release
 //     click 120 40            doubleclick 120 40     rightclick 120 40
 //     wheel 120 40 0 -1       # horizontal and vertical notches
+//     click @3                # the middle of item 3, in any step with a place
+//     press @3+20+8           # 20 right and 8 below the top left corner of item 3
 //     key Return              key a command     type "héllo"
 //     compose "nih" 2         # what an input method composes, its caret so far in; "" gives it up
 //     wait 0.5                resize 640 480    activate off

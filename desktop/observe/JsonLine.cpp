@@ -1,8 +1,9 @@
 #include "desktop/observe/JsonLine.h"
 #include "desktop/resources/Utf.h"
+#include <charconv>
 #include <cmath>
 #include <cstdio>
-#include <cstdlib>
+#include <iterator>
 
 namespace {
 
@@ -71,12 +72,14 @@ std::string JsonLine::Shortest(double value) {
     if (!std::isfinite(value))
         return "null"; // JSON has no infinities
     char digits[32];
+    char *end = digits;
     for (int precision = 1; precision <= 17; ++precision) {
-        std::snprintf(digits, sizeof digits, "%.*g", precision, value);
-        if (std::strtod(digits, nullptr) == value)
+        end = std::to_chars(digits, std::end(digits), value, std::chars_format::general, precision).ptr;
+        double read = 0;
+        if (std::from_chars(digits, end, read).ec == std::errc() && read == value)
             break;
     }
-    return digits;
+    return std::string(digits, end);
 }
 
 JsonLine &JsonLine::Flag(char const *key, bool value) {

@@ -2,6 +2,7 @@
 #include "desktop/menus/MenuTracker.h"
 #include "desktop/panes/DesktopRep.h"
 #include "desktop/panes/Glog.h"
+#include "desktop/panes/PaneAccess.h"
 #include "desktop/windows/SimulatedWindowSystem.h"
 #include <cmath>
 #include <fstream>
@@ -39,6 +40,25 @@ void AnswerMenu(ScriptStep const &step) {
         throw ScriptError(step.source + ": " + reason);
 }
 
+// The place that the step names, in the window.
+Point PlaceInItem(Desktop &desktop, ScriptStep const &step, PlatformWindow *window) {
+    std::string const item = "item " + std::to_string(step.item);
+    glogRec *const glog = DesktopRep::Of(desktop).GlogOf(window);
+    GlogPane *const pane = glog ? GetGlogItem(glog, static_cast<short>(step.item)) : nullptr;
+    if (!pane || pane->GetID() != step.item)
+        throw ScriptError(step.source + ": there is no " + item + " in the window");
+    if (!pane->GetVisibility())
+        throw ScriptError(step.source + ": " + item + " is hidden");
+    Rect const box = pane->GetDrawRectangle();
+    Point const origin = PaneAccess::Origin(*pane);
+    int const h = origin.h + box.left + (step.inMiddle ? (box.right - box.left) / 2 : step.h);
+    int const v = origin.v + box.top + (step.inMiddle ? (box.bottom - box.top) / 2 : step.v);
+    Rect const shown = PaneAccess::VisiblePart(*pane);
+    if (h < shown.left || h >= shown.right || v < shown.top || v >= shown.bottom)
+        throw ScriptError(step.source + ": this place of " + item + " does not show in the window");
+    return {static_cast<short>(v), static_cast<short>(h)};
+}
+
 void CarryOut(Desktop &desktop, ScriptStep const &step, PlatformWindow *window) {
     glogRec *const glog = DesktopRep::Of(desktop).GlogOf(window);
     if (!glog)
@@ -70,6 +90,8 @@ SimulatedDesktop::SimulatedDesktop(DesktopOptions const &options)
     : Desktop(options, std::unique_ptr<WindowSystem>(new SimulatedWindowSystem(options.scale))) {
     SystemOf(*this).SetCommandHandler(
         [this](ScriptStep const &step, PlatformWindow *window) { CarryOut(*this, step, window); });
+    SystemOf(*this).SetPlaceFinder(
+        [this](ScriptStep const &step, PlatformWindow *window) { return PlaceInItem(*this, step, window); });
 }
 
 SimulatedDesktop::~SimulatedDesktop() {}

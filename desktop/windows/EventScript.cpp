@@ -1,6 +1,7 @@
 #include "desktop/windows/EventScript.h"
 #include "desktop/SimulatedDesktop.h"
 #include <algorithm>
+#include <charconv>
 #include <cmath>
 #include <cstdlib>
 
@@ -11,6 +12,8 @@ int const kMostComposed = 1000; // characters
 double const kMostNotches = 1000;
 double const kLongestWait = 86400; // a day
 long const kLastMenuItem = 32767;
+int const kLastItem = 32767;
+char const kItemSign = '@';
 std::size_t const kDeepestMenu = 64; // menus within each other
 
 struct NamedKey {
@@ -38,6 +41,23 @@ NamedModifier const kNamedModifiers[] = {
     {"control", Modifiers::kControl},
 };
 
+template <class Named, std::size_t count> std::string NamesIn(Named const (&table)[count]) {
+    std::string text;
+    for (Named const &entry : table)
+        text += (text.empty() ? "" : ", ") + std::string(entry.name);
+    return text;
+}
+
+// Whether the number stands at the start of the text, which then begins behind it. Regardless of the
+// program's locale, unlike the C library.
+template <class Value> bool TakeNumber(std::string_view &text, Value &value) {
+    std::from_chars_result const result = std::from_chars(text.data(), text.data() + text.size(), value);
+    if (result.ec != std::errc())
+        return false;
+    text.remove_prefix(static_cast<std::size_t>(result.ptr - text.data()));
+    return true;
+}
+
 // Reads one line word by word.
 class LineReader {
 public:
@@ -64,9 +84,11 @@ public:
 
     double Number(char const *expected, double smallest, double largest) {
         std::string const word = Word(expected);
-        char *end = nullptr;
-        double const value = std::strtod(word.c_str(), &end);
-        if (end == word.c_str() || *end != '\0' || !(value >= smallest && value <= largest))
+        std::string_view rest = word;
+        if (word.size() > 1 && word[0] == '+' && word[1] != '-')
+            rest.remove_prefix(1);
+        double value = 0;
+        if (!TakeNumber(rest, value) || !rest.empty() || !(value >= smallest && value <= largest))
             Fail(std::string("expected ") + expected + ", found \"" + word + "\"");
         return value;
     }
@@ -79,8 +101,25 @@ public:
     }
 
     void Place(ScriptStep &step) {
+        if (!AtEnd() && line[at] == kItemSign) {
+            PlaceInItem(step);
+            return;
+        }
         step.h = Whole("a horizontal place", -kFarthest, kFarthest);
         step.v = Whole("a vertical place", -kFarthest, kFarthest);
+    }
+
+    void PlaceInItem(ScriptStep &step) {
+        std::string const word = Word("an item");
+        std::string_view rest = std::string_view(word).substr(1);
+        bool isRight = TakeNumber(rest, step.item) && step.item >= 1 && step.item <= kLastItem;
+        step.inMiddle = isRight && rest.empty();
+        if (isRight && !step.inMiddle)
+            isRight = TakeOffset(rest, step.h) && TakeOffset(rest, step.v) && rest.empty();
+        if (!isRight)
+            Fail("expected an item such as @3, or @3+20+8 for a place 20 right and 8 below its top left "
+                 "corner, found \"" +
+                 word + "\"");
     }
 
     void ModifierWords(ScriptStep &step) {
@@ -130,6 +169,13 @@ public:
     }
 
 private:
+    static bool TakeOffset(std::string_view &text, int &offset) {
+        if (text.empty() || text[0] != '+')
+            return false;
+        text.remove_prefix(1);
+        return TakeNumber(text, offset) && offset >= 0 && offset <= kFarthest;
+    }
+
     std::string const &line;
     std::string const &source;
     std::size_t at = 0;
@@ -153,7 +199,8 @@ void ReadKey(LineReader &reader, ScriptStep &step) {
     std::string const name = reader.Word("a key");
     step.key = EventScript::KeyByName(name);
     if (step.key == KeyCodes::kNone)
-        reader.Fail("there is no key \"" + name + "\"");
+        reader.Fail("there is no key \"" + name + "\"; possible: a character, " + NamesIn(kNamedKeys) +
+                    ", F1 to F12");
     reader.ModifierWords(step);
 }
 
@@ -185,7 +232,7 @@ void ReadMenu(LineReader &reader, ScriptStep &step) { reader.MenuItem(step); }
 void ReadFile(LineReader &reader, ScriptStep &step) { step.text = reader.Word("a file"); }
 
 struct StepForm {
-    char const *word;
+    char const *name;
     ScriptStep::Kind kind;
     void (*read)(LineReader &, ScriptStep &);
 };
@@ -212,7 +259,7 @@ StepForm const kStepForms[] = {
 ScriptStep ReadStep(LineReader &reader, std::string const &source) {
     std::string const word = reader.Word("a step");
     for (StepForm const &form : kStepForms) {
-        if (word != form.word)
+        if (word != form.name)
             continue;
         ScriptStep step;
         step.kind = form.kind;
@@ -222,7 +269,7 @@ ScriptStep ReadStep(LineReader &reader, std::string const &source) {
             reader.Fail("there is more on the line than \"" + word + "\" takes");
         return step;
     }
-    reader.Fail("there is no step \"" + word + "\"");
+    reader.Fail("there is no step \"" + word + "\"; possible: " + NamesIn(kStepForms));
 }
 
 } // namespace

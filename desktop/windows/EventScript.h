@@ -26,7 +26,9 @@ struct ScriptStep {
         kDump
     };
     Kind kind = kWait;
-    int h = 0, v = 0; // place, or width and height
+    int h = 0, v = 0;      // place, or width and height
+    int item = 0;          // whose top left corner the place counts from; 0: the window's
+    bool inMiddle = false; // of the item, whatever the place
     double wheelH = 0, wheelV = 0;
     unsigned short modifiers = 0;
     int key = 0;

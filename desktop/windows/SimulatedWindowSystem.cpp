@@ -200,12 +200,23 @@ void SimulatedWindowSystem::Type(ScriptStep const &step) {
     }
 }
 
+// Events count from the window that has captured the mouse, items stand in the one that scripts act on.
+void SimulatedWindowSystem::TakePlace(ScriptStep const &step) {
+    lastH = step.h;
+    lastV = step.v;
+    SimulatedWindow *const target = Target();
+    if (!step.item || !placeFinder || !target)
+        return;
+    Point const place = placeFinder(step, target);
+    Point const from = captured ? captured->ScreenPlace() : target->ScreenPlace();
+    lastH = place.h + target->ScreenPlace().h - from.h;
+    lastV = place.v + target->ScreenPlace().v - from.v;
+}
+
 void SimulatedWindowSystem::Perform(ScriptStep const &step) {
     bool const hasPlace = step.kind <= ScriptStep::kWheel && step.kind != ScriptStep::kRelease;
-    if (hasPlace) {
-        lastH = step.h;
-        lastV = step.v;
-    }
+    if (hasPlace)
+        TakePlace(step);
     switch (step.kind) {
     case ScriptStep::kPress:
         PushPress(1, kAsCounted, step);
@@ -233,8 +244,8 @@ void SimulatedWindowSystem::Perform(ScriptStep const &step) {
     case ScriptStep::kWheel: {
         InputEvent event;
         event.kind = InputEvent::kWheel;
-        event.h = step.h;
-        event.v = step.v;
+        event.h = lastH;
+        event.v = lastV;
         event.wheelH = step.wheelH;
         event.wheelV = step.wheelV;
         Push(event, step);

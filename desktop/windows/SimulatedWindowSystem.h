@@ -22,6 +22,10 @@ public:
     // on; null without one.
     typedef std::function<void(ScriptStep const &, PlatformWindow *)> CommandHandler;
     void SetCommandHandler(CommandHandler handler) { commandHandler = std::move(handler); }
+    // Answers where in the window a place lies that the step names by an item; throws ScriptError where there
+    // is none.
+    typedef std::function<Point(ScriptStep const &, PlatformWindow *)> PlaceFinder;
+    void SetPlaceFinder(PlaceFinder finder) { placeFinder = std::move(finder); }
 
     char const *Name() const override { return "simulated"; }
     std::unique_ptr<PlatformWindow> CreateWindow(WindowSpec const &) override;
@@ -53,6 +57,7 @@ private:
     SimulatedWindow *Target() const; // what the script acts on: the window shown last that is no pop-up
     bool Deliver(InputEvent &);
     void Perform(ScriptStep const &);
+    void TakePlace(ScriptStep const &);
     void Push(InputEvent, ScriptStep const &);
     void PushButton(InputEvent::Kind, int button, int clicks, ScriptStep const &);
     void PushPress(int button, int clicks, ScriptStep const &);
@@ -75,6 +80,7 @@ private:
     SimulatedWindow *active = nullptr;
     PlatformWindow *captured = nullptr;
     CommandHandler commandHandler;
+    PlaceFinder placeFinder;
     std::string clipboard;
     int cursor = Cursors::kArrow;
     int lastH = 0, lastV = 0;

@@ -16,7 +16,7 @@ int main(int argc, char **argv) {
     bool const simulated = argc > 1 && argv[1] == std::string("--simulated");
     std::unique_ptr<Desktop> desktop(simulated ? new SimulatedDesktop : new Desktop);
     if (simulated)
-        static_cast<SimulatedDesktop &>(*desktop).Script("click 170 78\nclick 70 78");
+        static_cast<SimulatedDesktop &>(*desktop).Script("click @2\nclick @1");
     glogRec *glog = LoadGlog("hello.xml");
     Printer printer;
     for (short id : {1, 2})

@@ -67,6 +67,32 @@ TEST(EventScript, MenusNameNoItemZeroOfASubmenuAndNoneBeyondThoseThatThereCanBe)
         EXPECT_THROW(One(step), ScriptError) << step;
 }
 
+TEST(EventScript, PlacesMayCountFromAnItem) {
+    ScriptStep const corner = One("press @12+40+8 shift");
+    EXPECT_EQ(corner.item, 12);
+    EXPECT_EQ(corner.h, 40);
+    EXPECT_EQ(corner.v, 8);
+    EXPECT_FALSE(corner.inMiddle);
+    EXPECT_EQ(corner.modifiers, Modifiers::kShift);
+    ScriptStep const wheel = One("wheel @3 0 -1");
+    EXPECT_EQ(wheel.item, 3);
+    EXPECT_TRUE(wheel.inMiddle);
+    EXPECT_EQ(wheel.wheelV, -1);
+    for (char const *step :
+         {"click @", "click @0", "click @32768", "click @x", "click @3+", "click @3+1", "click @3+1+",
+          "click @3+1+2x", "click @3-1-2", "click @3+1+-2", "click @3+1+2+3"})
+        EXPECT_THROW(One(step), ScriptError) << step;
+}
+
+TEST(EventScript, NumbersAreReadAsTheyAreWritten) {
+    EXPECT_EQ(One("wait 0.5").seconds, 0.5);
+    EXPECT_EQ(One("wait +1.5").seconds, 1.5);
+    EXPECT_EQ(One("wait 5e-1").seconds, 0.5);
+    EXPECT_EQ(One("press -3 +4").v, 4);
+    for (char const *step : {"wait 0,5", "wait inf", "wait 1.5x", "wait +-1", "wait ++1"})
+        EXPECT_THROW(One(step), ScriptError) << step;
+}
+
 TEST(EventScript, KeysHaveNamesOrAreTheCharacterThatTheyType) {
     EXPECT_EQ(EventScript::KeyByName("Return"), 13);
     EXPECT_EQ(EventScript::KeyByName("Enter"), 3);
@@ -80,7 +106,9 @@ TEST(EventScript, KeysHaveNamesOrAreTheCharacterThatTheyType) {
 }
 
 TEST(EventScript, ErrorsNameTheLineAndWhatWasExpected) {
-    EXPECT_EQ(ErrorOf("click 1 2\nclack 3 4"), "demo:2: there is no step \"clack\"");
+    EXPECT_EQ(ErrorOf("click 1 2\nclack 3 4"),
+              "demo:2: there is no step \"clack\"; possible: press, move, release, click, doubleclick, "
+              "rightclick, wheel, key, type, compose, wait, resize, activate, menu, print, snapshot, dump");
     EXPECT_EQ(ErrorOf("press 1"), "demo:1: expected a vertical place at the end of the line");
     EXPECT_EQ(ErrorOf("press 1 x"), "demo:1: expected a vertical place, found \"x\"");
     EXPECT_EQ(ErrorOf("press 1.5 2"), "demo:1: expected a horizontal place, a whole number");
@@ -88,7 +116,9 @@ TEST(EventScript, ErrorsNameTheLineAndWhatWasExpected) {
     EXPECT_EQ(ErrorOf("press nan 2"), "demo:1: expected a horizontal place, found \"nan\"");
     EXPECT_EQ(ErrorOf("click 1 2 hyper"),
               "demo:1: expected shift, command, option or control, found \"hyper\"");
-    EXPECT_EQ(ErrorOf("key Hyper"), "demo:1: there is no key \"Hyper\"");
+    EXPECT_EQ(ErrorOf("key Hyper"),
+              "demo:1: there is no key \"Hyper\"; possible: a character, Return, Enter, Escape, Tab, Space, "
+              "Backspace, Delete, Left, Right, Up, Down, Home, End, PageUp, PageDown, Help, F1 to F12");
     EXPECT_EQ(ErrorOf("type héllo"), "demo:1: expected a text in double quotes");
     EXPECT_EQ(ErrorOf("type \"abc"), "demo:1: the text has no closing double quote");
     EXPECT_EQ(ErrorOf("wait -1"), "demo:1: expected a number of seconds, found \"-1\"");
