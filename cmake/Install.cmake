@@ -42,6 +42,7 @@ set(public_headers
     desktop/resources/Resources.h)
 if(TARGET dialogs)
   list(APPEND public_headers
+       dialogs/FindItem.h
        dialogs/ItemRegistry.h
        dialogs/ItemType.h
        dialogs/KeyFault.h

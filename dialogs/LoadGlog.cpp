@@ -31,9 +31,11 @@ LoadError::Place WholeFile(std::string const &name) {
 // A glog that is disposed of unless it was finished.
 class GrowingGlog {
 public:
-    GrowingGlog(Desktop &desktop_, GlogOptions const &options)
+    GrowingGlog(Desktop &desktop_, GlogOptions const &options, std::string const &file)
         : desktop(desktop_)
-        , glog(desktop_.NewGlog(options)) {}
+        , glog(desktop_.NewGlog(options)) {
+        Glog::From(glog).SetSource(file);
+    }
     ~GrowingGlog() { DisposeGlog(glog); }
     GrowingGlog(GrowingGlog const &) = delete;
     GrowingGlog &operator=(GrowingGlog const &) = delete;
@@ -59,7 +61,7 @@ PaneMaker::PlaceOfKey PlacesIn(PaneMaker const &maker, std::string const &file) 
 }
 
 glogRec *MakeGlog(Dialog const &dialog) {
-    GrowingGlog growing(OpenDesktop(), dialog.options);
+    GrowingGlog growing(OpenDesktop(), dialog.options, dialog.file);
     PaneMaker maker(growing.Get());
     for (DialogItem const &item : dialog.items)
         maker.Make(item);
@@ -108,7 +110,7 @@ glogRec *LoadGlogFromRecords(void const *bytes, std::size_t size, GlogOptions co
                              std::string const &name) {
     Desktop &desktop = OpenDesktop();
     RecordFile const records(bytes, size, name);
-    GrowingGlog growing(desktop, GlogOptions(options).Size(records.Width(), records.Height()));
+    GrowingGlog growing(desktop, GlogOptions(options).Size(records.Width(), records.Height()), name);
     records.MakePanes(growing.Get());
     return growing.Finish([&](std::string const &, GlogPane const *) { return WholeFile(name); });
 }

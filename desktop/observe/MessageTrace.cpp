@@ -36,11 +36,13 @@ void MessageTrace::Write(JsonLine const &line) {
         theSink(line.Finish());
 }
 
-std::string MessageTrace::ClassName(GlogPane &pane) {
+std::string MessageTrace::ClassName(GlogPane &pane) { return ClassName(typeid(pane)); }
+
+std::string MessageTrace::ClassName(std::type_info const &type) {
     int status = 0;
     std::unique_ptr<char, decltype(&std::free)> const name(
-        abi::__cxa_demangle(typeid(pane).name(), nullptr, nullptr, &status), std::free);
-    std::string result = status == 0 ? name.get() : typeid(pane).name();
+        abi::__cxa_demangle(type.name(), nullptr, nullptr, &status), std::free);
+    std::string result = status == 0 ? name.get() : type.name();
     // Where a class was written down says nothing to who reads the trace.
     static std::string const kUnnamed = "(anonymous namespace)::";
     for (std::size_t at = result.find(kUnnamed); at != std::string::npos; at = result.find(kUnnamed))

@@ -61,6 +61,9 @@ public:
     int Height() const { return height; }
     bool IsActive() const { return active; }
     GlogOptions const &Options() const { return options; }
+    // The file that it was made from, for messages; empty when there was none.
+    void SetSource(std::string const &file) { source = file; }
+    std::string const &Source() const { return source; }
 
     // Drawing
     // Redraws what is damaged and presents it, and what was drawn outside an update too.
@@ -126,6 +129,7 @@ private:
 
     Desktop &desktop;
     GlogOptions options;
+    std::string source;
     int width, height;
     int minWidth = 0, minHeight = 0, maxWidth = 0, maxHeight = 0;
     std::vector<GlogPane *> items;

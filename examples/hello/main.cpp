@@ -1,6 +1,7 @@
 // Opens a dialog and tells which of its buttons was pressed.
 #include "buttons/GlogButtonPane.h"
 #include "desktop/SimulatedDesktop.h"
+#include "dialogs/FindItem.h"
 #include "dialogs/LoadGlog.h"
 #include "host/glogRec.h"
 #include <iostream>
@@ -20,7 +21,7 @@ int main(int argc, char **argv) {
     glogRec *glog = LoadGlog("hello.xml");
     Printer printer;
     for (short id : {1, 2})
-        printer.DependUpon(dynamic_cast<GlogButtonPane *>(GetGlogItem(glog, id)));
+        printer.DependUpon(FindItem<GlogButtonPane>(glog, id));
     ShowGlog(glog, kShowGlog);
     return desktop->Run();
 }

@@ -1,18 +1,18 @@
 #include "Takes.h"
 #include "buttons/GlogButtonPane.h"
-#include "host/glogRec.h"
+#include "dialogs/FindItem.h"
 #include "lists/GListPane.h"
 #include "lists/ListTextDrawer.h"
 #include "menus/PopMPane.h"
 #include "text/GTextPane.h"
 
 Takes::Takes(glogRec *glog)
-    : name(dynamic_cast<GTextPane *>(GetGlogItem(glog, kName)))
-    , rating(dynamic_cast<PopMPane *>(GetGlogItem(glog, kRating))) {
-    GlogButtonPaneListener::DependUpon(dynamic_cast<GlogButtonPane *>(GetGlogItem(glog, kAdd)));
+    : name(FindItem<GTextPane>(glog, kName))
+    , rating(FindItem<PopMPane>(glog, kRating)) {
+    GlogButtonPaneListener::DependUpon(FindItem<GlogButtonPane>(glog, kAdd));
     TextPaneListener::DependUpon(name);
     PopUpMenuListener::DependUpon(rating);
-    list = dynamic_cast<GListPane *>(GetGlogItem(glog, kList));
+    list = FindItem<GListPane>(glog, kList);
     list->SetSelectionListener(this);
     auto const cells = [this](int line, int column, ListCell &cell) { FillIn(line, column, cell); };
     list->SetLineDrawer(new ListTextDrawer(list.Get(), cells), true);

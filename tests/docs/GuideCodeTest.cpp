@@ -1,6 +1,7 @@
 // The code of the guide that is no part of its example, as it stands there.
 #include "desktop/SimulatedDesktop.h"
 #include "desktop/resources/Resources.h"
+#include "dialogs/FindItem.h"
 #include "dialogs/ItemRegistry.h"
 #include "dialogs/LoadGlog.h"
 #include "frame/ModalGlogClass.h"
@@ -27,7 +28,7 @@ public:
 
 private:
     char Read() override {
-        tempo = dynamic_cast<GTextPane *>(GetGlogItem(GlogP(), 3))->GetText();
+        tempo = FindItem<GTextPane>(GlogP(), 3)->GetText();
         return !tempo.empty(); // false keeps the dialog open
     }
 };
