@@ -5,6 +5,7 @@
 #include "tests/screens/GalleryPages.h"
 #include "tests/screens/PageTexts.h"
 #include <gtest/gtest.h>
+#include <regex>
 #include <set>
 #include <tuple>
 
@@ -79,6 +80,21 @@ INSTANTIATE_TEST_SUITE_P(Gallery, TextsOfPage,
                          testing::Combine(testing::ValuesIn(GalleryFiles().Pages()),
                                           testing::Values(Look{"en", "light", 1}, Look{"en", "dark", 2},
                                                           Look{"de", "dark", 1}, Look{"de", "light", 2})),
+                         NameOf);
+
+class NumbersOfPage : public TextsOfPage {};
+
+// Three digits behind a mark may be thousands or thousandths, so these are left alone.
+TEST_P(NumbersOfPage, HaveTheDecimalMarkOfTheLanguage) {
+    std::regex const wrong(std::get<1>(GetParam()).language == "de" ? "\\d\\.(\\d{1,2}|\\d{4,})(?!\\d)"
+                                                                    : "\\d,(\\d{1,2}|\\d{4,})(?!\\d)");
+    for (PageText const &text : Texts())
+        EXPECT_FALSE(std::regex_search(text.text, wrong)) << text;
+}
+
+INSTANTIATE_TEST_SUITE_P(Gallery, NumbersOfPage,
+                         testing::Combine(testing::ValuesIn(GalleryFiles().Pages()),
+                                          testing::Values(Look{"en", "light", 1}, Look{"de", "light", 1})),
                          NameOf);
 
 class ColorsOfPage : public TextsOfPage {};

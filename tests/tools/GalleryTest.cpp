@@ -93,6 +93,18 @@ TEST_F(GalleryProgram, BeginsWithThePageThatIsAskedFor) {
     EXPECT_TRUE(Holds(TextFile::Read(directory.Path() + "/a.json"), "Groups within groups"));
 }
 
+// Numbers that panes show while they are used.
+TEST_F(GalleryProgram, WritesNumbersAsTheLanguageDoes) {
+    directory.Write("script", "wait 1\ndump zoom.json\n");
+    EXPECT_EQ(Run("--page zoom-and-progress --language de --script script").errors, "");
+    EXPECT_TRUE(Holds(TextFile::Read(directory.Path() + "/zoom.json"), "0,90 s bis 1,50 s"));
+    directory.Write("script", "press @1+137+150\nmove @1+177+210\nrelease\nwait 1\ndump place.json\n");
+    EXPECT_EQ(Run("--page panner --language de --script script").errors, "");
+    EXPECT_TRUE(
+        Holds(TextFile::Read(directory.Path() + "/place.json"), "\"x 0,30   y \u22121,00   z \u22120,10\""))
+        << TextFile::Read(directory.Path() + "/place.json");
+}
+
 TEST_F(GalleryProgram, EndsWithOneForAnUnknownPage) {
     directory.Write("script", "");
     ProgramResult const result = Run("--page lay --script script");

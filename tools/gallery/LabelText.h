@@ -13,5 +13,8 @@ void Show(glogRec *, int labelID, UString const &);
 void Show(GlogPane *, UString const &);
 UString OfNumber(int);                // in digits
 UString WithMinus(char const *ascii); // with a minus sign in place of each hyphen
+// Written as in the user's language: with so many decimals, or with a mark between thousands.
+UString OfDecimal(double, int decimals);
+UString OfThousands(int); // not below 0
 
 } // namespace LabelText

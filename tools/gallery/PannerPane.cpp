@@ -1,11 +1,11 @@
 #include "tools/gallery/PannerPane.h"
 #include "dialogs/ItemRegistry.h"
 #include "dialogs/MessageReporter.h"
+#include "dialogs/Utf8.h"
 #include "frame/ResourceReading.h"
 #include "graphics/ThreeDPane.h"
 #include "host/GlogStyleSheet.h"
 #include "tools/gallery/LabelText.h"
-#include <cstdio>
 
 namespace {
 
@@ -23,9 +23,15 @@ private:
     static void Show(void *self) {
         Readout const &readout = *static_cast<Readout *>(self);
         Point3D const place = readout.pane.GetValue();
-        char text[64];
-        std::snprintf(text, sizeof text, "x %.2f   y %.2f   z %.2f", place.x, place.y, place.z);
-        LabelText::Show(readout.pane.GetGlog(), readout.labelID, LabelText::WithMinus(text));
+        UString text = Coordinate("x ", place.x);
+        text += Coordinate("   y ", place.y);
+        text += Coordinate("   z ", place.z);
+        LabelText::Show(readout.pane.GetGlog(), readout.labelID, text);
+    }
+
+    static UString Coordinate(char const *name, double value) {
+        UString text = Utf8::ToUString(name);
+        return text += LabelText::OfDecimal(value, 2);
     }
 
     ThreeDPane &pane;

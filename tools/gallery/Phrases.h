@@ -77,6 +77,8 @@ enum class Phrase : short {
     kStrings,
     kVoice,
     kStretch,
+    kDecimalMark,
+    kThousandsMark,
 };
 
 namespace Phrases {

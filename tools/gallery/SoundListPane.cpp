@@ -1,5 +1,4 @@
 #include "tools/gallery/SoundListPane.h"
-#include "dialogs/Utf8.h"
 #include "frame/ResourceReading.h"
 #include "host/EventRecordAdapter.h"
 #include "host/GlogStyleSheet.h"
@@ -28,17 +27,6 @@ int const kCentredVertically = 1;
 int const kNoRow = -1;
 
 short Pixel(int value) { return static_cast<short>(value); }
-
-// With a comma between thousands.
-UString Grouped(int number) {
-    int const kGroup = 1000;
-    if (number < kGroup)
-        return LabelText::OfNumber(number);
-    UString text = Grouped(number / kGroup);
-    UString const rest = LabelText::OfNumber(kGroup + number % kGroup); // a digit more, for the noughts
-    text += Utf8::ToUString(",");
-    return text += rest.substr(1, UString::npos);
-}
 
 void DrawText(UString const &text, Rect const &box, TextSettings::Alignment alignment) {
     DrawStringInRect(text, box, alignment, TextSettings::kTruncateEnd, kCentredVertically, 0, 0, 0.0f, 1.0f,
@@ -149,9 +137,9 @@ void SoundListPane::Choose(int row) {
 void SoundListPane::SelectionDone(GListPane *) { TellChosen(); }
 
 void SoundListPane::TellFound() {
-    LabelText::Show(
-        container->FindByID(foundID),
-        Phrases::Fill(Phrase::kSoundsFound, {Grouped(sounds.CountFound()), Grouped(SoundNames::kCount)}));
+    LabelText::Show(container->FindByID(foundID),
+                    Phrases::Fill(Phrase::kSoundsFound, {LabelText::OfThousands(sounds.CountFound()),
+                                                         LabelText::OfThousands(SoundNames::kCount)}));
 }
 
 void SoundListPane::TellChosen() {

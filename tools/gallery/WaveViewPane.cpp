@@ -14,7 +14,6 @@
 #include "tools/gallery/WellPane.h"
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
 #include <memory>
 #include <new>
 
@@ -29,11 +28,7 @@ double const kSamplesPerSecond = 11025;
 int const kLoudest = 32768;
 char const kRecording[] = "/sounds/loop.wav";
 
-UString InSeconds(int sample) {
-    char text[32];
-    std::snprintf(text, sizeof text, "%.2f", sample / kSamplesPerSecond);
-    return ResourceKey(text);
-}
+UString InSeconds(int sample) { return LabelText::OfDecimal(sample / kSamplesPerSecond, 2); }
 
 } // namespace
 
