@@ -3,6 +3,7 @@
 #include "host/NamedColors.h"
 #include "host/VelaDrawing.h"
 #include "tests/text/TextFieldTest.h"
+#include <functional>
 
 namespace {
 
@@ -118,6 +119,140 @@ TEST_F(GTextPaneColors, ColoursThatItIsGivenShowWithTheNextDrawing) {
     EXPECT_EQ(PixelAt(190, 28), PixelOf(blue));
 }
 
+TEST_F(GTextPaneColors, ItsTextHasTheForeground) {
+    OpenTextField *const pane = Make(TestItem().String("InitTextID", "mmmm"));
+    RGBColor const red = {0xFFFF, 0, 0}, white = {0xFFFF, 0xFFFF, 0xFFFF};
+    pane->SetColors(red, white);
+    auto const hasRed = [&] { // letters are smoothed: nearly red
+        pane->Inval();
+        UpdateGlog(glog);
+        bool found = false;
+        for (int v = 21; v < 35; ++v)
+            for (int h = 21; h < 60; ++h) {
+                std::uint32_t const pixel = desktop.Picture(glog)->Row(v)[h];
+                found |= (pixel >> 16 & 0xFF) == 0xFF && (pixel & 0xFF) < 0x80 && (pixel >> 8 & 0xFF) < 0x80;
+            }
+        return found;
+    };
+    EXPECT_TRUE(hasRed());
+    OS::TextStyle style;
+    style.size = 14;
+    style.color = OS::RGBAColor(0, 1, 0, 1);
+    pane->SetTextStyle(style);
+    EXPECT_TRUE(hasRed()) << "of a style for all, the colour does not count";
+    pane->SetFontFSRID(9);
+    EXPECT_TRUE(hasRed());
+}
+
+TEST_F(GTextPaneColors, OnceItHasItsColoursADrawingTakesNoneOfThePort) {
+    Make();
+    OpenTextField *const pane = new OpenTextField;
+    TestItem item = Bass().Integer("NotSelectable", 1).Box("BoundsRect", {60, 20, 76, 200});
+    ASSERT_EQ(pane->InitGTextPane(glog, item.Sheet(), nullptr, nullptr), pane);
+    pane->PanePositionChanged();
+    pane->Prepare();
+    pane->SetupColors();
+    SetColors(&kTinted);
+    pane->_Draw_(nullptr, 0);
+    EXPECT_EQ(PixelAt(190, 70), PixelOf(kTextWellBackgroundColor));
+}
+
+TEST_F(GTextPaneColors, MakingItForgetsThatItHadColours) {
+    Make();
+    OpenTextField *const pane = new OpenTextField;
+    UString const text = Text("Bass");
+    pane->CreateTextEdit(&text, nullptr);
+    pane->SetupColors();
+    TestItem item = Bass().Integer("NotSelectable", 1).Box("BoundsRect", {60, 20, 76, 200});
+    ASSERT_EQ(pane->InitGTextPane(glog, item.Sheet(), nullptr, nullptr), pane);
+    pane->PanePositionChanged();
+    pane->Prepare();
+    SetColors(&kTinted);
+    pane->_Draw_(nullptr, 0);
+    EXPECT_EQ(PixelAt(190, 70), PixelOf(kTinted.back));
+}
+
+TEST_F(GTextPaneColors, WithoutItsGroundOnlyTheTextIsDrawnWhileItIsNotSelected) {
+    OpenTextField *const pane = Make(Bass());
+    RGBColor const red = {0xFFFF, 0, 0}, blue = {0, 0, 0xFFFF};
+    pane->SetColors(red, blue);
+    pane->DrawBackgroundWhenNotSelected(false);
+    pane->Inval();
+    EXPECT_NE(PixelAt(190, 28), PixelOf(blue));
+    pane->DrawBackgroundWhenNotSelected(true);
+    pane->Inval();
+    EXPECT_EQ(PixelAt(190, 28), PixelOf(blue));
+}
+
+// Taken over by a helper
+
+// Writes down the modes that it is given, and leaves colours of its own.
+class TintingHelper : public GTextPaneDrawingHelper {
+public:
+    explicit TintingHelper(std::vector<int> &modes_)
+        : modes(modes_) {}
+    void SetColors(unsigned char mode) override {
+        modes.push_back(mode);
+        ::SetColors(&kTinted);
+    }
+    void DrawTextWell(Rect &, unsigned char mode) override {
+        modes.push_back(-mode);
+        ::SetColors(&kTinted);
+    }
+
+private:
+    std::vector<int> &modes;
+};
+
+TEST_F(GTextPaneColors, AHelperIsToldTheMode) {
+    std::vector<int> modes;
+    OpenTextField *const pane = Make(Bass());
+    pane->SetDrawingHelper(AutoPtr<GTextPaneDrawingHelper>(new TintingHelper(modes)));
+    pane->SetMode(3);
+    modes.clear();
+    Rect box = BoxOf(*pane);
+    pane->SetupColors();
+    pane->DrawTextWell(box);
+    EXPECT_EQ(modes, (std::vector<int>{3, -3}));
+}
+
+TEST_F(GTextPaneColors, AHelpersColoursComeBeforeThoseOfTheField) {
+    std::vector<int> modes;
+    OpenTextField *const pane = Make(Bass());
+    RGBColor const red = {0xFFFF, 0, 0}, blue = {0, 0, 0xFFFF};
+    pane->SetColors(red, blue);
+    pane->SetDrawingHelper(AutoPtr<GTextPaneDrawingHelper>(new TintingHelper(modes)));
+    pane->Inval();
+    EXPECT_EQ(PixelAt(190, 28), PixelOf(kTinted.back));
+}
+
+TEST_F(GTextPaneColors, TheWellLeavesThePortsColours) {
+    std::vector<int> modes;
+    OpenTextField *const pane = Make(Bass());
+    pane->SetDrawingHelper(AutoPtr<GTextPaneDrawingHelper>(new TintingHelper(modes)));
+    SaveColorRec const others = {{0, 0, 0}, {0xFFFF, 0xFFFF, 0xFFFF}};
+    pane->Prepare();
+    SetColors(&others);
+    Rect box = BoxOf(*pane);
+    pane->DrawTextWell(box);
+    SaveColorRec after;
+    GetColors(&after);
+    EXPECT_EQ(after, others);
+}
+
+TEST_F(GTextPaneColors, ADerivedFieldMayFrameItsWellInItsOwnWay) {
+    class Framing : public OpenTextField {
+    public:
+        void DoFrameTextWell(Rect &box) override { framed.push_back(box); }
+        std::vector<Rect> framed;
+    };
+    Framing *const pane = new Framing;
+    TestItem item = Bass().Integer("TextWell", 1).Box("BoundsRect", {20, 20, 36, 200});
+    ASSERT_EQ(pane->InitGTextPane(glog, item.Sheet(), nullptr, nullptr), pane);
+    EXPECT_TRUE(Only("FrameTextWell", Traced(*pane, [&] { pane->_Draw_(nullptr, 0); })).empty());
+    EXPECT_EQ(pane->framed, (std::vector<Rect>{{20, 20, 36, 200}}));
+}
+
 // Of the selection
 
 TEST_F(GTextPaneColors, ASelectionHasTheColourThatItIsGiven) {
@@ -130,13 +265,16 @@ TEST_F(GTextPaneColors, ASelectionHasTheColourThatItIsGiven) {
     };
     std::uint32_t const usual = selected();
     EXPECT_NE(usual, PixelAt(190, 22));
-    RGBColor green = {0, 0xFFFF, 0}, black = {0, 0, 0}, nearlyBlack = {0, 0, 0x0100};
+    RGBColor green = {0, 0xFFFF, 0}, black = {0, 0, 0};
     pane->SetCustomSelectionColor(&green);
     EXPECT_EQ(selected(), PixelOf(green));
     pane->SetCustomSelectionColor(&black);
     EXPECT_EQ(selected(), usual);
-    pane->SetCustomSelectionColor(&nearlyBlack);
-    EXPECT_EQ(selected(), PixelOf(nearlyBlack));
+    RGBColor nearlyBlack[] = {{0x0100, 0, 0}, {0, 0x0100, 0}, {0, 0, 0x0100}};
+    for (RGBColor &color : nearlyBlack) {
+        pane->SetCustomSelectionColor(&color);
+        EXPECT_EQ(selected(), PixelOf(color));
+    }
     pane->SetCustomSelectionColor(nullptr);
     EXPECT_EQ(selected(), usual);
 }
@@ -159,49 +297,99 @@ TEST_F(GTextPaneColors, AHiddenFieldIsNotDrawnAtOnce) {
     EXPECT_TRUE(Traced(*pane, [&] { pane->UpdateTextEdit(); }).empty());
 }
 
-// Sets the field's text when it is pressed.
-class Setting : public GlogPane {
+// Does something to the field when it is pressed.
+class Pressed : public GlogPane {
 public:
-    Setting(glogRec *owner, GTextPane &field_, SimulatedDesktop &desktop_)
-        : field(field_)
-        , desktop(desktop_) {
+    Pressed(glogRec *owner, std::function<void()> act_)
+        : act(std::move(act_)) {
         GlogPaneInit(owner, 0);
         Rect box = {100, 20, 120, 60};
         SetBox(&box);
     }
     void DrawGuts(OSRgn *) override {}
     int HandleClick(EventRecordAdapter *) override {
-        desktop.TakeDrawing();
-        field.SetText(UString("Drums", UString::kByteEncoding1));
-        drawing = desktop.TakeDrawing();
+        act();
         return -1;
     }
-    GTextPane &field;
-    SimulatedDesktop &desktop;
-    std::vector<std::string> drawing;
+
+private:
+    std::function<void()> act;
 };
 
-TEST_F(GTextPaneColors, WithoutItsGroundATextIsDrawnAtOnceOnlyWhileItIsSelected) {
+class GTextPaneAtOnce : public GTextPaneColors {
+protected:
+    // The calls of drawing at once while the field gets the text; what is damaged may be drawn as well.
+    Lines DrawnAtOnce(OpenTextField &pane, char const *text) {
+        desktop.TakeDrawing();
+        pane.SetText(Text(text));
+        return Only("ClipRect", desktop.TakeDrawing());
+    }
+    std::string const heldDown = "press 30 110\nwait 1\nrelease";
+};
+
+TEST_F(GTextPaneAtOnce, ATextThatIsSetWhileTheButtonIsDownIsDrawnAtOnce) {
     OpenTextField *const pane = Make(Bass());
-    Setting *const setting = new Setting(glog, *pane, desktop);
-    pane->DrawBackgroundWhenNotSelected(false);
-    desktop.Play("press 30 110");
-    EXPECT_TRUE(Only("DrawTextEdit", setting->drawing).empty());
-    EXPECT_EQ(pane->GetText(), Text("Drums"));
-    pane->SetText(Text("Bass"));
-    desktop.Play("release");
-    class Selecting : public Setting {
+    Lines held;
+    new Pressed(glog, [&] { held = DrawnAtOnce(*pane, "Drums"); });
+    desktop.Play(heldDown);
+    ASSERT_EQ(held.size(), 1u);
+    EXPECT_NE(held[0].find("[20,20,36,200]"), std::string::npos) << held[0];
+    EXPECT_TRUE(DrawnAtOnce(*pane, "Bass").empty()) << "the button is up";
+}
+
+TEST_F(GTextPaneAtOnce, TheTextThatItHasIsNotDrawnAgain) {
+    OpenTextField *const pane = Make(Bass());
+    Lines held;
+    new Pressed(glog, [&] { held = DrawnAtOnce(*pane, "Bass"); });
+    desktop.Play(heldDown);
+    EXPECT_TRUE(held.empty());
+}
+
+TEST_F(GTextPaneAtOnce, ATextThatIsDrawnAtOnceIsRepaintedToo) {
+    class Counting : public OpenTextField {
     public:
-        using Setting::Setting;
-        int HandleClick(EventRecordAdapter *event) override {
-            field.Select(true);
-            return Setting::HandleClick(event);
+        void Inval() override {
+            ++invalidations;
+            OpenTextField::Inval();
         }
+        int invalidations = 0;
     };
-    delete setting;
-    Selecting *const selecting = new Selecting(glog, *pane, desktop);
-    desktop.Play("press 30 110");
-    EXPECT_EQ(Only("DrawTextEdit", selecting->drawing).size(), 1u);
+    Counting *const pane = new Counting;
+    TestItem item = Bass().Box("BoundsRect", {20, 20, 36, 200});
+    ASSERT_EQ(pane->InitGTextPane(glog, item.Sheet(), nullptr, nullptr), pane);
+    Show();
+    desktop.Play("");
+    pane->invalidations = 0;
+    pane->SetText(Text("Drums"));
+    EXPECT_EQ(pane->invalidations, 0) << "the engine has done it";
+    new Pressed(glog, [&] { pane->SetText(Text("Bass")); });
+    desktop.Play(heldDown);
+    EXPECT_EQ(pane->invalidations, 1);
+}
+
+TEST_F(GTextPaneAtOnce, WithoutItsGroundATextIsDrawnAtOnceOnlyWhileItIsSelected) {
+    OpenTextField *const pane = Make(Bass());
+    pane->DrawBackgroundWhenNotSelected(false);
+    Lines unselected, selected;
+    new Pressed(glog, [&] {
+        unselected = DrawnAtOnce(*pane, "Drums");
+        pane->Select(true);
+        selected = DrawnAtOnce(*pane, "Bass");
+    });
+    desktop.Play(heldDown);
+    EXPECT_TRUE(unselected.empty());
+    EXPECT_EQ(selected.size(), 1u);
+    EXPECT_EQ(pane->GetText(), Text("Bass"));
+}
+
+TEST_F(GTextPaneAtOnce, ItIsDrawnInItsOwnPortAndTheFormerOneComesBack) {
+    OpenTextField *const pane = Make(Bass());
+    RGBColor const red = {0xFFFF, 0, 0}, blue = {0, 0, 0xFFFF};
+    pane->SetColors(red, blue);
+    LeaveForAnotherPort();
+    pane->UpdateTextEdit();
+    EXPECT_FALSE(IsInItsPort());
+    EXPECT_EQ(PixelAt(190, 28), PixelOf(blue));
 }
 
 } // namespace

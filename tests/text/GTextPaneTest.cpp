@@ -129,9 +129,17 @@ TEST_F(GTextPaneTest, ARectanglesItemGoesIntoTheGlogsOwnSheet) {
     GTextPane::NewGTextPane(other, 12, &rect, Text("Take"), nullptr);
     ASSERT_TRUE(sheet->GetItemRes());
     EXPECT_EQ(sheet->GetUStringItemValue(Text("GlogItemType")), Text("GText"));
-    EXPECT_EQ(sheet->GetSInt32ItemValue(Text("FirstLineOffset")), -1);
-    EXPECT_EQ(sheet->GetSInt32ItemValue(Text("BoxIt")), 1);
-    EXPECT_EQ(sheet->GetSInt32ItemValue(Text("FrameOffset")), -2);
+    EXPECT_EQ(XMLLib::GetRect(sheet->GetItemRes(), Text("BoundsRect")), rect);
+    struct {
+        char const *key;
+        int value;
+    } const numbers[] = {{"FSRID", 0},    {"Align", 0},       {"FirstLineOffset", -1}, {"BoxIt", 1},
+                         {"NoTabIn", 0},  {"RetOnClick", 0},  {"RetOnModify", 0},      {"MultiLine", 0},
+                         {"ReadOnly", 0}, {"AutoScroll", 0},  {"NotSelectable", 0},    {"UseSavedColors", 0},
+                         {"TextWell", 1}, {"FrameOffset", -2}};
+    for (auto const &number : numbers)
+        EXPECT_EQ(sheet->GetSInt32ItemValue(Text(number.key)), number.value) << number.key;
+    EXPECT_EQ(sheet->GetUStringItemValue(Text("InitTextID")), UString()) << "the text is given apart";
 }
 
 TEST_F(GTextPaneTest, ARectangleWithoutAGlogIsAFailure) {
@@ -442,35 +450,6 @@ TEST_F(GTextPaneTest, SettingATextTellsNobody) {
     EXPECT_TRUE(Repainted().empty());
 }
 
-TEST_F(GTextPaneTest, ATextThatIsSetWhileTheMouseIsDownIsDrawnAtOnce) {
-    class Setting : public GlogPane {
-    public:
-        Setting(glogRec *owner, GTextPane &field_, SimulatedDesktop &desktop_)
-            : field(field_)
-            , desktop(desktop_) {
-            GlogPaneInit(owner, 0);
-            Rect box = {100, 20, 120, 60};
-            SetBox(&box);
-        }
-        void DrawGuts(OSRgn *) override {}
-        int HandleClick(EventRecordAdapter *) override {
-            desktop.TakeDrawing();
-            field.SetText(UString("Bass", UString::kByteEncoding1));
-            drawing = desktop.TakeDrawing();
-            return -1;
-        }
-        GTextPane &field;
-        SimulatedDesktop &desktop;
-        Lines drawing;
-    };
-    OpenTextField *const pane = Make();
-    Setting *const setting = new Setting(glog, *pane, desktop);
-    desktop.Play("press 30 110");
-    EXPECT_EQ(Only("DrawTextEdit", setting->drawing).size(), 1u);
-    pane->SetText(Text("Drums"));
-    EXPECT_TRUE(Only("DrawTextEdit", desktop.TakeDrawing()).empty());
-}
-
 // Styles
 
 TEST_F(GTextPaneTest, RunsStylePartsOfTheTextInTheirOrder) {
@@ -734,8 +713,9 @@ TEST_F(GTextPaneTest, ABlankFieldErasesWithinItsWell) {
 
 TEST_F(GTextPaneTest, InModeTwoNothingIsDrawnOutsideOfTheRegion) {
     OpenTextField *const pane = Make();
-    pane->SetMode(2);
     OSRgn far(Rect{100, 100, 120, 120}), near(Rect{20, 20, 30, 30});
+    EXPECT_EQ(Only("DrawTextEdit", Traced(*pane, [&] { pane->_Draw_(&far, 0); })).size(), 1u);
+    pane->SetMode(2);
     EXPECT_TRUE(Only("DrawTextEdit", Traced(*pane, [&] { pane->_Draw_(&far, 0); })).empty());
     EXPECT_EQ(Only("DrawTextEdit", Traced(*pane, [&] { pane->_Draw_(&near, 0); })).size(), 1u);
     EXPECT_EQ(Only("DrawTextEdit", Traced(*pane, [&] { pane->_Draw_(nullptr, 0); })).size(), 1u);
@@ -784,6 +764,24 @@ TEST_F(GTextPaneTest, TheCharacterUnderAPointIsFoundInItsCoordinates) {
     OpenTextField *const pane = Make(TestItem().String("InitTextID", "mmmm").Integer("BoxIt", 1));
     EXPECT_EQ(pane->GetCharacterIndexForPoint(OS::Point(23, 25)), 0u);
     EXPECT_EQ(pane->GetCharacterIndexForPoint(OS::Point(40, 25)), 1u);
+}
+
+TEST_F(GTextPaneTest, TheCharacterUnderAPointIsFoundWhereverItsContainerLies) {
+    CompoundPane *const container = new CompoundPane;
+    container->CompoundPaneInit(glog, 0);
+    Rect box = {0, 0, 200, 300};
+    container->SetBox(&box);
+    OpenTextField *const pane = Make(TestItem().Integer("MultiLine", 1));
+    Rect high = {20, 20, 100, 200};
+    pane->SetBox(&high);
+    pane->SetText(Text("mm\nmm\nmm"));
+    container->Add(pane, -1);
+    container->Offset({50, 30});
+    int const line = pane->GetScrollDelta();
+    for (int row = 0; row < 3; ++row)
+        EXPECT_EQ(pane->GetCharacterIndexForPoint(OS::Point(21, 20 + row * line + line / 2)),
+                  static_cast<unsigned int>(3 * row))
+            << row;
 }
 
 TEST_F(GTextPaneTest, FollowsItsContainer) {
