@@ -1,6 +1,7 @@
 #include "text/TextEditPane.h"
 #include "host/PaneWatch.h"
 #include "tests/PaneTest.h"
+#include "tests/text/ClosingWindow.h"
 #include <limits>
 
 namespace {
@@ -187,25 +188,12 @@ TEST_F(TextEditPaneTest, AListenerMayDeleteItWhenItHasScrolled) {
     EXPECT_FALSE(watch.PaneExists());
 }
 
-// What a window tells its panes when it closes.
-class Closing : public DependentCastMessenger<TarnOSWindow::OSWindow_PlatformWindowListener> {
-public:
-    explicit Closing(glogRec &window_)
-        : window(window_) {}
-    void BroadcastChange(TarnOSWindow::OSWindow_PlatformWindowListener *listener) override {
-        listener->PlatformWindow_Closing(window);
-    }
-
-private:
-    glogRec &window;
-};
-
 TEST_F(TextEditPaneTest, LeavesAWindowThatClosesAndComesBackWithTheOneThatOpens) {
     glogRec *const late = desktop.NewGlog(GlogOptions().Size(200, 100));
     TextEditPane *const other = new TextEditPane(late, 8, 0);
     Rect box = {10, 10, 30, 110};
     other->SetBox(&box);
-    late->BroadcastChange(Closing(*late), nullptr);
+    late->BroadcastChange(ClosingWindow(*late), nullptr);
     EXPECT_EQ(other->GetGlog(), nullptr);
     ShowGlog(late, kShowGlog);
     EXPECT_EQ(other->GetGlog(), late);
@@ -214,6 +202,112 @@ TEST_F(TextEditPaneTest, LeavesAWindowThatClosesAndComesBackWithTheOneThatOpens)
     other->GetTextEdit().SetText(Text("a"));
     UpdateGlog(late);
     EXPECT_FALSE(desktop.TakePresented(late).empty()) << "its engine has no window";
+}
+
+TEST_F(TextEditPaneTest, WithoutItsWindowItsEngineRepaintsNothing) {
+    SetText("Bass");
+    EXPECT_FALSE(Repainted().empty());
+    glog->BroadcastChange(ClosingWindow(*glog), nullptr);
+    Repainted();
+    SetText("Drums");
+    EXPECT_TRUE(Repainted().empty());
+}
+
+TEST_F(TextEditPaneTest, InAWindowThatShowsAlreadyItsEngineIsShownAtOnce) {
+    TextEditPane *const late = new TextEditPane(glog, 8, 0);
+    Rect box = {80, 20, 100, 120};
+    late->SetBox(&box);
+    Repainted();
+    late->GetTextEdit().SetText(Text("a"));
+    EXPECT_EQ(Repainted(), std::vector<Rect>{box});
+}
+
+TEST_F(TextEditPaneTest, ItsFlagsGoToTheEngineAsTheyAre) {
+    unsigned int const kSeveralLines = 2, kReadOnly = 4, kNoAutoScroll = 8;
+    auto const typedInto = [&](unsigned int flags) {
+        TextEditPane *const made = new TextEditPane(glog, 8, flags);
+        Rect box = {80, 20, 100, 120};
+        made->SetBox(&box);
+        ear.scrolls = 0;
+        ear.DependUpon(made);
+        made->BeginEditing();
+        desktop.Play("type \"a text that is wider than the pane\"\nkey Return\ntype \"b\"");
+        UString const text = made->GetTextEdit().GetText();
+        delete made;
+        return text;
+    };
+    EXPECT_EQ(typedInto(0), Text("a text that is wider than the paneb"));
+    EXPECT_GT(ear.scrolls, 0);
+    EXPECT_EQ(typedInto(kNoAutoScroll), Text("a text that is wider than the paneb"));
+    EXPECT_EQ(ear.scrolls, 0);
+    EXPECT_EQ(typedInto(kSeveralLines), Text("a text that is wider than the pane\nb"));
+    EXPECT_EQ(typedInto(kReadOnly), UString());
+}
+
+// Notes its invalidations, and knows how often its place has changed.
+class CountingEdit : public TextEditPane {
+public:
+    using TextEditPane::TextEditPane;
+    void Inval() override {
+        Rect box;
+        GetBox(&box);
+        invalidated.push_back(box);
+        TextEditPane::Inval();
+    }
+    void PanePositionChanged() override {
+        ++moves;
+        TextEditPane::PanePositionChanged();
+    }
+    std::vector<Rect> invalidated;
+    int moves = 0;
+};
+
+TEST_F(TextEditPaneTest, AnotherOffsetRepaintsNothing) {
+    CountingEdit *const edit = new CountingEdit(glog, 8, 0);
+    int const moves = edit->moves;
+    edit->SetFractionalOffset(OS::Point(0.5, 1.5), OS::Size(-1, -2));
+    EXPECT_EQ(edit->moves, moves + 1);
+    EXPECT_TRUE(edit->invalidated.empty());
+}
+
+TEST_F(TextEditPaneTest, InvalidatesTheBoxBeforeAndAfterItsBoundsAreSet) {
+    CountingEdit *const edit = new CountingEdit(glog, 8, 0);
+    edit->SetFractionalBounds(PlaneRect(10.25, 20, 5.5, 8));
+    EXPECT_EQ(edit->invalidated, (std::vector<Rect>{{0, 0, 0, 0}, {20, 10, 28, 16}}));
+}
+
+TEST_F(TextEditPaneTest, AnotherFractionInTheSamePixelsMovesTheEngine) {
+    pane->SetFractionalBounds(PlaneRect(10.25, 20, 5.5, 8));
+    pane->SetFractionalBounds(PlaneRect(10.5, 20.5, 5, 7.25));
+    EXPECT_EQ(BoxOf(*pane), (Rect{20, 10, 28, 16}));
+    EXPECT_TRUE(Same(pane->GetTextEdit().GetBounds(), PlaneRect(10.5, 20.5, 5, 7.25)));
+}
+
+TEST_F(TextEditPaneTest, TheEngineLiesInTheWindowWhereverTheContainerIs) {
+    CompoundPane *const container = new CompoundPane;
+    container->CompoundPaneInit(glog, 0);
+    Rect all = {0, 0, 200, 300};
+    container->SetBox(&all);
+    container->Add(pane, -1);
+    container->Offset({50, 30});
+    EXPECT_TRUE(Same(pane->GetTextEdit().GetBounds(), PlaneRect(20 + 30, 20 + 50, 100, 40)));
+    pane->SetFractionalBounds(PlaneRect(10.25, 20, 5.5, 8));
+    EXPECT_TRUE(Same(pane->GetTextEdit().GetBounds(), PlaneRect(10.25 + 30, 20 + 50, 5.5, 8)));
+}
+
+TEST_F(TextEditPaneTest, ItsSubpanesHearThatItsPlaceHasChanged) {
+    class Hearing : public GlogPane {
+    public:
+        void DrawGuts(OSRgn *) override {}
+        void PanePositionChanged() override { ++moves; }
+        int moves = 0;
+    };
+    Hearing *const hearing = new Hearing;
+    hearing->GlogPaneInit(glog, 0);
+    pane->Add(hearing, -1);
+    hearing->moves = 0;
+    pane->SetFractionalOffset(OS::Point(0.5, 0.5), OS::Size(0, 0));
+    EXPECT_EQ(hearing->moves, 1);
 }
 
 } // namespace
