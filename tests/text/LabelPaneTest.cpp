@@ -1,6 +1,5 @@
 #include "text/LabelPane.h"
 #include "desktop/drawing/DrawingPort.h"
-#include "desktop/panes/PaneAccess.h"
 #include "desktop/type/FontFamilies.h"
 #include "host/CompoundPane.h"
 #include "host/NamedColors.h"
@@ -11,6 +10,7 @@
 #include "host/VelaDrawing.h"
 #include "tests/PaneTest.h"
 #include "tests/VirtualPlace.h"
+#include "tests/text/WatchedItem.h"
 #include <type_traits>
 
 namespace {
@@ -60,38 +60,6 @@ public:
     using LabelPaneImplementation::GetTextOrigin;
     void DontMakeConcrete() override {}
 };
-
-// A pane's layout item that writes down what it is told.
-class WatchedItem : public GlogLayoutRectItem {
-public:
-    struct Told {
-        int attribute, value, type;
-        bool emptyText;
-        bool operator==(Told const &b) const {
-            return attribute == b.attribute && value == b.value && type == b.type && emptyText == b.emptyText;
-        }
-    };
-    typedef std::vector<Told> Tolds;
-
-    // Puts a new one in the place of the pane's own.
-    static WatchedItem &PutInto(GlogPane &pane) {
-        WatchedItem *const item = new WatchedItem;
-        PaneAccess::Rep(pane).layoutItem = RCPtr<GlogLayoutRectItem>(item);
-        return *item;
-    }
-    void SetAttribute(Attribute attribute, int value, CoordinateType type, UString const &text) override {
-        told.push_back({attribute, value, type, text.empty()});
-        GlogLayoutRectItem::SetAttribute(attribute, value, type, text);
-    }
-    Tolds told;
-};
-
-std::ostream &operator<<(std::ostream &out, WatchedItem::Told const &told) {
-    return out << "attribute " << told.attribute << " = " << told.value << " of type " << told.type;
-}
-
-// What layout items know natural sizes by.
-int const kNaturalWidth = 3, kNaturalHeight = 4, kInPixels = 1;
 
 class Label : public PaneTest {
 protected:
@@ -625,6 +593,24 @@ TEST_F(Label, SetsThePortsFontOnlyWhereItDiffers) {
     EXPECT_TRUE(Only("TextSize", lines).empty());
 }
 
+TEST_F(Label, SetsThePortsFontAlsoWhereNothingIsMeasured) {
+    label->SetFontFSRID(9);
+    fontSaveRec const other = {OtherFamily(), 1, 33};
+    label->Prepare();
+    SetFontData(&other);
+    desktop.TakeDrawing();
+    label->DrawGuts(nullptr);
+    Lines const lines = desktop.TakeDrawing();
+    auto const placeOf = [&](char const *call) {
+        for (std::size_t i = 0; i < lines.size(); ++i)
+            if (!Only(call, {lines[i]}).empty())
+                return i;
+        return lines.size();
+    };
+    for (char const *call : {"TextFont", "TextFace", "TextSize"})
+        EXPECT_LT(placeOf(call), placeOf("DrawStringAtPoint")) << call;
+}
+
 TEST_F(Label, SetsThatPartOfThePortsFontAloneThatDiffers) {
     fontSaveRec const own = {OtherFamily(), 1, 17};
     label->SetFont(own);
@@ -843,6 +829,14 @@ TEST_F(Label, ALineSpacingOfZeroIsToldAndFollowsTheFontFromThenOn) {
     EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalHeight, 20, kInPixels, true},
                                              {kNaturalHeight, 0, kInPixels, true},
                                              {kNaturalHeight, 23, kInPixels, true}}));
+}
+
+TEST_F(Label, TellsItsLayoutItemTheLineSpacingThatItHasAlready) {
+    WatchedItem &item = WatchedItem::PutInto(*label);
+    label->SetLineSpacing(20);
+    label->SetLineSpacing(20);
+    EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalHeight, 20, kInPixels, true},
+                                             {kNaturalHeight, 20, kInPixels, true}}));
 }
 
 TEST_F(LabelInLayout, TellsTheItemWhatDiffersFromTheBoxThatTheLayoutGave) {

@@ -6,6 +6,7 @@
 #include "host/VelaDrawing.h"
 #include "tests/LibraryExports.h"
 #include "tests/PaneTest.h"
+#include "tests/text/WatchedItem.h"
 
 namespace {
 
@@ -147,4 +148,63 @@ TEST_F(MultiStringTest, RepaintsOldAndNewAreaAndNothingForTheStringThatShows) {
     EXPECT_EQ(Repainted(), std::vector<Rect>());
     pane->SelectString(2);
     EXPECT_EQ(Repainted(), std::vector<Rect>{box});
+}
+
+TEST_F(MultiStringTest, TellsItsLayoutItemTheHeightOfTheLineAndEachNewWidth) {
+    MultiStringPane *const pane = New();
+    WatchedItem &told = WatchedItem::PutInto(*pane);
+    pane->GetFromXML(item.Sheet());
+    EXPECT_EQ(told.told, (WatchedItem::Tolds{{kNaturalHeight, 23, kInPixels, true}}));
+    EXPECT_EQ(pane->CountStrings(), 6U) << "those of the sheet once more";
+    told.told.clear();
+    for (int index : {1, 1, 0, 0})
+        pane->SelectString(index);
+    EXPECT_EQ(told.told, (WatchedItem::Tolds{{kNaturalWidth, WidthOf("Playing back"), kInPixels, true},
+                                             {kNaturalWidth, WidthOf("Stopped"), kInPixels, true}}));
+}
+
+TEST_F(MultiStringTest, ChoosingAndDrawingLeaveThePortsFont) {
+    MultiStringPane *const pane = New();
+    pane->Prepare();
+    SetFontData(GetIndVelaFont(0));
+    int const before = LooseStringWidth(Text("Recording"), 0.0f, 1.0f);
+    ASSERT_NE(before, WidthOf("Recording"));
+    pane->SelectString(2);
+    EXPECT_EQ(LooseStringWidth(Text("Recording"), 0.0f, 1.0f), before);
+    (pane->*&Opened<MultiStringPane>::DrawGuts)(nullptr);
+    EXPECT_EQ(LooseStringWidth(Text("Recording"), 0.0f, 1.0f), before);
+}
+
+TEST_F(MultiStringTest, ItsFontFollowsTheRuleOfItsKey) {
+    struct {
+        int id, font;
+    } const cases[] = {{9, 9}, {30, 0}, {31, 1}, {12, 0}, {0x107, 7}};
+    for (auto const &c : cases) {
+        TestItem odd;
+        odd.Integer("FSRID", c.id);
+        odd.Container()->AddItem(Text("TextList"), list);
+        MultiStringPane *const pane = MultiStringPane::NewMultiStringPane(glog, 6, odd.Sheet());
+        WatchedItem &told = WatchedItem::PutInto(*pane);
+        pane->SelectString(2);
+        SaveTextState const state;
+        SetFontData(GetIndVelaFont(c.font));
+        ASSERT_EQ(told.told.size(), 1U);
+        EXPECT_EQ(told.told[0].value, LooseStringWidth(Text("Recording"), 0.0f, 1.0f)) << c.id;
+    }
+}
+
+TEST_F(MultiStringTest, InALayoutRepaintsTheWidthBeforeAndTheWidthAfter) {
+    MultiStringPane *const pane = NewInLayout();
+    pane->SelectString(0);
+    Show();
+    auto const repaintedUpTo = [&] {
+        short right = 0;
+        for (Rect const &r : Repainted())
+            right = std::max(right, r.right);
+        return int(right);
+    };
+    pane->SelectString(1);
+    EXPECT_GE(repaintedUpTo(), WidthOf("Playing back"));
+    pane->SelectString(0);
+    EXPECT_GE(repaintedUpTo(), WidthOf("Playing back")) << "what showed beyond the shorter string";
 }

@@ -482,4 +482,58 @@ TEST_F(SearchFieldPaneTest, AClickIntoTheTextIsAnsweredAsTheTextDoes) {
         << "on the mark";
 }
 
+// In which order
+
+// Writes down its invalidations among the messages.
+class NotingField : public OpenSearchField, public SearchFieldPane_Listener {
+public:
+    NotingField() { DependUpon(this); }
+    void Inval() override {
+        done.push_back("Inval");
+        OpenSearchField::Inval();
+    }
+    void TextChanged(UString const &) override { done.push_back("Text"); }
+    void SearchIsCanceled() override { done.push_back("Canceled"); }
+    Heard Take() {
+        Heard taken;
+        taken.swap(done);
+        return taken;
+    }
+
+private:
+    Heard done;
+};
+
+TEST_F(SearchFieldPaneTest, EscapeAndTheButtonRepaintBeforeAndAfterTheSearchIsGivenUp) {
+    NotingField *const pane = new NotingField;
+    pane->Init(glog);
+    Resize(*pane, 200);
+    Show();
+    desktop.Play("");
+    Heard const expected = {"Inval", "Canceled", "Inval"};
+    pane->Take();
+    EventRecordAdapter escape;
+    escape.what = 3;
+    escape.message = 27;
+    TextOf(*pane).Key(&escape);
+    EXPECT_EQ(pane->Take(), expected);
+    desktop.Play(PressOnButton(*pane) + "release");
+    EXPECT_EQ(pane->Take(), expected);
+    pane->SearchTextChanged(U("x"));
+    EXPECT_EQ(pane->Take(), (Heard{"Text"})) << "the button is not all of the field";
+}
+
+TEST_F(SearchFieldPaneTest, TheButtonIsInvalidatedInTheFieldsOwnPort) {
+    OpenSearchField *const pane = Make(300);
+    LeaveForAnotherPort();
+    pane->SearchTextChanged(U("x"));
+    EXPECT_TRUE(IsInItsPort());
+    EXPECT_EQ(Repainted(), (std::vector<Rect>{{kTop, kLeft + 280, kTop + 20, kLeft + 300}}));
+}
+
+TEST_F(SearchFieldPaneTest, WhatItOverridesStandsInItsOrder) {
+    ExpectInOrder(kAfterDestructor, &SearchFieldPane::Select, &SearchFieldPane::SetBox,
+                  &OpenSearchField::HandleClick, &OpenSearchField::DrawBackgroundGuts);
+}
+
 } // namespace

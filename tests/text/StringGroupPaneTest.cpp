@@ -176,6 +176,7 @@ TEST_F(StringGroupTest, InALayoutDrawsEachTextInTheItemOfItsOwn) {
 TEST_F(StringGroupTest, EachStringIsAPartOfItsOwnUnderThePanesName) {
     StringGroupPane *const pane = NewPair();
     ASSERT_EQ(pane->NumLayoutSubItems(), 2);
+    EXPECT_TRUE(PaneAccess::Rep(*pane).subItemMode);
     short const ascent = AscentOf(0);
     struct {
         Point origin;
@@ -184,6 +185,7 @@ TEST_F(StringGroupTest, EachStringIsAPartOfItsOwnUnderThePanesName) {
     for (int i = 0; i < 2; ++i) {
         GlogLayoutRectItem &part = *PaneAccess::Rep(*pane).subItems[static_cast<std::size_t>(i)];
         EXPECT_EQ(LayoutEngine::Rep(part).index, i);
+        EXPECT_EQ(LayoutEngine::Rep(part).Rest().id, -1);
         EXPECT_EQ(std::string(part.GetName()), pane->GetLayoutRect()->GetName());
         short const top = static_cast<short>(strings[i].origin.v - ascent), left = strings[i].origin.h;
         EXPECT_EQ(part.GetBorderRect(), (Rect{top, left, static_cast<short>(top + kSpacing),
@@ -201,5 +203,74 @@ TEST_F(StringGroupTest, ALineSpacingBeyondSixteenBitsEndsThere) {
         odd.Container()->AddItem(Text("TextList"), list);
         Rect const box = BoxOf(*StringGroupPane::NewStringGroupPane(glog, 5, odd.Sheet()));
         EXPECT_EQ(box.bottom, spacing > 0 ? 32767 : -10000) << "what uniting begins with";
+    }
+}
+
+TEST_F(StringGroupTest, DrawsItsStringsWhereTheyWereMoved) {
+    StringGroupPane *const pane = NewPair();
+    Rect const before = BoxOf(*pane);
+    Rect wanted = {static_cast<short>(before.top + 7), static_cast<short>(before.left - 3), 500, 600};
+    pane->SetBox(&wanted);
+    EXPECT_EQ(pane->GetBounds(), wanted) << "the size is ignored by the strings alone";
+    short const top = wanted.top, bottom = static_cast<short>(top + kSpacing);
+    Rect const first = {top, wanted.left, bottom, 0};
+    Rect const second = {static_cast<short>(top + 40), static_cast<short>(24 - 3),
+                         static_cast<short>(bottom + 40), 0};
+    EXPECT_EQ(Only("DrawStringAtPoint", DrawingOf(*pane)),
+              Only("DrawStringAtPoint",
+                   DrawnAt(*pane, {{"Attack", StartIn(first)}, {"Release", StartIn(second)}})));
+}
+
+TEST_F(StringGroupTest, HalvesAscentAndHeightOneByOne) {
+    int odd = -1;
+    for (int font = 0; font <= 9 && odd < 0; ++font)
+        if (AscentOf(font) % 2 != 0)
+            odd = font;
+    ASSERT_GE(odd, 0) << "no font has an odd ascent";
+    static_assert(kSpacing % 2 != 0, "the height has to be odd too");
+    short const ascent = AscentOf(odd);
+    Add({"Attack", true, {30, 20}});
+    StringGroupPane *const pane = New(odd);
+    Point const start = {static_cast<short>(30 - ascent + ascent / 2 + kSpacing / 2), 20};
+    Lines const drawn = DrawingOf(*pane);
+    Lines const expected = Traced(*pane, [&] {
+        SaveTextState const textState;
+        SaveColors const colors;
+        SetFontData(GetIndVelaFont(odd));
+        VelaDrawing::RGBForeColor(kDialogActiveTextColor);
+        DrawStringAtPoint(Text("Attack"), start, -1, TextSettings::kTruncateNone);
+    });
+    EXPECT_EQ(Only("DrawStringAtPoint", drawn), Only("DrawStringAtPoint", expected));
+}
+
+TEST_F(StringGroupTest, WithoutStringsLeavesThePortsFont) {
+    SetPortToGlog(glog);
+    SetFontData(GetIndVelaFont(0));
+    StringGroupPane *const pane = New(7);
+    EXPECT_EQ(LooseStringWidth(Text("Attack"), 0.0f, 1.0f), WidthOf("Attack", 0));
+    EXPECT_EQ(pane->CountStrings(), 0U);
+}
+
+TEST_F(StringGroupTest, DrawingLeavesThePortsFont) {
+    Add({"Attack", true, {30, 20}});
+    StringGroupPane *const pane = New(7);
+    pane->Prepare();
+    SetFontData(GetIndVelaFont(0));
+    (pane->*&Opened<StringGroupPane>::DrawGuts)(nullptr);
+    EXPECT_EQ(LooseStringWidth(Text("Attack"), 0.0f, 1.0f), WidthOf("Attack", 0));
+}
+
+TEST_F(StringGroupTest, ItsFontFollowsTheRuleOfItsKey) {
+    Add({"Attack", true, {0, 0}});
+    struct {
+        int id, font;
+    } const cases[] = {{9, 9}, {30, 0}, {31, 1}, {12, 0}, {0x107, 7}};
+    for (auto const &c : cases) {
+        TestItem odd;
+        odd.Integer("FSRID", c.id);
+        odd.Container()->AddItem(Text("TextList"), list);
+        EXPECT_EQ(BoxOf(*StringGroupPane::NewStringGroupPane(glog, 5, odd.Sheet())).right,
+                  WidthOf("Attack", c.font))
+            << c.id;
     }
 }

@@ -5,6 +5,7 @@
 #include "host/TextLayout.h"
 #include "host/VelaDrawing.h"
 #include "tests/PaneTest.h"
+#include "tests/text/WatchedItem.h"
 #include <algorithm>
 #include <memory>
 
@@ -291,4 +292,52 @@ TEST_F(StyledStringTest, WithoutALineSpacingIsAsHighAsItsBoxInALayout) {
     Show();
     Rect const place = pane->GetLayoutRect()->GetItemRect();
     EXPECT_EQ(place.bottom - place.top, 50) << "a height of 0 takes the one before away";
+}
+
+TEST_F(StyledStringTest, TellsItsLayoutItemWidthAndHeightOnceItHasAText) {
+    GiveSheet(18, 4);
+    StyledStringPane *const pane = New({10, 20, 40, 200});
+    WatchedItem &item = WatchedItem::PutInto(*pane);
+    pane->CalcBox();
+    pane->AdoptStyledString(AutoPtr<StyledString>());
+    EXPECT_TRUE(item.told.empty());
+    pane->AdoptStyledStringItem(Part("Level"));
+    EXPECT_EQ(item.told, (WatchedItem::Tolds{{kNaturalWidth, WidthOf("Level"), kInPixels, true},
+                                             {kNaturalHeight, 18, kInPixels, true}}));
+}
+
+TEST_F(StyledStringTest, RepaintsWhereItWasBeforeItFollowsTheWindow) {
+    class Noting : public StyledStringPane {
+    public:
+        using StyledStringPane::StyledStringPane;
+        void Inval() override { invalidated.push_back(GetBounds()); }
+        void SetBox(Rect *box) override {
+            ++boxes;
+            StyledStringPane::SetBox(box);
+        }
+        std::vector<Rect> invalidated;
+        int boxes = 0;
+    };
+    Noting *const pane = new Noting(glog, 3, true);
+    Rect const before = {10, 20, 40, 200};
+    Rect box = before;
+    pane->SetBox(&box);
+    Rect wider = {0, 0, 200, 500};
+    PositionGlog(glog, &wider, false);
+    pane->invalidated.clear();
+    pane->boxes = 0;
+    pane->AdoptStyledStringItem(Part("Level"));
+    EXPECT_EQ(pane->invalidated, std::vector<Rect>{before});
+    EXPECT_EQ(pane->boxes, 1);
+    EXPECT_EQ(BoxOf(*pane), (Rect{10, 20, 40, 380}));
+}
+
+TEST_F(StyledStringTest, InTheMiddleOfABoxThatIsTooNarrowHalvesTowardZero) {
+    int const width = WidthOf("Level");
+    for (short right : {short(0), short(1)}) {
+        StyledStringPane *const pane = New({10, 0, 40, right});
+        pane->AdoptStyledStringItem(Part("Level"));
+        EXPECT_EQ(DrawnAligned(*pane, StyledStringPane::kCentre),
+                  Pen(*pane, -((width - right) / 2), 10 + AscentOf(0)));
+    }
 }

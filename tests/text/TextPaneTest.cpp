@@ -4,6 +4,7 @@
 #include "host/NamedColors.h"
 #include "host/VelaDrawing.h"
 #include "tests/PaneTest.h"
+#include "tests/text/WatchedItem.h"
 
 namespace {
 
@@ -202,4 +203,79 @@ TEST_F(TextPaneTest, InALayoutIsAsWideAsItsTextOrItsRectangle) {
     text->SetText(Text("One more"));
     UpdateGlog(glog);
     EXPECT_EQ(text->GetLayoutRect()->GetItemRect().right, text->GetTextWidth());
+}
+
+TEST_F(TextPaneTest, FromAnItemHasTheNumberZero) { EXPECT_EQ(New(Item())->GetID(), 0); }
+
+TEST_F(TextPaneTest, AnyNumberButZeroWrapsAndSizes) {
+    for (int value : {1, 2, -1}) {
+        EXPECT_TRUE(Says(Drawn(*New(Item().Integer("WrapText", value))), "\"wrap\":1")) << value;
+        EXPECT_TRUE(New(Item().Integer("SizeToText", value))->GetSizeToText()) << value;
+    }
+    EXPECT_FALSE(New(Item().Integer("SizeToText", 0))->GetSizeToText());
+}
+
+TEST_F(TextPaneTest, TellsItsLayoutItemTheNewWidthBetweenTwoInvalidations) {
+    class Watched : public TextPane {
+    public:
+        using TextPane::TextPane;
+        void Inval() override { toldByThen.push_back(item ? item->told.size() : 0); }
+        WatchedItem *item = nullptr;
+        std::vector<std::size_t> toldByThen;
+    };
+    Watched *const pane = new Watched(glog, Text("A"), TextSettings::kAlignLeft, false);
+    pane->item = &WatchedItem::PutInto(*pane);
+    pane->SetText(Text("Take 1"));
+    EXPECT_TRUE(pane->item->told.empty());
+    pane->SetSizeToText(true);
+    pane->toldByThen.clear();
+    pane->SetText(Text("Take 2, longer"));
+    EXPECT_EQ(pane->item->told, (WatchedItem::Tolds{{kNaturalWidth, pane->GetTextWidth(), kInPixels, true}}));
+    EXPECT_EQ(pane->toldByThen, (std::vector<std::size_t>{0, 1}));
+}
+
+TEST_F(TextPaneTest, InALayoutKeepsTheWidthOfItsItem) {
+    CompoundPane *const column = new CompoundPane;
+    column->CompoundPaneInit(glog, 1);
+    Rect all = {0, 0, 200, 300}, wide = {0, 0, 20, 250};
+    column->SetBox(&all);
+    column->SetUseLayout(true);
+    TextPane *const boxed = New(Item()), *const free = New(TestItem().String("Text", "Take 1"));
+    for (TextPane *pane : {boxed, free}) {
+        pane->SetBox(&wide);
+        column->Add(pane, -1);
+    }
+    EXPECT_EQ(boxed->GetLayoutRect()->GetItemRect().right, kBox.right - kBox.left);
+    EXPECT_EQ(free->GetLayoutRect()->GetItemRect().right, free->GetTextWidth());
+}
+
+TEST_F(TextPaneTest, OfTextThatWrapsTheLongestOfItsLinesCounts) {
+    TextPane *const oneLine = New("Take 1, the long version");
+    TextPane *const lines =
+        New(TestItem().String("Text", "Take 1, the long version\nand another").Integer("WrapText", 1));
+    EXPECT_EQ(lines->GetTextWidth(), oneLine->GetTextWidth());
+    EXPECT_NE(New("Take 1, the long version\nand another")->GetTextWidth(), oneLine->GetTextWidth());
+}
+
+TEST_F(TextPaneTest, DrawsInItsOwnPort) {
+    TextPane *const pane = New(Item());
+    LeaveForAnotherPort();
+    (pane->*&Opened<TextPane>::DrawGuts)(nullptr);
+    EXPECT_TRUE(IsInItsPort());
+}
+
+TEST_F(TextPaneTest, ADerivedPaneMaySayWhereAndInWhichColourItIsDrawn) {
+    class Elsewhere : public TextPane {
+    public:
+        using TextPane::DrawGuts;
+        using TextPane::TextPane;
+        Rect GetDrawRectangle() override { return {1, 2, 31, 42}; }
+        void SetupFont() const override { VelaDrawing::RGBForeColor({0xFFFF, 0, 0}); }
+    };
+    Elsewhere *const pane = new Elsewhere(glog, Item().Container(), false);
+    Lines const drawn = Traced(*pane, [&] { pane->DrawGuts(nullptr); });
+    Lines const texts = Only("DrawTextLayoutInRect", drawn);
+    ASSERT_EQ(texts.size(), 1u);
+    EXPECT_TRUE(Says(texts[0], "[1,2,31,42]")) << texts[0];
+    EXPECT_EQ(Only("RGBForeColor", drawn), Traced(*pane, [] { VelaDrawing::RGBForeColor({0xFFFF, 0, 0}); }));
 }
