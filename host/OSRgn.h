@@ -1,6 +1,7 @@
 // Regions: sets of pixels, made of rectangles.
 #pragma once
 #include "host/Geometry.h"
+#include <cstddef>
 
 // A set of pixels in the 16-bit plane, copied as a value. Operations that combine regions are in
 // host/VelaDrawing.h.
@@ -21,8 +22,9 @@ public:
 private:
     friend struct RegionAccess; // the host's way to the representation
 
-    struct Rep;
-    Rep *rep;
+    // In place: every call that draws makes some regions.
+    static constexpr std::size_t kRepSize = 4 * sizeof(int) + sizeof(void *);
+    alignas(void *) unsigned char rep[kRepSize];
 };
 
 // A region that lives on the stack; made empty, freed at the end of the scope.

@@ -143,6 +143,11 @@ void DrawingPort::SetBoundary(OSRgn const &region) {
     ClipChanged();
 }
 
+void DrawingPort::SetBoundary(Rect const &r) {
+    if (clipPath || !Region::Is(boundary, r) || !Region::Is(clip, r))
+        SetBoundary(OSRgn(r));
+}
+
 void DrawingPort::CutClip(OSRgn const &region) {
     clip = region;
     Region::Intersect(clip, boundary);
@@ -157,6 +162,16 @@ void DrawingPort::SetClip(OSRgn const &region) {
 void DrawingPort::SetClipState(ClipState const &kept) {
     clipPath = kept.path;
     CutClip(kept.region);
+}
+
+// Mostly nothing has changed meanwhile; then the clip in device pixels stays too.
+void DrawingPort::SetPlace(PortPlace const &kept) {
+    SetOrigin(kept.originH, kept.originV);
+    if (clipPath == kept.clip.path && Region::Equal(clip, kept.clip.region) &&
+        Region::Equal(boundary, kept.boundary))
+        return;
+    SetBoundary(kept.boundary);
+    SetClipState(kept.clip);
 }
 
 void DrawingPort::LayGround(OS::RGBAColor const &color) {
@@ -202,6 +217,8 @@ OSRgn DrawingPort::TakeDamage() {
     Region::Clear(damage);
     return taken;
 }
+
+bool DrawingPort::HasWork() const { return move || !touched.Empty() || !Region::IsEmpty(damage); }
 
 Rect DrawingPort::LocalToWindow(Rect const &r) const {
     return {SaturatedPixel(r.top + originV), SaturatedPixel(r.left + originH),

@@ -48,6 +48,13 @@ struct ClipState {
     std::shared_ptr<ClipPath const> path; // narrows the region further; null for none
 };
 
+// Where on a port drawing goes, to be put back later.
+struct PortPlace {
+    int originH = 0, originV = 0;
+    OSRgn boundary; // window coordinates
+    ClipState clip;
+};
+
 // The one OSPort there is. Logical pixels throughout; the surface is larger by the scale. Local coordinates
 // are those of the window less the origin. Drawing outside the clip has no effect.
 class DrawingPort : public OSPort {
@@ -88,6 +95,7 @@ public:
 
     // The widest clip that drawing may have, in window coordinates; makes it the clip as well.
     void SetBoundary(OSRgn const &);
+    void SetBoundary(Rect const &);
     OSRgn const &Boundary() const { return boundary; }
     // The clip proper, in window coordinates; what is set is cut to the boundary. Forgets any path that
     // narrowed the clip.
@@ -96,6 +104,8 @@ public:
     // The clip with its path, to be put back later.
     ClipState GetClipState() const { return {clip, clipPath}; }
     void SetClipState(ClipState const &);
+    PortPlace GetPlace() const { return {originH, originV, boundary, GetClipState()}; }
+    void SetPlace(PortPlace const &);
     // Leaves of the clip what lies in the rectangle or region too; window coordinates.
     void NarrowClipTo(Rect const &);
     void NarrowClipTo(OSRgn const &);
@@ -118,6 +128,8 @@ public:
     void DamageWindow(Rect window); // takes no memory of its own
     OSRgn const &GetDamage() const { return damage; }
     OSRgn TakeDamage();
+    // Whether there is something to be redrawn or shown.
+    bool HasWork() const;
 
     // The device pixels that have been drawn on since the last call, and so have to be shown: a few boxes
     // that cover them.

@@ -5,34 +5,27 @@
 #include <limits>
 #include <utility>
 
-OSRgn::OSRgn()
-    : rep(new Rep) {
-    pixman_region32_init(&rep->region);
-}
+OSRgn::OSRgn() { RegionAccess::Make(*this); }
 
 OSRgn::OSRgn(Rect const &r)
     : OSRgn() {
     Region::SetRect(*this, r);
 }
 
-OSRgn::OSRgn(OSRgn const &other)
-    : OSRgn() {
-    pixman_region32_copy(&rep->region, &other.rep->region);
+OSRgn::OSRgn(OSRgn const &other) {
+    pixman_region32_copy(RegionAccess::Make(*this), RegionAccess::Raw(other));
 }
 
-OSRgn::~OSRgn() {
-    pixman_region32_fini(&rep->region);
-    delete rep;
-}
+OSRgn::~OSRgn() { pixman_region32_fini(RegionAccess::Raw(*this)); }
 
 OSRgn &OSRgn::operator=(OSRgn const &other) {
     if (this != &other)
-        pixman_region32_copy(&rep->region, &other.rep->region);
+        pixman_region32_copy(RegionAccess::Raw(*this), RegionAccess::Raw(other));
     return *this;
 }
 
 bool OSRgn::Contains(Point const &p) const {
-    return pixman_region32_contains_point(&rep->region, p.h, p.v, nullptr) != 0;
+    return pixman_region32_contains_point(RegionAccess::Raw(*this), p.h, p.v, nullptr) != 0;
 }
 
 void OSRgn::Offset(double dh, double dv) { Region::Translate(*this, WholePixel(dh), WholePixel(dv)); }

@@ -24,6 +24,7 @@ public:
     std::optional<Outline> const &Shown() const { return shown; }
     // The device pixels that have looked different since the last call.
     std::vector<DeviceRect> TakeChanged(DeviceScale);
+    bool HasChanged() const { return !changed.empty(); } // since then
 
 private:
     std::optional<Outline> shown;

@@ -28,7 +28,13 @@ pixman_color_t PremultipliedColor(OS::RGBAColor const &color) {
             Component16(Unit(color.b) * alpha), Component16(alpha)};
 }
 
-// Of so few pixels a row is done before a function of the C library has begun: tiles of a scroll bar.
+// As pixman takes a colour for pixels of 8 bits.
+std::uint32_t Pixel8(pixman_color_t const &color) {
+    auto const upper = [](std::uint16_t component) { return static_cast<std::uint32_t>(component >> 8); };
+    return upper(color.alpha) << 24 | upper(color.red) << 16 | upper(color.green) << 8 | upper(color.blue);
+}
+
+// Of so few pixels a row is done before a function of a library has begun: tiles of a scroll bar, shadows.
 constexpr int kNarrow = 16;
 
 void CopyNarrowRow(std::uint32_t const *from, int width, std::uint32_t *to) {
@@ -178,6 +184,11 @@ void PixelScope::FillBox(DeviceRect const &r, OS::RGBAColor const &color) {
         return;
     }
     pixman_color_t const over = PremultipliedColor(color);
+    if (r.Width() <= kNarrow) {
+        ForEachVisible(r, Hides::kNotAll,
+                       [&](DeviceRect const &part) { port.surface->Blend(part, Pixel8(over)); });
+        return;
+    }
     ForEachVisible(r, Hides::kNotAll, [&](DeviceRect const &part) {
         pixman_box32_t box = {part.left, part.top, part.right, part.bottom};
         pixman_image_fill_boxes(PIXMAN_OP_OVER, port.surface->PixmanImage(), &over, 1, &box);

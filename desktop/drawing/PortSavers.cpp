@@ -41,29 +41,23 @@ WithPort::WithPort(OSPort &port)
 WithPort::~WithPort() { DrawingPort::MakeCurrent(DrawingPort::Alive(saved)); }
 
 struct SavePortAndClip::Rep {
-    explicit Rep(DrawingPort *port)
-        : clip(port)
-        , originH(port ? port->OriginH() : 0)
-        , originV(port ? port->OriginV() : 0) {
-        if (port)
-            boundary = port->Boundary();
+    explicit Rep(DrawingPort *port_)
+        : port(port_) {
+        if (port_)
+            place = port_->GetPlace();
     }
-    KeptClip clip;
-    OSRgn boundary;
-    int originH, originV;
+    PortRef port;
+    PortPlace place;
 };
 
 SavePortAndClip::SavePortAndClip()
     : rep(new Rep(DrawingPort::CurrentPort())) {}
 
 SavePortAndClip::~SavePortAndClip() {
-    DrawingPort *port = rep->clip.Port();
+    DrawingPort *port = rep->port.Get();
     DrawingPort::MakeCurrent(port);
-    if (port) {
-        port->SetOrigin(rep->originH, rep->originV);
-        port->SetBoundary(rep->boundary);
-        rep->clip.PutBack();
-    }
+    if (port)
+        port->SetPlace(rep->place);
     delete rep;
 }
 

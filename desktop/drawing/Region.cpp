@@ -92,6 +92,13 @@ bool Region::Touches(OSRgn const &region, Rect const &r) {
     return pixman_region32_contains_rectangle(Queried(region), &box) != PIXMAN_REGION_OUT;
 }
 
+bool Region::Is(OSRgn const &region, Rect const &r) {
+    if (IsEmptyRect(r) || pixman_region32_n_rects(Queried(region)) != 1)
+        return false;
+    pixman_box32_t const &box = *pixman_region32_extents(Queried(region));
+    return box.x1 == r.left && box.y1 == r.top && box.x2 == r.right && box.y2 == r.bottom;
+}
+
 bool Region::Equal(OSRgn const &a, OSRgn const &b) {
     return pixman_region32_equal(Queried(a), Queried(b)) != 0;
 }

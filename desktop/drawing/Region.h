@@ -27,5 +27,6 @@ void Subtract(OSRgn &, OSRgn const &);
 void Translate(OSRgn &, int dh, int dv);
 bool Touches(OSRgn const &, Rect const &); // false for an empty rectangle
 bool Equal(OSRgn const &, OSRgn const &);
+bool Is(OSRgn const &, Rect const &); // this rectangle and no more; false for an empty one
 
 } // namespace Region

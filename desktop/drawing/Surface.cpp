@@ -162,6 +162,24 @@ void Surface::Fill(DeviceRect const &r, std::uint32_t pixel) {
                 row[i] = pixel;
 }
 
+// What a cover of that much lets through of two components, which stand in the lower halves of the word's
+// halves; rounded as pixman does it. The result stands in the upper ones.
+static std::uint32_t LetThrough(std::uint32_t components, std::uint32_t through) {
+    std::uint32_t const kLower = 0x00FF00FF, kHalves = 0x00800080;
+    std::uint32_t const products = components * through + kHalves;
+    return (products + (products >> 8 & kLower)) & ~kLower;
+}
+
+void Surface::Blend(DeviceRect const &r, std::uint32_t pixel) {
+    std::uint32_t const kOdd = 0x00FF00FF;
+    std::uint32_t const through = 0xFF - (pixel >> 24);
+    std::uint32_t *row = Row(r.top) + r.left;
+    for (int y = r.top; y < r.bottom; ++y, row += width)
+        for (int x = 0; x < r.Width(); ++x)
+            row[x] =
+                pixel + (LetThrough(row[x] & kOdd, through) >> 8 | LetThrough(row[x] >> 8 & kOdd, through));
+}
+
 bool Surface::IsOpaque() const {
     return std::all_of(pixels.begin(), pixels.end(),
                        [](std::uint32_t pixel) { return (pixel & kAlphaMask) == kAlphaMask; });

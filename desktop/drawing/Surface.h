@@ -66,6 +66,8 @@ public:
 
     // The rectangle must lie within.
     void Fill(DeviceRect const &, std::uint32_t pixel);
+    // The same with a premultiplied colour that lets through what is beneath. Meant for narrow rectangles.
+    void Blend(DeviceRect const &, std::uint32_t pixel);
 
     pixman_image_t *PixmanImage() const {
         Settle();

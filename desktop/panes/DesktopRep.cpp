@@ -2,10 +2,12 @@
 #include "desktop/panes/Glog.h"
 #include "desktop/panes/HostCall.h"
 #include <algorithm>
+#include <boost/container/small_vector.hpp>
 
 namespace {
 // A pane that damages itself whenever it is drawn must not keep the program from waiting.
 int const kMostUpdateRounds = 4;
+std::size_t const kFewGlogs = 16;
 } // namespace
 
 DesktopRep::DesktopRep(Desktop &desktop, DesktopOptions const &options_,
@@ -70,13 +72,19 @@ void DesktopRep::DeleteDisposed() {
         DrawingPort::MakeCurrent(&glogs.back()->Port());
 }
 
+// Calls for all that there are now and still are when it is their turn: glogs may be shown, hidden, brought
+// to the front or deleted meanwhile. Between any two events it is done twice, so that it takes no memory.
+template <class Call> void DesktopRep::ForEachGlog(Call call) {
+    boost::container::small_vector<Glog *, kFewGlogs> const snapshot(glogs.begin(), glogs.end());
+    for (Glog *glog : snapshot)
+        if (std::find(glogs.begin(), glogs.end(), glog) != glogs.end())
+            call(*glog);
+}
+
 void DesktopRep::UpdateAll() {
-    // Drawing may damage again, and updating may show, hide or bring glogs to the front.
+    // Drawing may damage again.
     for (int round = 0; round < kMostUpdateRounds; ++round) {
-        std::vector<Glog *> const snapshot = glogs;
-        for (Glog *glog : snapshot)
-            if (std::find(glogs.begin(), glogs.end(), glog) != glogs.end())
-                glog->Update();
+        ForEachGlog([](Glog &glog) { glog.Update(); });
         if (std::none_of(glogs.begin(), glogs.end(), [](Glog *glog) { return glog->NeedsUpdate(); }))
             return;
     }
@@ -88,8 +96,5 @@ void DesktopRep::DamageAll() {
 }
 
 void DesktopRep::Idle() {
-    std::vector<Glog *> const snapshot = glogs;
-    for (Glog *glog : snapshot)
-        if (std::find(glogs.begin(), glogs.end(), glog) != glogs.end())
-            glog->Idle();
+    ForEachGlog([](Glog &glog) { glog.Idle(); });
 }

@@ -34,4 +34,7 @@ public:
     std::unique_ptr<EventLoop> loop;
     std::vector<Glog *> glogs; // owned, in the order of their last showing
     Desktop::HitHandler hitHandler;
+
+private:
+    template <class Call> void ForEachGlog(Call);
 };

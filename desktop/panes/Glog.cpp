@@ -307,6 +307,8 @@ void Glog::Update() {
         return;
     HostCall const call;
     LayoutEngine::Settle(this);
+    if (!outline.HasChanged() && !port.HasWork())
+        return; // as after most events
     std::vector<DeviceRect> shownBoxes = outline.TakeChanged(scale);
     MoveShown(!shownBoxes.empty());
     for (DeviceRect const &box : port.TakeTouched())

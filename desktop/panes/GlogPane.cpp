@@ -293,13 +293,13 @@ void GlogPane::Prepare() {
     Point const origin = PaneAccess::Origin(*this);
     port.SetOrigin(origin.h, origin.v);
     Rect const part = GetVisibility() ? PaneAccess::VisiblePart(*this) : Rect{0, 0, 0, 0};
-    OSRgn boundary;
-    if (OSRgn const *update = host.UpdateRegion()) {
-        boundary = *update;
-        Region::IntersectRect(boundary, part);
-    } else {
-        Region::SetRect(boundary, part);
+    OSRgn const *const update = host.UpdateRegion();
+    if (!update) {
+        port.SetBoundary(part);
+        return;
     }
+    OSRgn boundary(*update);
+    Region::IntersectRect(boundary, part);
     port.SetBoundary(boundary);
 }
 

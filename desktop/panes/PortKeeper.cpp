@@ -15,10 +15,7 @@ PortKeeper::PortKeeper(DrawingPort &alsoKept)
 void PortKeeper::Keep(DrawingPort *port) {
     if (!port)
         return;
-    h = port->OriginH();
-    v = port->OriginV();
-    boundary = port->Boundary();
-    clip = port->GetClipState();
+    place = port->GetPlace();
     state = port->State();
 }
 
@@ -27,8 +24,6 @@ PortKeeper::~PortKeeper() {
     DrawingPort *const port = kept.Get();
     if (!port)
         return;
-    port->SetOrigin(h, v);
-    port->SetBoundary(boundary);
-    port->SetClipState(clip);
+    port->SetPlace(place);
     port->State() = state;
 }

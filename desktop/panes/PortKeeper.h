@@ -15,8 +15,6 @@ public:
 private:
     void Keep(DrawingPort *);
     PortRef current, kept;
-    int h = 0, v = 0;
-    OSRgn boundary;
-    ClipState clip;
+    PortPlace place;
     GraphicsState state;
 };

@@ -7,6 +7,8 @@
 #include <vector>
 
 static Display *theDisplay = nullptr; // SDL's
+static Atom theTimeOfUse = None;
+static unsigned long theFlushed = 0; // number of the request that was to come next when all were sent
 
 void SdlScreen::IgnoreOtherWindowsMouse(SDL_Window *window) {
     SDL_SysWMinfo info;
@@ -14,6 +16,7 @@ void SdlScreen::IgnoreOtherWindowsMouse(SDL_Window *window) {
     if (theDisplay != nullptr || window == nullptr || SDL_GetWindowWMInfo(window, &info) != SDL_TRUE)
         return;
     theDisplay = info.info.x11.display;
+    theTimeOfUse = XInternAtom(theDisplay, "_NET_WM_USER_TIME", False); // known here since SDL asked
     int opcode = 0, event = 0, error = 0;
     if (!XQueryExtension(theDisplay, "XInputExtension", &opcode, &event, &error))
         return; // then SDL has not asked either
@@ -35,12 +38,31 @@ void SdlScreen::GetMousePlace(int &x, int &y) {
 
 bool SdlScreen::CanWait() { return theDisplay != nullptr; }
 
+// With each press and key SDL notes at the window when it was used last, for window managers, and the server
+// says so. Nobody wants to know: whether that was all that came.
+static bool TakeNoteOfUse() {
+    if (XEventsQueued(theDisplay, QueuedAfterReading) != 1)
+        return false;
+    XEvent event;
+    XPeekEvent(theDisplay, &event);
+    if (event.type != PropertyNotify || event.xproperty.atom != theTimeOfUse)
+        return false;
+    XNextEvent(theDisplay, &event);
+    return true;
+}
+
+// Where nothing has been asked of the server since the last time, nothing waits to be sent, and what had come
+// until then has been taken.
 bool SdlScreen::Wait(int milliseconds) {
-    XFlush(theDisplay);
-    if (XEventsQueued(theDisplay, QueuedAlready) > 0)
-        return true;
+    if (unsigned long const next = NextRequest(theDisplay); next != theFlushed) {
+        XFlush(theDisplay);
+        theFlushed = next;
+        if (XEventsQueued(theDisplay, QueuedAlready) > 0)
+            return true;
+    }
     pollfd connection = {ConnectionNumber(theDisplay), POLLIN, 0};
-    return poll(&connection, 1, milliseconds) != 0; // an interruption by a signal counts
+    int const came = poll(&connection, 1, milliseconds);
+    return came != 0 && !(came > 0 && TakeNoteOfUse()); // an interruption by a signal counts
 }
 
 namespace {
@@ -91,5 +113,6 @@ void SdlScreen::WatchMoves(SDL_Window *window) {
 
 void SdlScreen::Forget() {
     theDisplay = nullptr;
+    theFlushed = 0;
     theWatched.clear();
 }

@@ -18,7 +18,7 @@ void GetMousePlace(int &x, int &y);
 // Whether there is a connection to wait for; not before the first window.
 bool CanWait();
 // Waits for the server to send something, or for a signal, no longer than so many milliseconds. Whether
-// something came. SDL, whose own wait looks for events first, does not learn of it.
+// something came; may end early without. SDL, whose own wait looks for events first, does not learn of it.
 bool Wait(int milliseconds);
 
 // From now on SDL reports the window as exposed, as it does for what other windows uncover, when pixels are

@@ -52,6 +52,16 @@ TEST(OSRgn, CopiesAreIndependent) {
     EXPECT_EQ(Region::Bounds(a), (Rect{100, 100, 110, 110}));
 }
 
+TEST(OSRgn, IsOneRectangleOnlyWhenItHasNoOtherPixels) {
+    Rect const r = {2, 3, 8, 9};
+    OSRgn region(r);
+    EXPECT_TRUE(Region::Is(region, r));
+    EXPECT_FALSE(Region::Is(region, {2, 3, 8, 10}));
+    Region::Subtract(region, OSRgn(Rect{4, 4, 5, 5}));
+    EXPECT_FALSE(Region::Is(region, r)) << "it has a hole";
+    EXPECT_FALSE(Region::Is(OSRgn(), {0, 0, 0, 0})) << "no pixels are no rectangle";
+}
+
 TEST(OSRgn, UnionAndDifferenceMayWriteIntoAnOperand) {
     TempRgn a, b;
     VelaDrawing::RectRgn(a, std::unique_ptr<Rect>(new Rect{0, 0, 10, 10}).get());

@@ -1,9 +1,11 @@
 #include "Canvas.h"
+#include "desktop/drawing/PixelScope.h"
 #include "tests/resources/TemporaryDirectory.h"
 #include <algorithm>
 #include <fstream>
 #include <iterator>
 #include <memory>
+#include <random>
 
 namespace {
 
@@ -134,6 +136,26 @@ TEST(Surface, FillsRectanglesOfEveryWidthAndNothingBesideThem) {
                 ASSERT_EQ(surface.Row(y)[x], filled ? 0xFF123456u : 0xFF000000u)
                     << width << ": " << x << ' ' << y;
             }
+    }
+}
+
+TEST(Surface, BlendsNarrowRectanglesToTheSamePixelsAsWideOnes) {
+    int const kWidth = 51, kHeight = 7;
+    std::minstd_rand random(1);
+    std::uniform_real_distribution<double> any(0.0, 1.0);
+    for (int round = 0; round < 300; ++round) {
+        OS::RGBAColor const color(any(random), any(random), any(random), any(random));
+        std::vector<std::uint32_t> pixels[2];
+        for (int narrow = 0; narrow < 2; ++narrow) {
+            Canvas canvas(kWidth, kHeight);
+            canvas.FillWithPattern();
+            PixelScope scope(canvas.port);
+            int const step = narrow ? 1 + round % 16 : kWidth;
+            for (int x = 0; x < kWidth; x += step)
+                scope.Fill({x, 0, std::min(x + step, kWidth), kHeight}, color);
+            pixels[narrow] = canvas.Pixels();
+        }
+        ASSERT_EQ(pixels[0], pixels[1]) << color.r << ' ' << color.g << ' ' << color.b << ' ' << color.a;
     }
 }
 
