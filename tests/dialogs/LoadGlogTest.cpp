@@ -381,6 +381,17 @@ TEST_F(GroupItem, GivesEachItemWhatItsLayoutSays) {
     EXPECT_EQ(Place(glog, 4), (Rect{63, 0, 93, 200}));
 }
 
+TEST_F(GroupItem, LetsNoHiddenItemTakeRoom) {
+    glogRec *const glog =
+        Load(Dialog("<Item type=\"Group\" id=\"1\"><Spacing>5</Spacing><Items>" +
+                    Button(2, 40, "<Visible>0</Visible>") + Button(3, 40, "") + "</Items></Item>"));
+    ShowGlog(glog, kShowGlog);
+    EXPECT_EQ(BoxOf(GetGlogItem(glog, 3)).top, 0);
+    GetGlogItem(glog, 2)->Show();
+    desktop.Play("wait 0.1");
+    EXPECT_EQ(BoxOf(GetGlogItem(glog, 3)).top, 19 + 5);
+}
+
 TEST_F(GroupItem, SharesOutRoomByGrowWidthAndKeepsMinima) {
     glogRec *const glog = LoadGroup(
         "<BoundsRect top=\"0\" left=\"0\" bottom=\"50\" right=\"200\"/><Direction>horiz</Direction>",
@@ -513,6 +524,34 @@ TEST(DialogLanguage, IsThatOfTheDesktop) {
         "</Item></Items></Glog>",
         "text");
     EXPECT_EQ(TextOf(dynamic_cast<GlogButtonPane *>(GetGlogItem(glog, 1))), "Abbrechen");
+}
+
+class TopLevelItem : public DialogTest {
+protected:
+    // Pixels by which the item becomes wider when the window becomes 50 wider.
+    int Growth(std::string const &type, std::string const &keys) {
+        glogRec *const glog =
+            Load("<Glog width=\"100\" height=\"90\" growable=\"yes\"><Items>" +
+                 Item(type, "<BoundsRect top=\"0\" left=\"0\" bottom=\"40\" right=\"60\"/>" + keys +
+                                "<Layout><GrowWidth>1</GrowWidth></Layout>") +
+                 "</Items></Glog>");
+        ShowGlog(glog, kShowGlog);
+        Rect const before = BoxOf(GetGlogItem(glog, 1));
+        desktop.Play("resize 150 90");
+        Rect const after = BoxOf(GetGlogItem(glog, 1));
+        DisposeGlog(glog);
+        return (after.right - after.left) - (before.right - before.left);
+    }
+};
+
+TEST_F(TopLevelItem, FollowsTheWindowByItsSharesOfGrowth) {
+    for (char const *type : {"Group", "Box", "TextField", "Tabs", "PopUpMenu", "ScrollPane"})
+        EXPECT_EQ(Growth(type, type == std::string("Tabs") ? "<Items/>" : ""), 50) << type;
+}
+
+TEST_F(TopLevelItem, HasOtherWaysToFollowInSomeTypes) {
+    for (char const *type : {"List", "ProgressBar", "ScrollBar", "ScrollGrid"})
+        EXPECT_EQ(Growth(type, type == std::string("List") ? "<LineHeight>18</LineHeight>" : ""), 0) << type;
 }
 
 } // namespace
