@@ -152,6 +152,12 @@ TEST_F(Glogview, EndsWithOneForABadDialog) {
     EXPECT_FALSE(std::filesystem::exists(directory.Path() + "/a.png"));
 }
 
+TEST_F(Glogview, RefusesALanguageThatHasNoTexts) {
+    ProgramResult const result = Run("good.xml --png a.png --language xx");
+    EXPECT_EQ(result.status, 1);
+    EXPECT_EQ(result.errors, "glogview: there are no texts in the language xx\n");
+}
+
 TEST_F(Glogview, EndsWithOneForAMissingDialog) {
     ProgramResult const result = Run("none.xml --png a.png");
     EXPECT_EQ(result.status, 1);

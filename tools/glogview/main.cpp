@@ -1,6 +1,7 @@
 // Shows a dialog in a window, or drives and photographs it without a display.
 #include "desktop/Desktop.h"
 #include "desktop/SimulatedDesktop.h"
+#include "desktop/resources/Resources.h"
 #include "dialogs/LoadGlog.h"
 #include "host/glogRec.h"
 #include "tools/LineOutput.h"
@@ -9,6 +10,7 @@
 #include "tools/glogview/WatchedDialog.h"
 #include <iostream>
 #include <memory>
+#include <stdexcept>
 
 namespace {
 
@@ -35,6 +37,12 @@ private:
     std::unique_ptr<LineOutput> messages, drawing;
 };
 
+// Without texts everything would be in English, and a slip in the code go unnoticed.
+void RequireTexts(std::string const &language) {
+    if (Resources::Instance().Find("strings/" + language + ".xml").empty())
+        throw std::runtime_error("there are no texts in the language " + language);
+}
+
 void WriteDump(Desktop const &desktop, glogRec *glog, CommandLine const &line) {
     if (!line.dump.empty())
         LineOutput(line.dump).Write(desktop.DumpTree(glog));
@@ -42,6 +50,7 @@ void WriteDump(Desktop const &desktop, glogRec *glog, CommandLine const &line) {
 
 void RunSimulated(CommandLine const &line) {
     SimulatedDesktop desktop(line.desktop);
+    RequireTexts(line.desktop.language);
     Observers const observers(desktop, line);
     glogRec *const glog = LoadGlog(line.dialog);
     if (!line.script.empty())
@@ -55,6 +64,7 @@ void RunSimulated(CommandLine const &line) {
 
 int RunInWindow(CommandLine const &line) {
     Desktop desktop(line.desktop);
+    RequireTexts(line.desktop.language);
     Observers const observers(desktop, line);
     WatchedDialog dialog(line.dialog);
     WriteDump(desktop, dialog.Shown(), line);
