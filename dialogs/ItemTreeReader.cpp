@@ -40,6 +40,16 @@ std::string Range(KeySchema const &key) {
     return "from " + std::to_string(key.smallest) + " to " + std::to_string(key.largest);
 }
 
+// How the element of the key begins.
+std::string WayToWrite(KeySchema const &key) {
+    std::string text = '<' + key.name;
+    if (key.kind != KeySchema::kContainer) {
+        for (KeySchema const &attribute : key.keys.Keys())
+            text += ' ' + attribute.name + "=\"\"";
+    }
+    return text + '>';
+}
+
 bool HasAttributes(XmlNode const &node, std::initializer_list<char const *> names) {
     return node.attributes.size() == names.size() &&
            std::all_of(names.begin(), names.end(), [&](char const *name) { return node.Attribute(name); });
@@ -154,7 +164,7 @@ ItemTreeReader::Container ItemTreeReader::ReadKeys(XmlNode const &node, KeyList 
     }
     for (KeySchema const &key : keys.Keys()) {
         if (key.required && !seen.count(key.name))
-            throw ErrorAt(node, "<" + key.name + "> is missing");
+            throw ErrorAt(node, WayToWrite(key) + " is missing");
     }
     return container;
 }

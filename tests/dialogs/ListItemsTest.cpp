@@ -268,7 +268,8 @@ TEST_F(ListItems, TheDumpTellsWhatAListShows) {
 // What is wrong
 
 TEST_F(ListItems, NeedABoxAndALineHeight) {
-    EXPECT_TRUE(Holds(ComplaintAboutItem("List", "<LineHeight>16</LineHeight>"), "<BoundsRect> is missing"));
+    EXPECT_TRUE(Holds(ComplaintAboutItem("List", "<LineHeight>16</LineHeight>"),
+                      "<BoundsRect top=\"\" left=\"\" bottom=\"\" right=\"\"> is missing"));
     EXPECT_TRUE(
         Holds(ComplaintAboutItem("List", "<BoundsRect top=\"1\" left=\"1\" bottom=\"9\" right=\"9\"/>"),
               "<LineHeight> is missing"));

@@ -207,6 +207,9 @@ TEST_F(WrongDialog, AKeyStandsOnce) {
 
 TEST_F(WrongDialog, RequiredKeysMustBeThere) {
     EXPECT_EQ(About("Label", "<FSRID>0</FSRID>"), "test.xml:2:3: item 3 (Label): <Text> is missing");
+    EXPECT_EQ(About("TextField", ""), "test.xml:2:3: item 3 (TextField): <BoundsRect top=\"\" left=\"\" "
+                                      "bottom=\"\" right=\"\"> is missing");
+    EXPECT_EQ(About("CheckBox", ""), "test.xml:2:3: item 3 (CheckBox): <RadioCheckButtonItems> is missing");
 }
 
 TEST_F(WrongDialog, IntegersMustBeInRange) {
