@@ -111,6 +111,23 @@ TEST_F(Watched, KeepsTheErrorAtTheBottomWhenItsWindowGrows) {
     EXPECT_EQ(box.right, 200);
 }
 
+TEST_F(Watched, HasRoomForALongError) {
+    auto const height = [&] {
+        glogRec *const glog = dialog.Shown();
+        Rect box;
+        GetGlogItem(glog, CountGlogItems(glog))->GetBox(&box);
+        return box.bottom - box.top;
+    };
+    Save("<Glog");
+    int const shortOne = height();
+    Save("<Glog width=\"500\" height=\"300\"><Items><Item type=\"Zeppelin\"/></Items></Glog>");
+    EXPECT_GT(height(), shortOne);
+    EXPECT_LE(height(), 100) << "no higher than the window";
+    desktop.Play("resize 900 300");
+    EXPECT_GE(height(), shortOne);
+    EXPECT_LT(height(), 100) << "wide windows need fewer lines";
+}
+
 TEST(WatchedDialog, MustBeGoodAtFirst) {
     SimulatedDesktop desktop;
     TemporaryDirectory directory;

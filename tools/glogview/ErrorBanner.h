@@ -1,4 +1,4 @@
-// A strip along the bottom of a window that says what is wrong.
+// A strip along the bottom of a window that says what is wrong, as high as the text needs.
 #pragma once
 #include "host/GlogPane.h"
 #include "host/TextLayout.h"
@@ -21,6 +21,8 @@ protected:
     void DrawGuts(OSRgn *) override;
 
 private:
+    void Place();
+
     UString text;
     OS::TextLayout layout; // of the text
 };
