@@ -251,11 +251,8 @@ void EventLoop::HandlePress(Glog &glog, InputEvent const &event) {
 }
 
 // A loop inside a pane keeps movements and the release for the drag that it takes place in. Where nobody
-// follows the mouse, they are the main loop's.
-void EventLoop::LeaveDrag() {
-    deferred.insert(deferred.begin(), pointer.begin(), pointer.end());
-    pointer.clear();
-}
+// follows the mouse, they are the main loop's. Must not throw: it may be memory that the pane has thrown for.
+void EventLoop::LeaveDrag() { deferred.splice(deferred.begin(), pointer); }
 
 void EventLoop::ReleasePointer() {
     if (!heldWindow)

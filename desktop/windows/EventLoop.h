@@ -4,8 +4,8 @@
 #include "desktop/windows/InputEvent.h"
 #include "desktop/windows/WindowSystem.h"
 #include "host/MouseTask.h"
-#include <deque>
 #include <functional>
+#include <list>
 #include <memory>
 #include <vector>
 
@@ -111,8 +111,8 @@ private:
     WindowSystem &windows;
     IdleChores chores;
     std::unique_ptr<HelpTagWindow> helpTags;
-    std::deque<InputEvent> deferred; // for the main loop
-    std::deque<InputEvent> pointer;  // for tracking
+    std::list<InputEvent> deferred; // for the main loop
+    std::list<InputEvent> pointer;  // for tracking
     PlatformWindow *heldWindow = nullptr;
     PlatformWindow *menuWindow = nullptr; // that the open menu belongs to
     Point lastPoint{0, 0};
