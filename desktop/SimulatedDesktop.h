@@ -30,8 +30,9 @@ public:
 //     menu 4/2                # item 2 of the submenu that item 4 opens
 //     print list.pdf          snapshot a.png    dump a.json
 //
-// Steps are taken when something waits for events, nested loops too; `wait` lets virtual time pass first.
-// When the script has ended, a tracking loop gets its release and Run returns.
+// An item that is not there or does not show is an error, and so is a press outside of the window while no
+// menu is open. Steps are taken when something waits for events, nested loops too; `wait` lets virtual time
+// pass first. When the script has ended, a tracking loop gets its release and Run returns.
 class SimulatedDesktop : public Desktop {
 public:
     explicit SimulatedDesktop(DesktopOptions const & = DesktopOptions());

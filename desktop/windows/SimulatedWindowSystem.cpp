@@ -200,13 +200,28 @@ void SimulatedWindowSystem::Type(ScriptStep const &step) {
     }
 }
 
+// A press where nothing of the program is would go nowhere. The mouse may move there, and pop-ups may lie
+// there.
+void SimulatedWindowSystem::RequireWithin(SimulatedWindow const *target, ScriptStep const &step) const {
+    bool const maybe = !target || captured || step.kind == ScriptStep::kMove ||
+                       std::any_of(windows.begin(), windows.end(),
+                                   [](SimulatedWindow const *window) { return window->IsPopup(); });
+    if (maybe || (step.h >= 0 && step.h < target->Width() && step.v >= 0 && step.v < target->Height()))
+        return;
+    throw ScriptError(step.source + ": " + std::to_string(step.h) + " " + std::to_string(step.v) +
+                      " lies outside of the window, which is " + std::to_string(target->Width()) + " by " +
+                      std::to_string(target->Height()));
+}
+
 // Events count from the window that has captured the mouse, items stand in the one that scripts act on.
 void SimulatedWindowSystem::TakePlace(ScriptStep const &step) {
     lastH = step.h;
     lastV = step.v;
     SimulatedWindow *const target = Target();
-    if (!step.item || !placeFinder || !target)
+    if (!step.item || !placeFinder || !target) {
+        RequireWithin(target, step);
         return;
+    }
     Point const place = placeFinder(step, target);
     Point const from = captured ? captured->ScreenPlace() : target->ScreenPlace();
     lastH = place.h + target->ScreenPlace().h - from.h;

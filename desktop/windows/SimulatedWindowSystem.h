@@ -58,6 +58,7 @@ private:
     bool Deliver(InputEvent &);
     void Perform(ScriptStep const &);
     void TakePlace(ScriptStep const &);
+    void RequireWithin(SimulatedWindow const *, ScriptStep const &) const;
     void Push(InputEvent, ScriptStep const &);
     void PushButton(InputEvent::Kind, int button, int clicks, ScriptStep const &);
     void PushPress(int button, int clicks, ScriptStep const &);

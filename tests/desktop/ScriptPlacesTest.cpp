@@ -69,4 +69,22 @@ TEST_F(ScriptPlacesTest, APlaceThatDoesNotShowIsAnError) {
     EXPECT_EQ(ErrorOf("click @7"), "script:1: this place of item 7 does not show in the window");
 }
 
+TEST_F(ScriptPlacesTest, APressOutsideOfTheWindowIsAnError) {
+    Show();
+    for (std::string const step : {"press", "click", "doubleclick", "rightclick"}) {
+        EXPECT_EQ(ErrorOf(step + " 320 10"),
+                  "script:1: 320 10 lies outside of the window, which is 320 by 200");
+        EXPECT_EQ(ErrorOf(step + " 10 -1"),
+                  "script:1: 10 -1 lies outside of the window, which is 320 by 200");
+    }
+    EXPECT_EQ(ErrorOf("wheel 10 200 0 1"),
+              "script:1: 10 200 lies outside of the window, which is 320 by 200");
+    EXPECT_EQ(ErrorOf("click 319 199"), "no error");
+}
+
+TEST_F(ScriptPlacesTest, TheMouseMayMoveOutOfTheWindow) {
+    Show();
+    EXPECT_EQ(ErrorOf("move 400 10\npress 10 10\nmove -5 300\nrelease"), "no error");
+}
+
 } // namespace

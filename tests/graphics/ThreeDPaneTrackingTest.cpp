@@ -295,7 +295,7 @@ TEST_F(ThreeDPaneTrackingTest, ElsewhereNothingIsDragged) {
     Cube *const cube = AsInDialogs();
     Show();
     Log const log(cube);
-    EXPECT_EQ(ResultOfClick("press 10 230\nmove 150 150"), -1);
+    EXPECT_EQ(ResultOfClick("press 10 190\nmove 150 150"), -1);
     EXPECT_TRUE(log.values.empty());
 }
 
