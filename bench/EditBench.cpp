@@ -1,4 +1,5 @@
 // Editable text: one character typed into a long text and shown, and a longer one opened.
+#include "bench/BarePicture.h"
 #include "bench/ProcessorClock.h"
 #include "desktop/SimulatedDesktop.h"
 #include "desktop/editing/KeyEvent.h"
@@ -171,5 +172,19 @@ void DrawAllThatShows(benchmark::State &state) {
     }
 }
 BENCHMARK(DrawAllThatShows);
+
+void DrawAllThatShowsBare(benchmark::State &state) {
+    int const kFont = 0, kLineHeight = 16;
+    std::u16string const units = Lines(1);
+    std::string const line(units.begin(), units.end() - 1);
+    BarePicture picture(kWidth, kHeight);
+    for (int top = 0; top < kHeight; top += kLineHeight)
+        picture.Add(line, kFont, 0, top);
+    for (auto _ : state)
+        picture.Repaint();
+    if (picture.IsBlank())
+        state.SkipWithError("nothing has been drawn");
+}
+BENCHMARK(DrawAllThatShowsBare);
 
 } // namespace

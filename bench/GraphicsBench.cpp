@@ -1,4 +1,5 @@
 // A point that is dragged through its cube, a graph of very many points, and a progress bar.
+#include "bench/BarePicture.h"
 #include "desktop/SimulatedDesktop.h"
 #include "desktop/panes/Glog.h"
 #include "graphics/GraphPane.h"
@@ -12,6 +13,7 @@
 
 namespace {
 
+double const kFullCircle = 6.283185307179586; // radians
 int const kScale = 2;
 int const kManyPoints = 100000, kFewPoints = 1000;
 long long const kGreatest = 1000000000; // of the progress bar: a step is far less than a pixel
@@ -58,6 +60,43 @@ void DragStep(benchmark::State &state) {
 }
 BENCHMARK(DragStep)->Name("Panner/drag step");
 
+// A room of three walls, which is a picture; on it a shadow, three lines through the point and a ball.
+void DragStepBare(benchmark::State &state) {
+    double const width = 224.0 * kScale, height = 238.0 * kScale, radius = 9.0 * kScale;
+    BarePicture room(static_cast<int>(width), static_cast<int>(height));
+    BarePicture picture(static_cast<int>(width), static_cast<int>(height));
+    cairo_t *const context = cairo_create(picture.Pixels().surface.CairoSurface());
+    cairo_set_line_width(context, kScale);
+    double along = -1.0;
+    for (auto _ : state) {
+        along = along >= 1.0 ? -1.0 : along + 0.125;
+        double const h = width * (along + 2.0) / 4.0, v = height / 2;
+        cairo_set_source_surface(context, room.Pixels().surface.CairoSurface(), 0, 0);
+        cairo_paint(context);
+        cairo_set_source_rgba(context, 0, 0, 0, 0.5);
+        cairo_arc(context, h, height - 2 * radius, radius, 0, kFullCircle);
+        cairo_fill(context);
+        for (int axis = -1; axis <= 1; ++axis) {
+            cairo_move_to(context, h - 40.0, v + 20.0 * axis);
+            cairo_line_to(context, h + 40.0, v - 20.0 * axis);
+            cairo_stroke(context);
+        }
+        cairo_pattern_t *const ball = cairo_pattern_create_radial(h - 3.0, v - 3.0, 0, h, v, radius);
+        cairo_pattern_add_color_stop_rgb(ball, 0, 1.0, 0.8, 0.5);
+        cairo_pattern_add_color_stop_rgb(ball, 1, 0.8, 0.4, 0);
+        cairo_set_source(context, ball);
+        cairo_arc(context, h, v, radius, 0, kFullCircle);
+        cairo_fill(context);
+        cairo_pattern_destroy(ball);
+        picture.DrawTexts();
+        picture.Show();
+    }
+    cairo_destroy(context);
+    if (picture.IsBlank())
+        state.SkipWithError("nothing has been drawn");
+}
+BENCHMARK(DragStepBare)->Name("Panner/drag step bare");
+
 // Calculated beforehand: what the data costs its program does not count.
 class Waves : public GraphData {
 public:
@@ -88,6 +127,32 @@ void RepaintGraph(benchmark::State &state) {
     }
 }
 BENCHMARK(RepaintGraph)->Name("Graph/repaint")->Arg(kFewPoints)->Arg(kManyPoints);
+
+// The same line through the same points, stroked by Cairo as it is.
+void RepaintGraphBare(benchmark::State &state) {
+    int const points = static_cast<int>(state.range(0));
+    int const width = 600 * kScale, height = 300 * kScale;
+    double const kUnits = 2200.0; // from the least to the greatest value
+    Waves waves(points);
+    BarePicture picture(width, height);
+    cairo_t *const context = cairo_create(picture.Pixels().surface.CairoSurface());
+    cairo_set_line_width(context, 1.5 * kScale);
+    for (auto _ : state) {
+        picture.Clear();
+        for (int i = 0; i < points; ++i) {
+            GraphDataPoint const point = waves.GetPoint(i);
+            cairo_line_to(context, 1.0 * point.horizontal / points * width,
+                          height / 2 - point.vertical / kUnits * height);
+        }
+        cairo_stroke(context);
+        picture.DrawTexts();
+        picture.Show();
+    }
+    cairo_destroy(context);
+    if (picture.IsBlank())
+        state.SkipWithError("nothing has been drawn");
+}
+BENCHMARK(RepaintGraphBare)->Name("Graph/repaint bare")->Arg(kFewPoints)->Arg(kManyPoints);
 
 void UnseenProgress(benchmark::State &state) {
     Page page;

@@ -1,12 +1,11 @@
 // A list of three columns: what is seen of it, and what is worked out for all of its rows.
-#include "bench/BarePangoText.h"
+#include "bench/BarePicture.h"
 #include "bench/ProcessorClock.h"
 #include "desktop/SimulatedDesktop.h"
 #include "host/glogRec.h"
 #include "lists/GListPane.h"
 #include "lists/ListTextDrawer.h"
 #include "scrolling/ScrollBarPane.h"
-#include "tests/drawing/Canvas.h"
 #include <benchmark/benchmark.h>
 #include <boost/make_shared.hpp>
 #include <malloc.h>
@@ -118,12 +117,8 @@ BENCHMARK(Repaint)->Name("List/repaint")->Arg(kFew)->Arg(kMany);
 // The same texts at the same places, each laid out beforehand, on a ground that is filled before and shown by
 // a copy afterwards.
 void RepaintBare(benchmark::State &state) {
-    Canvas canvas(kWidth, kHeight);
-    struct Placed {
-        std::unique_ptr<BarePangoText> text;
-        int left, top;
-    };
-    std::vector<Placed> texts;
+    int const lefts[kColumns] = {0, kNameWidth, kNameWidth + kTimeWidth};
+    BarePicture picture(kWidth, kHeight);
     for (int row = 0; row < kShown; ++row) {
         for (int column = 0; column < kColumns; ++column) {
             ListCell cell;
@@ -131,24 +126,12 @@ void RepaintBare(benchmark::State &state) {
             std::string ascii;
             for (std::size_t i = 0; i < cell.text.length(); ++i)
                 ascii += static_cast<char>(cell.text[i]);
-            texts.push_back({std::make_unique<BarePangoText>(canvas.surface.CairoSurface(), ascii.c_str(), 0),
-                             column == 0   ? 0
-                             : column == 1 ? kNameWidth
-                                           : kNameWidth + kTimeWidth,
-                             row * kRowHeight});
+            picture.Add(ascii, 0, lefts[column], row * kRowHeight);
         }
     }
-    std::vector<std::uint32_t> shown(static_cast<std::size_t>(kWidth) * kHeight);
-    for (auto _ : state) {
-        std::fill_n(canvas.surface.Pixels(), shown.size(), Canvas::kWhite);
-        cairo_surface_mark_dirty(canvas.surface.CairoSurface());
-        for (Placed &placed : texts)
-            placed.text->Draw(placed.left, placed.top);
-        cairo_surface_flush(canvas.surface.CairoSurface());
-        std::copy_n(canvas.surface.Pixels(), shown.size(), shown.begin());
-        benchmark::DoNotOptimize(shown.data());
-    }
-    if (canvas.Count(Canvas::kWhite) == kWidth * kHeight)
+    for (auto _ : state)
+        picture.Repaint();
+    if (picture.IsBlank())
         state.SkipWithError("nothing has been drawn");
 }
 BENCHMARK(RepaintBare)->Name("List/repaint bare");

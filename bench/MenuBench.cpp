@@ -1,4 +1,5 @@
 // From the call that opens a menu to its first frame, with few items and with many out of sight.
+#include "bench/BarePicture.h"
 #include "desktop/SimulatedDesktop.h"
 #include "desktop/windows/SimulatedWindowSystem.h"
 #include "host/OSMenuHandle.h"
@@ -42,5 +43,19 @@ void Open(benchmark::State &state) {
     }
 }
 BENCHMARK(Open)->Name("Menu/open")->Arg(20)->Arg(1000)->Arg(10000);
+
+// The names of what shows, laid out anew for each opening.
+void OpenBare(benchmark::State &state) {
+    int const kFont = 0, kIndent = 20;
+    for (auto _ : state) {
+        BarePicture picture(kWidth, kHeight);
+        for (int i = 0; i < kShown; ++i)
+            picture.Add("Item " + std::to_string(i + 1), kFont, kIndent, i * kItemHeight);
+        picture.Repaint();
+        if (picture.IsBlank())
+            state.SkipWithError("nothing has been drawn");
+    }
+}
+BENCHMARK(OpenBare)->Name("Menu/open bare");
 
 } // namespace

@@ -1,7 +1,9 @@
 // Redrawing a page of 200 panes: all of it, and a small part.
+#include "bench/BarePicture.h"
 #include "bench/BenchPage.h"
 #include "buttons/OvalButtonPane.h"
 #include <benchmark/benchmark.h>
+#include <string>
 
 namespace {
 
@@ -16,6 +18,21 @@ void RedrawAll(benchmark::State &state) {
         state.SkipWithError("a redraw has not been shown");
 }
 BENCHMARK(RedrawAll)->Name("Redraw/all");
+
+// The texts of as many panes and nothing else: no buttons behind them.
+void RedrawAllBare(benchmark::State &state) {
+    int const kFont = 0;
+    BarePicture picture(BenchPage::kWidth, BenchPage::kHeight);
+    for (int place = 0; place < BenchPage::kColumns * BenchPage::kRows; ++place)
+        picture.Add("Channel " + std::to_string(place + 1), kFont,
+                    place % BenchPage::kColumns * BenchPage::kColumnWidth,
+                    place / BenchPage::kColumns * BenchPage::kRowHeight);
+    for (auto _ : state)
+        picture.Repaint();
+    if (picture.IsBlank())
+        state.SkipWithError("nothing has been drawn");
+}
+BENCHMARK(RedrawAllBare)->Name("Redraw/all bare");
 
 // Goes round among places all over the page, so that panes of every kind are met.
 void RedrawSpot(benchmark::State &state) {

@@ -1,4 +1,5 @@
 // A scroll step and the drawing that follows it, with little and with much out of sight.
+#include "bench/BarePicture.h"
 #include "bench/ProcessorClock.h"
 #include "desktop/SimulatedDesktop.h"
 #include "host/UString.h"
@@ -109,5 +110,24 @@ void StepOfPane(benchmark::State &state) {
     }
 }
 BENCHMARK(StepOfPane)->Name("Scroll/pane")->Arg(600)->Arg(30000);
+
+// The rows moved in memory, one text drawn into what comes to light, and all of it taken over.
+void StepBare(benchmark::State &state) {
+    int const kFont = 0;
+    BarePicture picture(kWidth, kHeight);
+    picture.Add("Row 1000", kFont, 0, kHeight - kStep);
+    picture.Clear();
+    Surface &surface = picture.Pixels().surface;
+    for (auto _ : state) {
+        std::copy(surface.Row(kStep), surface.Row(kHeight), surface.Row(0));
+        std::fill(surface.Row(kHeight - kStep), surface.Row(kHeight), Canvas::kWhite);
+        cairo_surface_mark_dirty(surface.CairoSurface());
+        picture.DrawTexts();
+        picture.Show();
+    }
+    if (picture.IsBlank())
+        state.SkipWithError("nothing has been drawn");
+}
+BENCHMARK(StepBare)->Name("Scroll/bare");
 
 } // namespace

@@ -1,4 +1,5 @@
 // A row of 40 tabs that is fitted into one width after the other, through all of its steps.
+#include "bench/BarePicture.h"
 #include "desktop/SimulatedDesktop.h"
 #include "host/glogRec.h"
 #include "tabs/TabPane.h"
@@ -10,6 +11,7 @@ namespace {
 
 int const kTabs = 40;
 short const kWidth = 2600, kHeight = 30; // pixels, of the window
+int const kTabFont = 3;
 int const kNarrowest = 20, kStride = 617, kRange = kWidth - kNarrowest;
 
 class TabPage {
@@ -28,8 +30,9 @@ public:
     // Wide and narrow in turn.
     void FitNext() {
         at = (at + kStride) % kRange;
-        tabs->FitIntoRect({0, 0, kHeight, static_cast<short>(kNarrowest + at)});
+        FitInto(static_cast<short>(kNarrowest + at));
     }
+    void FitInto(short width) { tabs->FitIntoRect({0, 0, kHeight, width}); }
     void Repaint() {
         tabs->Inval();
         UpdateGlog(glog);
@@ -61,5 +64,25 @@ void FitAndRepaint(benchmark::State &state) {
     }
 }
 BENCHMARK(FitAndRepaint)->Name("Tabs/fit and repaint");
+
+void Repaint(benchmark::State &state) {
+    TabPage page;
+    page.FitInto(kWidth);
+    for (auto _ : state)
+        page.Repaint();
+}
+BENCHMARK(Repaint)->Name("Tabs/repaint");
+
+// Names and nothing else: no tabs behind them.
+void RepaintBare(benchmark::State &state) {
+    BarePicture picture(kWidth, kHeight);
+    for (int i = 0; i < kTabs; ++i)
+        picture.Add("Track " + std::to_string(i + 1), kTabFont, i * (kWidth / kTabs), 8);
+    for (auto _ : state)
+        picture.Repaint();
+    if (picture.IsBlank())
+        state.SkipWithError("nothing has been drawn");
+}
+BENCHMARK(RepaintBare)->Name("Tabs/repaint bare");
 
 } // namespace

@@ -3,6 +3,7 @@
 //     storm [--events N] [--seed N] [--calm] [SUBJECT...]     a page of the gallery, or "dialogs"; all
 //     without one storm --replay [--tell] [--calm] [--here] --seed N --events N [--without A-B,C...] SUBJECT
 //     storm --shorten --seed N --events N SUBJECT
+//     storm --list                                            all subjects
 //
 // A run that fails says with which seed and at which step, and how to replay it. --calm leaves out what
 // happens inside messages; --tell writes every step and message; --here runs in this process, for a debugger.
@@ -23,7 +24,7 @@ long const kStepsOfPage = 20000, kStepsOfDialog = 4000;
 struct Request {
     StormPlan plan;
     std::vector<std::string> subjects;
-    bool replays = false, shortens = false, here = false;
+    bool replays = false, shortens = false, here = false, lists = false;
 };
 
 [[noreturn]] void Misused(std::string const &what) {
@@ -86,6 +87,8 @@ Request Read(int argc, char **argv) {
             request.shortens = true;
         else if (word == "--here")
             request.here = true;
+        else if (word == "--list")
+            request.lists = true;
         else if (word[0] == '-')
             Misused("there is no " + word);
         else
@@ -191,7 +194,10 @@ int main(int argc, char **argv) {
             request.subjects = AllSubjects(request.plan.gallery);
         bool passed = true;
         for (std::string const &subject : request.subjects)
-            passed = Carry(request, subject) && passed;
+            if (request.lists)
+                std::printf("%s\n", subject.c_str());
+            else
+                passed = Carry(request, subject) && passed;
         return passed ? EXIT_SUCCESS : EXIT_FAILURE;
     } catch (std::exception const &error) {
         std::fprintf(stderr, "storm: %s\n", error.what());
