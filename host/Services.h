@@ -2,6 +2,7 @@
 #pragma once
 #include "host/Geometry.h"
 #include "host/MouseTask.h"
+#include <functional>
 
 namespace OS {
 namespace Services {
@@ -25,6 +26,11 @@ bool MouseIsDragging(Point *where, double *when);
 // The same, but waits no longer than the given seconds. When the time runs out it answers true with the
 // position unchanged and the result kTimedOut. The result may be null.
 bool MouseIsDraggingWithTimeout(double seconds, Point *where, double *when, MouseTracking::Result *);
+
+// The same for a loop that would do nothing at the end of that time: as long as `rests` is true, and the
+// mouse does not move, the program sleeps on. It is asked whenever something else has run meanwhile. Once it
+// is false this answers as if it had been called again at the end of each such time.
+bool MouseIsDraggingUnlessAtRest(double seconds, Point *where, std::function<bool()> const &rests);
 
 // Lets the application run for the given seconds.
 void Yield(double seconds);

@@ -10,6 +10,7 @@
 #include "scrolling/CurrentTick.h"
 #include "scrolling/Truncation.h"
 #include <algorithm>
+#include <functional>
 #include <limits>
 
 namespace {
@@ -128,16 +129,18 @@ public:
         list.DoSelect(line, flag + delta, false);
     }
 
-    // Follows the mouse; false when the list has been deleted.
+    // Follows the mouse; false when the list has been deleted. A pass that finds what the one before has
+    // dealt with does nothing, so that nobody is woken for it.
     bool Follow() {
         double const wait = MouseTask::DefaultAutoScrollTime();
+        std::function<bool()> const rests = [this] { return self.PaneExists() && FindsTheSame(); };
         do {
             list.Prepare();
             Pass();
             if (!self.PaneExists())
                 return false;
             list.Prepare(); // the wait answers in the coordinates of this port
-        } while (MouseIsDraggingWithTimeout(wait, &point, nullptr, nullptr) && self.PaneExists());
+        } while (MouseIsDraggingUnlessAtRest(wait, &point, rests) && self.PaneExists());
         return self.PaneExists();
     }
 
@@ -153,10 +156,19 @@ private:
         return std::max(list.selected.LastSelectedTo(line), 0);
     }
 
+    // Outside of the column that selects nothing is to be done.
+    bool IsDealtWith() const {
+        return (list.selColumn != kAnyColumn && column != list.selColumn) || line == lastLine;
+    }
+    bool FindsTheSame() const {
+        int hitLine = line, hitColumn = column;
+        list.CheckHit(point, &hitLine, &hitColumn);
+        return hitLine == line && hitColumn == column && IsDealtWith();
+    }
+
     void Pass() {
         list.CheckHit(point, &line, &column);
-        bool const isElsewhere = list.selColumn != kAnyColumn && column != list.selColumn;
-        if (isElsewhere || line == lastLine)
+        if (IsDealtWith())
             return;
         if (list.res.selMode == kListSelectOne && list.selFirst != line) {
             if (MoveSelection())

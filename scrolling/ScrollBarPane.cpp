@@ -237,15 +237,23 @@ void ScrollBarPane::EnableParts(bool enable) {
     thumb->SetEnabled(enable);
 }
 
+// Panes may have been put into a bar, and what they tell of may delete it.
+
 void ScrollBarPane::Activate() {
+    PaneWatch const self(this);
     CompoundPane::Activate();
+    if (!self.PaneExists())
+        return;
     EnableParts(enabled);
     Inval();
 }
 
 // `enabled` stays, so that Activate brings the parts back.
 void ScrollBarPane::Deactivate() {
+    PaneWatch const self(this);
     CompoundPane::Deactivate();
+    if (!self.PaneExists())
+        return;
     EnableParts(activeInBackground && enabled);
     Inval();
 }

@@ -217,8 +217,12 @@ void CompoundPane::Deactivate() {
     compoundRep->ForEach(*this, [](GlogPane &pane) { pane.Deactivate(); });
 }
 
+// What loses its activation tells of it, and whoever hears that may delete any pane.
 void CompoundPane::SetActive() {
+    PaneWatch const self(this);
     GlogPane::SetActive();
+    if (!self.PaneExists())
+        return;
     compoundRep->ForEach(*this, [](GlogPane &pane) { pane.SetActive(); });
 }
 

@@ -7,6 +7,7 @@
 #include "desktop/panes/PortKeeper.h"
 #include "desktop/windows/HelpTagWindow.h"
 #include <algorithm>
+#include <cmath>
 
 namespace {
 
@@ -327,19 +328,28 @@ void EventLoop::TakeDeferredDrag() {
     }
 }
 
-bool EventLoop::NextDragPoint(double limit, Point &where, double &when, bool &timedOut) {
+bool EventLoop::NextDragPoint(double limit, Point &where, double &when, bool &timedOut,
+                              Condition const &rests) {
     timedOut = false;
-    double const deadline = limit < 0 ? -1 : windows.Now() + limit;
+    double const start = windows.Now();
+    double deadline = limit < 0 ? -1 : start + limit;
+    Condition const isAwake = [&rests] { return !rests(); };
     HostCall const call;
     while (heldWindow) {
         if (pointer.empty()) {
             InputEvent event;
-            if (Take(event, deadline, WindowSystem::Waiter::kTracking, "a drag with the mouse")) {
+            bool const sleeps = limit > 0 && rests && rests();
+            if (Take(event, sleeps ? -1 : deadline, WindowSystem::Waiter::kTracking, "a drag with the mouse",
+                     sleeps ? isAwake : nullptr)) {
                 Sort(event);
                 continue;
             }
             if (quitting || !heldWindow)
                 break;
+            if (sleeps) {
+                deadline = start + limit * (std::floor((windows.Now() - start) / limit) + 1);
+                continue;
+            }
             timedOut = true;
             where = lastPoint;
             when = windows.Now();

@@ -38,8 +38,9 @@ public:
     bool IsTracking() const { return heldWindow != nullptr; }
     PlatformWindow *HeldWindow() const { return heldWindow; }
     // Blocks until the pointer has moved or the button is up; true while it is down. A negative limit is
-    // none.
-    bool NextDragPoint(double limit, Point &where, double &when, bool &timedOut);
+    // none. While `rests` is true the limit does not end the wait; after that the next multiple of it does.
+    bool NextDragPoint(double limit, Point &where, double &when, bool &timedOut,
+                       Condition const &rests = nullptr);
     bool ButtonStillDown();
     PlatformWindow *WindowOf(DrawingPort &) const; // null for a port without window
 

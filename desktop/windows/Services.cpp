@@ -23,11 +23,12 @@ Point LocalToPort(Point place, PlatformWindow const *window) {
     return {static_cast<short>(v), static_cast<short>(h)};
 }
 
-bool NextPoint(double limit, Point *where, double *when, bool &timedOut) {
+bool NextPoint(double limit, Point *where, double *when, bool &timedOut,
+               std::function<bool()> const &rests = nullptr) {
     Point place;
     double time = 0;
     PlatformWindow const *const window = EventLoop::Instance().HeldWindow();
-    if (!EventLoop::Instance().NextDragPoint(limit, place, time, timedOut))
+    if (!EventLoop::Instance().NextDragPoint(limit, place, time, timedOut, rests))
         return false;
     // With no movement the position stays what the caller has.
     if (where && !timedOut)
@@ -36,6 +37,8 @@ bool NextPoint(double limit, Point *where, double *when, bool &timedOut) {
         *when = time;
     return true;
 }
+
+double Limit(double seconds) { return std::isfinite(seconds) && seconds > 0 ? seconds : 0; }
 
 } // namespace
 
@@ -60,10 +63,15 @@ bool MouseIsDragging(Point *where, double *when) {
 
 bool MouseIsDraggingWithTimeout(double seconds, Point *where, double *when, MouseTracking::Result *result) {
     bool timedOut = false;
-    bool const down = NextPoint(std::isfinite(seconds) && seconds > 0 ? seconds : 0, where, when, timedOut);
+    bool const down = NextPoint(Limit(seconds), where, when, timedOut);
     if (result)
         *result = timedOut ? MouseTracking::kTimedOut : MouseTracking::Result(0);
     return down;
+}
+
+bool MouseIsDraggingUnlessAtRest(double seconds, Point *where, std::function<bool()> const &rests) {
+    bool timedOut = false;
+    return NextPoint(Limit(seconds), where, nullptr, timedOut, rests);
 }
 
 void Yield(double seconds) { EventLoop::Instance().Pause(std::isfinite(seconds) ? seconds : 0); }

@@ -1,7 +1,9 @@
 // A press that is held and moved: over rows, off the list, and over a cell that works as a button.
+#include "host/CIdleChore.h"
 #include "host/VelaDrawing.h"
 #include "tests/lists/ListTest.h"
 #include <algorithm>
+#include <functional>
 #include <limits>
 
 namespace {
@@ -36,6 +38,82 @@ std::string const kRelease = "release\n";
 } // namespace
 
 // One row
+
+namespace {
+
+// Counts the times at which whoever follows the mouse goes round.
+class CountingChore : public CIdleChore {
+public:
+    CountingChore()
+        : CIdleChore(0, kNoInitialDelay) {
+        Assign();
+    }
+    int count = 0;
+
+private:
+    void DoIdle() override { ++count; }
+};
+
+// Runs once, in the middle of a press.
+class OneChore : public CIdleChore {
+public:
+    OneChore(int ticks, std::function<void()> const &action_)
+        : CIdleChore(ticks, kInitialDelay)
+        , action(action_) {
+        Assign();
+    }
+
+private:
+    void DoIdle() override {
+        Cancel();
+        action();
+    }
+    std::function<void()> const action;
+};
+
+} // namespace
+
+TEST_F(GListPaneDragTest, WhileTheMouseRestsOnARowNothingWakes) {
+    Shown(5, kListSelectOne);
+    CountingChore chore;
+    desktop.Play(Press(1) + Wait(10) + kRelease);
+    int const resting = chore.count;
+    desktop.Play(Press(3) + Wait(20) + kRelease);
+    EXPECT_EQ(chore.count, 2 * resting) << "longer is no more often";
+}
+
+TEST_F(GListPaneDragTest, WhileTheMouseRestsOutsideOfTheColumnNothingWakes) {
+    Shown(5, kListSelectOne);
+    CountingChore chore;
+    desktop.Play(Press(1) + Move(3, 1) + Wait(10) + kRelease);
+    int const resting = chore.count;
+    desktop.Play(Press(1) + Move(3, 1) + Wait(20) + kRelease);
+    EXPECT_EQ(chore.count, 2 * resting);
+}
+
+TEST_F(GListPaneDragTest, RowsThatMoveUnderAMouseAtRestAreFollowed) {
+    GListPane *const list = Shown(100, kListSelectOne);
+    Rows before, after;
+    OneChore moving(66, [&] { // 1.1 seconds: the press is after one
+        list->SetScrollPosition(7);
+        before = SelectedRows(*list);
+    });
+    OneChore looking(70, [&] { after = SelectedRows(*list); });
+    desktop.Play(Press(1) + Wait(1) + kRelease);
+    EXPECT_EQ(before, Rows{1});
+    EXPECT_EQ(after, Rows{8}) << "at the next of the times at which a list looks";
+    EXPECT_EQ(SelectedRows(*list), Rows{8});
+}
+
+TEST_F(GListPaneDragTest, AfterARestADragOffTheListScrollsAsOften) {
+    GListPane *const list = Shown(100, kListSelectOne);
+    desktop.Play(Press(1) + Wait(3) + Below() + Wait(0.5) + kRelease);
+    int const rested = list->GetScrollPos();
+    list->SetScrollPosition(0);
+    desktop.Play(Press(1) + Below() + Wait(0.5) + kRelease);
+    EXPECT_EQ(list->GetScrollPos(), rested);
+    EXPECT_GT(rested, 5);
+}
 
 TEST_F(GListPaneDragTest, TheOneRowFollowsTheMouse) {
     GListPane *const list = Shown(5, kListSelectOne);

@@ -7,6 +7,21 @@
 
 namespace {
 
+// Does away with the bar when it becomes active or no longer is.
+class Deleting : public GlogPane {
+public:
+    Deleting(glogRec *owner, GlogPane *victim_)
+        : victim(victim_) {
+        GlogPaneInit(owner, 0);
+    }
+    void Activate() override { delete victim; }
+    void Deactivate() override { delete victim; }
+    void DrawGuts(OSRgn *) override {}
+
+private:
+    GlogPane *const victim;
+};
+
 // Where a client is called in the middle of things.
 enum Moment { kInhibit, kGreatest, kStart, kScroll, kScrollTo, kDelay, kDone };
 
@@ -107,6 +122,24 @@ TEST_P(DuringGesture, TheClientMayHandTheBarToAnother) {
     EXPECT_EQ(bar->GetClient(), &client);
     // Whoever is the client at the end hears of it.
     EXPECT_EQ(client.log.empty(), GetParam().moment == kDone);
+}
+
+TEST_F(ScrollBarReentrancy, APaneInTheBarMayDeleteItWhenItBecomesInactive) {
+    bar->Add(new Deleting(glog, bar), -1);
+    bar->Deactivate();
+    EXPECT_FALSE(watch.PaneExists());
+}
+
+TEST_F(ScrollBarReentrancy, APaneInTheBarMayDeleteItWhenItBecomesActive) {
+    bar->Add(new Deleting(glog, bar), -1);
+    bar->Activate();
+    EXPECT_FALSE(watch.PaneExists());
+}
+
+TEST_F(ScrollBarReentrancy, APaneInTheBarMayDeleteItWhenTheWindowBecomesInactive) {
+    bar->Add(new Deleting(glog, bar), -1);
+    desktop.Play("activate off");
+    EXPECT_FALSE(watch.PaneExists());
 }
 
 TEST_P(DuringGesture, TheClientMayDeleteANeighbour) {
