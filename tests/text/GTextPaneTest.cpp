@@ -267,6 +267,8 @@ TEST_F(GTextPaneTest, WhatIsHiddenOrNotEditableCannotBeSelected) {
     pane->SetVisibility(1);
     pane->SetMode(1);
     EXPECT_FALSE(pane->Selectable());
+    EXPECT_FALSE(pane->CanTabIn());
+    EXPECT_EQ(pane->Tab(1), 3);
     EXPECT_FALSE(Make(TestItem().Integer("NotSelectable", 1))->Selectable());
 }
 
@@ -375,6 +377,14 @@ TEST_F(GTextPaneTest, InAnyOtherModeNoKeyIsUsed) {
     EXPECT_EQ(Press(*pane, 'a'), 0);
     EXPECT_EQ(Press(*pane, kEscape), 0);
     EXPECT_EQ(ear.Take(), Heard());
+}
+
+TEST_F(GTextPaneTest, KeysAreUsedInEditableModeAlsoWhereItCannotBeSelected) {
+    OpenTextField *const pane = Make(TestItem().Integer("NotSelectable", 1));
+    FieldEar ear(*pane);
+    EXPECT_EQ(Press(*pane, kEscape), -1);
+    EXPECT_EQ(Press(*pane, kReturn), -1);
+    EXPECT_EQ(ear.Take(), (Heard{"Reset", "Confirmation", "Activity", "Confirmation"}));
 }
 
 TEST_F(GTextPaneTest, LettersOfOtherScriptsAndCompositionsDoNotPassThroughKey) {
@@ -663,6 +673,27 @@ TEST_F(GTextPaneTest, CommandsSayWhetherTheyCount) {
         EXPECT_TRUE(pane->Clear(commits));
         EXPECT_EQ(pane->GetText(), UString());
     }
+}
+
+TEST_F(GTextPaneTest, CommandsChangeTheSelectionAloneAndOnlyPastingIsActivity) {
+    OpenTextField *const pane = Make(TestItem().String("InitTextID", "Bass"));
+    FieldEar ear(*pane);
+    bool commits = false;
+    pane->SetSelection(1, 2);
+    pane->Copy();
+    EXPECT_EQ(ear.Take(), Heard());
+    EXPECT_TRUE(pane->Clear(commits));
+    EXPECT_EQ(pane->GetText(), Text("Bss"));
+    EXPECT_EQ(ear.Take(), (Heard{"Changed"}));
+    pane->SetSelection(1, 3);
+    pane->Cut(commits);
+    EXPECT_EQ(pane->GetText(), Text("B"));
+    EXPECT_EQ(ear.Take(), (Heard{"Changed"}));
+    pane->SelectAll();
+    EXPECT_EQ(ear.Take(), Heard());
+    pane->Paste(commits);
+    EXPECT_EQ(pane->GetText(), Text("ss"));
+    EXPECT_EQ(ear.Take(), (Heard{"Activity", "Changed"}));
 }
 
 // Drawing

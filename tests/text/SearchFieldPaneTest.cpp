@@ -475,6 +475,31 @@ TEST_F(SearchFieldPaneTest, AClickThatFailsLeavesTheButtonAtRest) {
     EXPECT_EQ(Traced(*pane, [&] { pane->DrawBackgroundGuts(nullptr); }).back(), idle.front());
 }
 
+TEST_F(SearchFieldPaneTest, AClickAboveOrBelowTheButtonIsNoneOnIt) {
+    OpenSearchField *const pane = Make();
+    SearchEar ear(*pane);
+    pane->Prepare();
+    EventRecordAdapter event;
+    event.what = 1;
+    for (short v : {short(kTop - 1), short(kTop + 20)}) {
+        event.where = {v, kLeft + 190};
+        EXPECT_EQ(pane->HandleClick(&event), 0) << v;
+    }
+    EXPECT_EQ(ear.Take(), Heard());
+}
+
+TEST_F(SearchFieldPaneTest, AKeyThatTheTextHasNoUseForIsToldAndAnsweredAsTheTextDoes) {
+    OpenSearchField *const pane = Make();
+    TextOf(*pane).SetText(U("ab"));
+    TextOf(*pane).SetMode(1);
+    SearchEar ear(*pane);
+    EventRecordAdapter letter;
+    letter.what = 3;
+    letter.message = 'c';
+    EXPECT_EQ(TextOf(*pane).Key(&letter), 0);
+    EXPECT_EQ(ear.Take(), (Heard{"Text ab"}));
+}
+
 TEST_F(SearchFieldPaneTest, AClickIntoTheTextIsAnsweredAsTheTextDoes) {
     Make();
     EXPECT_EQ(ResultOfClick("click " + std::to_string(kLeft + 60) + " " + std::to_string(kTop + 10)), -1);

@@ -84,6 +84,8 @@ TEST_F(SearchHilite, InEnglishPunctuationIsABlank) {
     EXPECT_EQ(Mark(U("hat"), U("Hi-hat")), Span(U("Hi-hat"), 3, 6));
     EXPECT_EQ(Mark(U("hi.h"), U("Hi-hat")), Span(U("Hi-hat"), 0, 4));
     EXPECT_EQ(Mark(U("-h"), U("Hi-hat")), kNothing); // two blanks
+    EXPECT_EQ(Mark(U("12"), U("Take 12")), Span(U("Take 12"), 5, 7)) << "digits are none";
+    EXPECT_EQ(Mark(U("2"), U("Take 12")), kNothing);
 }
 
 TEST_F(SearchHilite, InEnglishLettersBeyondAsciiAreBlanks) {

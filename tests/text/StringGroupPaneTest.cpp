@@ -193,6 +193,15 @@ TEST_F(StringGroupTest, EachStringIsAPartOfItsOwnUnderThePanesName) {
     }
 }
 
+TEST_F(StringGroupTest, ItsPartsHaveTheNameThatItsOwnItemHas) {
+    StringGroupPane *const pane = NewPair();
+    PaneAccess::Rep(*pane).layoutItem = GlogLayout::MakeRectItem({0, 0, 0, 0}, 5, 0, "Labels");
+    pane->GetFromXML(item.Sheet());
+    ASSERT_EQ(PaneAccess::Rep(*pane).subItems.size(), 4U);
+    EXPECT_EQ(std::string(PaneAccess::Rep(*pane).subItems[1]->GetName()), "");
+    EXPECT_EQ(std::string(PaneAccess::Rep(*pane).subItems[2]->GetName()), "Labels");
+}
+
 TEST_F(StringGroupTest, AnEmptyListHasNoParts) { EXPECT_EQ(New()->NumLayoutSubItems(), 0); }
 
 TEST_F(StringGroupTest, ALineSpacingBeyondSixteenBitsEndsThere) {

@@ -102,7 +102,11 @@ TEST_F(TextPaneTest, WithWrappedTextBeginsAtTheTop) {
 TEST_F(TextPaneTest, TakesItsFontFromTheItem) {
     TextPane *const zero = New(Item()), *const seven = New(Item().Integer("FSRID", 7));
     EXPECT_NE(zero->GetTextWidth(), seven->GetTextWidth());
+    TextPane *const one = New(Item().Integer("FSRID", 1));
+    EXPECT_NE(one->GetTextWidth(), zero->GetTextWidth());
     EXPECT_EQ(New(Item().Integer("FSRID", 30))->GetTextWidth(), zero->GetTextWidth());
+    EXPECT_EQ(New(Item().Integer("FSRID", 31))->GetTextWidth(), one->GetTextWidth());
+    EXPECT_EQ(New(Item().Integer("FSRID", 0x107))->GetTextWidth(), seven->GetTextWidth());
     zero->SetFont(7);
     EXPECT_EQ(zero->GetTextWidth(), seven->GetTextWidth());
 }
