@@ -1,3 +1,7 @@
+#include "host/OSFont.h"
+#include "host/OSPort.h"
+#include "host/PortSavers.h"
+#include "host/VelaDrawing.h"
 #include "tests/dialogs/DialogTest.h"
 #include "text/MultiStringPane.h"
 #include "text/StringGroupPane.h"
@@ -14,6 +18,17 @@ protected:
     static int HeightOf(GlogPane *pane) {
         Rect const r = pane->GetLayoutRect()->GetItemRect();
         return r.bottom - r.top;
+    }
+    // The drawing calls of the name, when the pane's dialog is shown.
+    std::vector<std::string> Drawn(GlogPane *pane, std::string const &operation) {
+        desktop.TakeDrawing(); // from here on it is written down
+        ShowGlog(pane->GetGlog(), kShowGlog);
+        UpdateGlog(pane->GetGlog());
+        std::vector<std::string> calls;
+        for (std::string const &line : desktop.TakeDrawing())
+            if (Holds(line, "\"op\":\"" + operation + "\""))
+                calls.push_back(line);
+        return calls;
     }
     // The first item of a group, laid out.
     GlogPane *InGroup(std::string const &item) {
@@ -49,12 +64,63 @@ TEST_F(StringItemsTest, ATextIsShortenedByThreeWordsOnly) {
     EXPECT_TRUE(Holds(ComplaintAboutItem("Text", kPlace), "Text"));
 }
 
+TEST_F(StringItemsTest, ATextIsDrawnAsItsKeysSay) {
+    auto const drawn = [this](std::string const &keys) {
+        std::vector<std::string> const calls =
+            Drawn(LoadOne<TextPane>("Text", kPlace + "<Text>Take 1</Text>" + keys), "DrawTextLayoutInRect");
+        return calls.size() == 1 ? calls[0] : std::to_string(calls.size()) + " calls";
+    };
+    struct {
+        char const *word, *truncation;
+    } const words[] = {{"None", "none"}, {"End", "end"}, {"Middle", "middle"}};
+    for (auto const &c : words) {
+        std::string const line = drawn(std::string("<Truncate>") + c.word + "</Truncate>");
+        EXPECT_TRUE(Holds(line, std::string("\"truncation\":\"") + c.truncation + "\"")) << line;
+    }
+    EXPECT_TRUE(Holds(drawn("<WrapText>1</WrapText>"), "\"wrap\":1"));
+    EXPECT_TRUE(Holds(drawn(""), "\"wrap\":0"));
+    EXPECT_NE(drawn("<Align>1</Align>"), drawn("<Align>2</Align>"));
+    EXPECT_EQ(drawn("<Align>0</Align>"), drawn(""));
+}
+
 TEST_F(StringItemsTest, AStyledTextHasItsParts) {
     StyledStringPane *const pane = LoadOne<StyledStringPane>(
         "StyledText", kPlace + "<Parts><Part><Text>Rate </Text></Part><Part><Text>96 kHz</Text><Face>1</Face>"
                                "<Size>14</Size><Color red=\"65535\" green=\"0\" blue=\"0\"/></Part></Parts>");
     EXPECT_EQ(BoxOf(pane), (Rect{10, 20, 60, 140}));
-    ShowGlog(pane->GetGlog(), kShowGlog);
+    std::vector<std::string> const parts = Drawn(pane, "DrawString");
+    ASSERT_EQ(parts.size(), 2U);
+    EXPECT_TRUE(Holds(parts[0], "\"text\":\"Rate")) << parts[0];
+    EXPECT_FALSE(Holds(parts[0], "\"fore\":[65535,0,0]")) << parts[0];
+    for (char const *told : {"\"text\":\"96 kHz\"", "\"face\":1", "\"size\":14", "\"fore\":[65535,0,0]"})
+        EXPECT_TRUE(Holds(parts[1], told)) << told << " in " << parts[1];
+}
+
+TEST_F(StringItemsTest, AStyledTextStandsAndErasesAsItsKeysSay) {
+    auto const load = [this](std::string const &keys) {
+        return LoadOne<StyledStringPane>("StyledText",
+                                         kPlace + keys + "<Parts><Part><Text>Rate</Text></Part></Parts>");
+    };
+    EXPECT_TRUE(Drawn(load(""), "EraseRect").empty());
+    std::vector<std::string> const erased = Drawn(load("<Erase>1</Erase>"), "EraseRect");
+    ASSERT_EQ(erased.size(), 1U);
+    EXPECT_TRUE(Holds(erased[0], "[10,20,60,140]")) << erased[0];
+    std::vector<std::string> const left = Drawn(load(""), "MoveTo");
+    EXPECT_EQ(Drawn(load("<Align>0</Align>"), "MoveTo"), left);
+    EXPECT_NE(Drawn(load("<Align>1</Align>"), "MoveTo"), left);
+    EXPECT_NE(Drawn(load("<Align>2</Align>"), "MoveTo"), Drawn(load("<Align>1</Align>"), "MoveTo"));
+}
+
+TEST_F(StringItemsTest, AStyledTextKeepsItsDistanceFromTheRightOnlyIfTold) {
+    for (bool const keeps : {false, true}) {
+        StyledStringPane *const pane =
+            LoadOne<StyledStringPane>("StyledText", kPlace + (keeps ? "<KeepRight>1</KeepRight>" : "") +
+                                                        "<Parts><Part><Text>Rate</Text></Part></Parts>");
+        Rect wider = {0, 0, 200, 400};
+        PositionGlog(pane->GetGlog(), &wider, false);
+        pane->CalcBox();
+        EXPECT_EQ(BoxOf(pane).right, keeps ? 140 + 80 : 140);
+    }
 }
 
 TEST_F(StringItemsTest, AStyledTextInAGroupIsAsHighAsItsHighestPart) {
@@ -86,6 +152,19 @@ TEST_F(StringItemsTest, AGroupOfStringsHasAllOfThem) {
     EXPECT_EQ(Utf8::FromUString(group->StringAt(0)), "Attack");
     EXPECT_EQ(Utf8::FromUString(group->StringAt(1)), "7");
     ShowGlog(group->GetGlog(), kShowGlog);
+}
+
+TEST_F(StringItemsTest, LoadingAGroupOfStringsLeavesThePort) {
+    glogRec *const other = desktop.NewGlog(GlogOptions().Size(50, 50));
+    SetPortToGlog(other);
+    fontSaveRec const font = {OS::Font::FamilyID(), 1, 33};
+    SetFontData(&font);
+    LoadOne<StringGroupPane>("StringGroup", "<TextList><Line><Text>Attack</Text></Line></TextList>");
+    OSPort *port = nullptr;
+    VelaDrawing::GetPort(&port);
+    ASSERT_EQ(port, other->GetPort());
+    EXPECT_EQ(VelaDrawing::GetPortTextSize(port), 33);
+    EXPECT_EQ(VelaDrawing::GetPortTextFace(port), 1);
 }
 
 TEST_F(StringItemsTest, AGroupOfStringsMayBeEmptyButNotWithoutAList) {

@@ -294,6 +294,19 @@ TEST_F(TextItemsTest, TheDumpTellsTextSelectionAndMode) {
         << Dump(pane->GetGlog());
 }
 
+TEST_F(TextItemsTest, OnlyWithStyleRunsMayPartsOfAFieldLookDifferently) {
+    auto const runsAfterAChange = [this](std::string const &keys) {
+        GTextPane *const pane = LoadField("<InitTextID>Bass left</InitTextID>" + keys);
+        OS::TextStyle style;
+        style.size = 20;
+        pane->SetSelection(0, 2);
+        pane->SetStyle(7, style);
+        return pane->GetNumberStyleRuns();
+    };
+    EXPECT_EQ(runsAfterAChange(""), 1u);
+    EXPECT_EQ(runsAfterAChange("<StyleRuns><Run><Start>6</Start><End>7</End></Run></StyleRuns>"), 4u);
+}
+
 // Records
 
 TEST_F(TextItemsTest, ARecordMakesAFieldWithItsTextAtByte24) {
@@ -303,6 +316,20 @@ TEST_F(TextItemsTest, ARecordMakesAFieldWithItsTextAtByte24) {
     EXPECT_EQ(TextOf(pane), "Bass \u00E9");
     EXPECT_EQ(pane->GetFontFSRID(), 1);
     EXPECT_EQ(TextOf(FieldRecord(0, 0, 0).Field()), "");
+}
+
+TEST_F(TextItemsTest, TheFirstOfTheTwoOffsetsOfARecordIsThatOfTheFrame) {
+    GTextPane *const pane = FieldRecord(0, 0, 0).Text("a").Field();
+    ASSERT_NE(pane, nullptr);
+    pane->SetBoxAndFrame(true, true);
+    desktop.TakeDrawing(); // from here on it is written down
+    ShowGlog(pane->GetGlog(), kShowGlog);
+    UpdateGlog(pane->GetGlog());
+    std::string drawn;
+    for (std::string const &line : desktop.TakeDrawing())
+        if (Holds(line, "\"op\":\"DrawTextEdit\""))
+            drawn = line;
+    EXPECT_TRUE(Holds(drawn, "[22,22,38,118]")) << drawn;
 }
 
 TEST_F(TextItemsTest, EachFlagOfARecordIsTheFieldsOwn) {
@@ -367,6 +394,16 @@ TEST_F(TextItemsTest, ABareTextIsEditedAsItsFlagsSay) {
     TextEditPane *const fixed = LoadEdit("<Text>a</Text><ReadOnly>1</ReadOnly>");
     Heard(fixed, "click 100 30\ntype \"b\"");
     EXPECT_EQ(TextOf(fixed), "a");
+}
+
+TEST_F(TextItemsTest, ABareTextThatLosesTheKeyboardIsEditedNoLonger) {
+    TextEditPane *const pane = LoadEdit("<Text>a</Text>");
+    Heard(pane, "click 100 30\ntype \"b\"");
+    EXPECT_TRUE(pane->GetTextEdit().IsActive());
+    pane->GetGlog()->SetCurItem(nullptr);
+    desktop.Play("type \"c\"");
+    EXPECT_FALSE(pane->GetTextEdit().IsActive());
+    EXPECT_EQ(TextOf(pane), "ab");
 }
 
 TEST_F(TextItemsTest, ABareTextTellsThatItHasScrolledOnlyWhereItFollows) {
