@@ -186,7 +186,7 @@ TEST_F(GTextPaneColors, WithoutItsGroundOnlyTheTextIsDrawnWhileItIsNotSelected) 
 
 // Taken over by a helper
 
-// Writes down the modes that it is given, and leaves colours of its own.
+// Writes down the modes that it is given, and leaves colours of its own. Must go before the list.
 class TintingHelper : public GTextPaneDrawingHelper {
 public:
     explicit TintingHelper(std::vector<int> &modes_)
@@ -214,6 +214,7 @@ TEST_F(GTextPaneColors, AHelperIsToldTheMode) {
     pane->SetupColors();
     pane->DrawTextWell(box);
     EXPECT_EQ(modes, (std::vector<int>{3, -3}));
+    pane->SetDrawingHelper(AutoPtr<GTextPaneDrawingHelper>());
 }
 
 TEST_F(GTextPaneColors, AHelpersColoursComeBeforeThoseOfTheField) {
@@ -224,6 +225,7 @@ TEST_F(GTextPaneColors, AHelpersColoursComeBeforeThoseOfTheField) {
     pane->SetDrawingHelper(AutoPtr<GTextPaneDrawingHelper>(new TintingHelper(modes)));
     pane->Inval();
     EXPECT_EQ(PixelAt(190, 28), PixelOf(kTinted.back));
+    pane->SetDrawingHelper(AutoPtr<GTextPaneDrawingHelper>());
 }
 
 TEST_F(GTextPaneColors, TheWellLeavesThePortsColours) {
@@ -238,6 +240,7 @@ TEST_F(GTextPaneColors, TheWellLeavesThePortsColours) {
     SaveColorRec after;
     GetColors(&after);
     EXPECT_EQ(after, others);
+    pane->SetDrawingHelper(AutoPtr<GTextPaneDrawingHelper>());
 }
 
 TEST_F(GTextPaneColors, ADerivedFieldMayFrameItsWellInItsOwnWay) {
