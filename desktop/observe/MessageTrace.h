@@ -19,7 +19,7 @@ public:
     static JsonLine Begin(std::string const &className, int id); // the same of a pane that may be gone
     static void Write(JsonLine const &);                         // to the sink
     static std::string ClassName(GlogPane &);                    // of the most derived class
-    static std::string ClassName(std::type_info const &);
+    static std::string ClassName(std::type_info const &);        // as sources write it
 
 private:
     static bool on;
