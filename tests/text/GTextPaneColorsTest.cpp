@@ -144,6 +144,20 @@ TEST_F(GTextPaneColors, ItsTextHasTheForeground) {
     EXPECT_TRUE(hasRed());
 }
 
+TEST_F(GTextPaneColors, TheEngineHasEachComponentAsAShareOfTheLargest) {
+    OpenTextField *const pane = Make(Bass());
+    RGBColor const color = {0xFFFF, 0x8001, 0x1234}, white = {0xFFFF, 0xFFFF, 0xFFFF};
+    pane->SetColors(color, white);
+    pane->Prepare();
+    pane->SetupColors();
+    OS::TextStyle style;
+    pane->GetStyle(15, style);
+    EXPECT_EQ(style.color.r, 1.0);
+    EXPECT_EQ(style.color.g, static_cast<double>(0x8001 / 65535.0f)) << "in single precision";
+    EXPECT_EQ(style.color.b, static_cast<double>(0x1234 / 65535.0f));
+    EXPECT_EQ(style.color.a, 1.0);
+}
+
 TEST_F(GTextPaneColors, OnceItHasItsColoursADrawingTakesNoneOfThePort) {
     Make();
     OpenTextField *const pane = new OpenTextField;
@@ -267,6 +281,9 @@ TEST_F(GTextPaneColors, ASelectionHasTheColourThatItIsGiven) {
         return PixelAt(28, 22);
     };
     std::uint32_t const usual = selected();
+    RGBColor ofTheSystem;
+    GetHiliteColor(&ofTheSystem);
+    EXPECT_EQ(usual, PixelOf(ofTheSystem));
     EXPECT_NE(usual, PixelAt(190, 22));
     RGBColor green = {0, 0xFFFF, 0}, black = {0, 0, 0};
     pane->SetCustomSelectionColor(&green);

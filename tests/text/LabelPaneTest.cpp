@@ -562,6 +562,16 @@ TEST_F(Label, ErasesNothingUnlessTold) {
     EXPECT_TRUE(Only("EraseRect", DrawingOf(*label)).empty());
 }
 
+TEST_F(Label, SetsItsBackgroundColourAlsoWithoutErasing) {
+    RGBColor const bluish = {0x1000, 0x2000, 0xC000};
+    label->SetPaneBackgroundColor(&bluish);
+    EXPECT_EQ(Drawn(), Traced(*label, [&] {
+                  SetBackgroundColor(bluish);
+                  SetForegroundColor(kDialogActiveTextColor);
+                  DrawStringAtPoint(Text("Level"), {10, 0}, 50, TextSettings::kTruncateNone);
+              }));
+}
+
 TEST_F(Label, ForgettingTheBackgroundColourKeepsThePortsOwn) {
     RGBColor const bluish = {0x1000, 0x2000, 0xC000};
     label->SetPaneBackgroundColor(&bluish);
