@@ -86,7 +86,6 @@ RATIOS = (
     Ratio("text of 600 x 400 / lines by Pango", "DrawAllThatShows", "DrawAllThatShowsBare"),
     Ratio("drag step in a cube / Cairo", "Panner/drag step", "Panner/drag step bare"),
     Ratio("graph of 1,000 points / Cairo", "Graph/repaint/1000", "Graph/repaint bare/1000"),
-    Ratio("graph of 100,000 points / Cairo", "Graph/repaint/100000", "Graph/repaint bare/100000"),
     Ratio("start to first frame / bare program", "Start/ours", "Start/bare", 1.15, "real_time"),
     Ratio("processor time of it / bare program", "Start/ours", "Start/bare"),
 )
