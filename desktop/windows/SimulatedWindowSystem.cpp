@@ -201,9 +201,9 @@ void SimulatedWindowSystem::Type(ScriptStep const &step) {
 }
 
 // A press where nothing of the program is would go nowhere. The mouse may move there, and pop-ups may lie
-// there.
+// there; steps that are no script's may be anything.
 void SimulatedWindowSystem::RequireWithin(SimulatedWindow const *target, ScriptStep const &step) const {
-    bool const maybe = !target || captured || step.kind == ScriptStep::kMove ||
+    bool const maybe = step.source.empty() || !target || captured || step.kind == ScriptStep::kMove ||
                        std::any_of(windows.begin(), windows.end(),
                                    [](SimulatedWindow const *window) { return window->IsPopup(); });
     if (maybe || (step.h >= 0 && step.h < target->Width() && step.v >= 0 && step.v < target->Height()))
