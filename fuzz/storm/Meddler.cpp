@@ -166,8 +166,10 @@ void SetRandomValue(ButtonGroupPane &group, Chance &chance) {
         chance.OneIn(5) ? boxes->SetAllToSame(chance.OneIn(2)) : boxes->SetOne(index, chance.OneIn(2));
     else if (RadioButtonPane *const radios = dynamic_cast<RadioButtonPane *>(&group))
         radios->RadioSet(index);
-    if (watch.PaneExists() && chance.OneIn(5) && group.CountButtonTexts() > 0)
+    if (watch.PaneExists() && chance.OneIn(5) && group.CountButtonTexts() > 0) {
         group.SetNthButtonName(chance.Below(group.CountButtonTexts()), RandomUString(chance));
+        group.Inval(); // which it leaves to its caller
+    }
 }
 
 // True for a pane that has a value.
