@@ -1,5 +1,6 @@
 #include "tools/gallery/SoundNames.h"
 #include "dialogs/Utf8.h"
+#include "host/XMLLib.h"
 #include "text/SearchedForm.h"
 #include "tools/gallery/LabelText.h"
 #include <algorithm>
@@ -26,10 +27,6 @@ int const kScatter =
     61803; // shares no factor with the number of sounds: each comes once, without visible order
 int const kSecondsInMinute = 60, kLongest = 149;
 
-struct Sound {
-    UString name, form; // the form is what searches look at
-};
-
 UString NameOf(int sound) {
     long long const place = static_cast<long long>(sound) * kScatter % SoundNames::kCount;
     int const number = static_cast<int>(place);
@@ -41,21 +38,36 @@ UString NameOf(int sound) {
     return name;
 }
 
+typedef std::vector<UString> UStrings;
+
 // Made once for the program.
-std::vector<Sound> const &AllSounds() {
-    static std::vector<Sound> const all = [] {
-        std::vector<Sound> made(SoundNames::kCount);
-        for (int i = 0; i < SoundNames::kCount; ++i) {
-            Sound &sound = made[static_cast<std::size_t>(i)];
-            sound.name = NameOf(i);
-            sound.form = SearchedForm::OfText(sound.name);
-        }
+UStrings const &AllNames() {
+    static UStrings const names = [] {
+        UStrings made(SoundNames::kCount);
+        for (int i = 0; i < SoundNames::kCount; ++i)
+            made[static_cast<std::size_t>(i)] = NameOf(i);
         return made;
     }();
-    return all;
+    return names;
 }
 
-Sound const &SoundAt(int sound) { return AllSounds()[static_cast<std::size_t>(sound)]; }
+UStrings FormsOfNames() {
+    UStrings forms(AllNames().size());
+    std::transform(AllNames().begin(), AllNames().end(), forms.begin(), SearchedForm::OfText);
+    return forms;
+}
+
+// What searches look at. They are made again only for a desktop in another language, which may compare other
+// forms.
+UStrings const &FormsInSystemLanguage() {
+    static unsigned int language = 0; // no language
+    static UStrings forms;
+    if (language != XMLLib::GetSystemLanguageCode()) {
+        language = XMLLib::GetSystemLanguageCode();
+        forms = FormsOfNames();
+    }
+    return forms;
+}
 
 } // namespace
 
@@ -72,11 +84,14 @@ void SoundNames::Search(UString const &search) {
     sought = form;
     if (search.empty())
         return;
-    auto const fails = [&](int sound) { return SoundAt(sound).form.find(form, 0) == UString::npos; };
+    UStrings const &forms = FormsInSystemLanguage();
+    auto const fails = [&](int sound) {
+        return forms[static_cast<std::size_t>(sound)].find(form, 0) == UString::npos;
+    };
     found.erase(std::remove_if(found.begin(), found.end(), fails), found.end());
 }
 
-UString const &SoundNames::Name(int row) const { return SoundAt(Sound(row)).name; }
+UString const &SoundNames::Name(int row) const { return AllNames()[static_cast<std::size_t>(Sound(row))]; }
 
 UString SoundNames::Length(int row) const {
     int const seconds = 1 + Sound(row) % kScatter * 97 % kLongest, rest = seconds % kSecondsInMinute;
