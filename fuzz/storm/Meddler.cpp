@@ -82,7 +82,8 @@ void SetRandomValue(GListPane &list, Chance &chance) {
     }
 }
 
-void SetRandomValue(PopUpMenu &menu, Chance &chance) {
+void SetRandomValue(PopMPane &menu, Chance &chance) {
+    PaneWatch const watch(&menu);
     short const count = menu.CountItems(), some = static_cast<short>(chance.Below(count + 2));
     switch (chance.Below(7)) {
     case 0:
@@ -110,6 +111,8 @@ void SetRandomValue(PopUpMenu &menu, Chance &chance) {
     default:
         menu.SelectItem(some);
     }
+    if (watch.PaneExists())
+        menu.Inval(); // which all but a selection or a menu's enabling leaves to its caller
 }
 
 void SetRandomValue(TabPane &tabs, Chance &chance) {
