@@ -32,16 +32,18 @@ double Get(pugi::xml_node node, char const *name) { return node.attribute(name).
 
 } // namespace
 
-GridFit::GridFit(int width, int height, int deviceWidth, int deviceHeight)
-    : horizontal{double(width), double(deviceWidth)}
-    , vertical{double(height), double(deviceHeight)} {}
+GridFit::GridFit(int width, int height, int deviceWidth, int deviceHeight, int bodyHeight)
+    : horizontal{double(width), double(deviceWidth), double(width)}
+    , vertical{double(height), double(deviceHeight), double(bodyHeight)} {}
 
 bool GridFit::Axis::IsWhole() const { return std::fmod(deviceLength, length) == 0; }
 
 double GridFit::Axis::Snap(double position) const {
-    double const device = position * Scale();
-    return position > length / 2 ? deviceLength - std::floor(deviceLength - device + kRounding)
-                                 : std::floor(device + kRounding);
+    double const device = position * Scale(), deviceBody = std::round(body * Scale());
+    if (position > body)
+        return std::round(device);
+    return position > body / 2 ? deviceBody - std::floor((body - position) * Scale() + kRounding)
+                               : std::floor(device + kRounding);
 }
 
 double GridFit::Axis::Thickness(double logical) const {

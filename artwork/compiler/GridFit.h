@@ -5,11 +5,12 @@
 // and 1.5. Rectangles, circles and level or upright lines are fitted, with the width of their outlines;
 // curves, slanted lines, turned elements, what stands in inner groups and whatever carries data-fit="no" stay
 // as drawn. Distances from the right and bottom edge round as those from the left and top, so that what is
-// drawn symmetrical stays so.
+// drawn symmetrical stays so; below its body an icon may have a shadow, and then the bottom edge is the
+// body's.
 class GridFit {
 public:
-    // Sizes of the icon in logical and in device pixels.
-    GridFit(int width, int height, int deviceWidth, int deviceHeight);
+    // Sizes of the icon in logical and in device pixels, and the height of its body in logical ones.
+    GridFit(int width, int height, int deviceWidth, int deviceHeight, int bodyHeight);
 
     // Changes the geometry attributes of the group's elements; a no-op when the scale is a whole number.
     void Fit(pugi::xml_node group) const;
@@ -19,6 +20,7 @@ private:
     struct Axis {
         double length;
         double deviceLength;
+        double body; // length without the shadow
 
         double Scale() const { return deviceLength / length; }
         bool IsWhole() const;

@@ -6,6 +6,7 @@
 namespace {
 
 constexpr char kIconIdPrefix = 'i';
+constexpr char kShadow[] = "data-shadow";
 constexpr int kShortMin = std::numeric_limits<std::int16_t>::min();
 constexpr int kShortMax = std::numeric_limits<std::int16_t>::max();
 
@@ -84,6 +85,8 @@ void IconFamily::ReadMetadata() {
         !ParseInteger(size.substr(space + 1), height) || !validSide(width) || !validSide(height))
         source->Fail(root, "data-size must be two whole numbers, width and height, from 1 to " +
                                std::to_string(largestSide));
+    if (root.attribute(kShadow))
+        shadow = source->Integer(root, kShadow, 0, height - 1);
 }
 
 void IconFamily::ReadIcon(pugi::xml_node group) {
@@ -103,6 +106,8 @@ void IconFamily::ReadIcon(pugi::xml_node group) {
         source->Fail(group, "the frame must begin at 0, 0");
     if (std::string(frame.attribute("fill").value()) != "none")
         source->Fail(group, "the frame must have fill=\"none\"");
+    if (source->Integer(frame, "height", 1, largestSide) <= shadow)
+        source->Fail(group, "data-shadow says that all of the icon is shadow");
     icons.push_back({static_cast<std::int16_t>(index), source->Integer(frame, "width", 1, largestSide),
                      source->Integer(frame, "height", 1, largestSide), group});
 }

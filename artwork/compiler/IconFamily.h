@@ -6,7 +6,8 @@
 #include <vector>
 
 // The drawings of one icon family, as they stand in its SVG file. The root tells number, name and size of the
-// family (data-family, data-name, data-size="width height"); each icon is a group below the root with the id
+// family (data-family, data-name, data-size="width height") and how many rows at the bottom of its icons are
+// shadow only (data-shadow, 0 unless it is there); each icon is a group below the root with the id
 // "i" and its index, holding an invisible <rect class="frame"> of the icon's exact size. Where the group is
 // moved to on the sheet, by a translation, is for people only: an icon begins at its own frame.
 class IconFamily {
@@ -27,6 +28,7 @@ public:
     std::string const &Name() const { return name; }
     int Width() const { return width; }
     int Height() const { return height; }
+    int ShadowHeight() const { return shadow; }
     std::vector<Icon> const &Icons() const { return icons; } // by index
     Icon const *Find(int index) const;                       // null when it is not drawn
     pugi::xml_node Definitions() const { return source->Root().child("defs"); }
@@ -43,5 +45,6 @@ private:
     std::string name;
     int width = 0;
     int height = 0;
+    int shadow = 0;
     std::vector<Icon> icons;
 };

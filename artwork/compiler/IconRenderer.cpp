@@ -78,7 +78,8 @@ std::string IconRenderer::Compose(IconFamily::Icon const &icon, int deviceWidth,
         root.append_copy(family.Definitions());
     pugi::xml_node group = root.append_copy(icon.group);
     group.remove_attribute("transform");
-    GridFit(icon.width, icon.height, deviceWidth, deviceHeight).Fit(group);
+    GridFit(icon.width, icon.height, deviceWidth, deviceHeight, icon.height - family.ShadowHeight())
+        .Fit(group);
     ApplyPaints(root, icon.group);
     std::ostringstream out;
     document.save(out, "", pugi::format_raw);

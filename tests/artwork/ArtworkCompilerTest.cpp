@@ -174,6 +174,17 @@ TEST(ArtworkCompiler, RefusesAPictureThatIsTooLarge) {
     EXPECT_TRUE(Says(run.messages, "from 1 to 4096"));
 }
 
+TEST(ArtworkCompiler, RefusesIconsThatAreAllShadow) {
+    SampleArtwork sample;
+    sample.Write("icons/7.svg",
+                 "<svg xmlns=\"http://www.w3.org/2000/svg\" data-family=\"7\" data-name=\"Seven\" "
+                 "data-size=\"10 10\" data-shadow=\"4\"><g id=\"i0\"><rect class=\"frame\" "
+                 "width=\"9\" height=\"4\" fill=\"none\"/></g></svg>");
+    CompilerRun const run = RunCompiler(sample.Folder(), {"--out", sample.Output().string()});
+    EXPECT_EQ(1, run.status);
+    EXPECT_TRUE(Says(run.messages, "all of the icon is shadow"));
+}
+
 TEST(ArtworkCompiler, RefusesAFrameWithoutArea) {
     EXPECT_TRUE(
         Says(MessageFor("<g id=\"i0\"><rect class=\"frame\" width=\"0\" height=\"1\" fill=\"none\"/></g>"),

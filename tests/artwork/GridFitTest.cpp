@@ -10,7 +10,7 @@ class Fitted {
 public:
     Fitted(char const *element, int devicePixels) {
         document.load_string((std::string("<g>") + element + "</g>").c_str());
-        GridFit(20, 20, devicePixels, devicePixels).Fit(document.first_child());
+        GridFit(20, 20, devicePixels, devicePixels, 20).Fit(document.first_child());
         scale = devicePixels / 20.0;
     }
     // In device pixels.
@@ -98,4 +98,22 @@ TEST(GridFit, LeavesTurnedElementsAndThoseThatAskForIt) {
     EXPECT_NEAR(4.95, Fitted("<rect x=\"3.3\" width=\"5\" height=\"5\" transform=\"rotate(9)\"/>", 30)["x"],
                 kExact);
     EXPECT_NEAR(4.95, Fitted("<rect x=\"3.3\" width=\"5\" height=\"5\" data-fit=\"no\"/>", 30)["x"], kExact);
+}
+
+// A pane of twelve pixels at a scale of 1.5 shows eighteen rows, whether the icon has nineteen or twenty.
+TEST(GridFit, EndsTheBodyOnOneRowHoweverTheShadowBelowItRounds) {
+    for (int const rows : {19, 20}) {
+        pugi::xml_document document;
+        document.load_string("<g><rect x=\"0.5\" y=\"0.5\" width=\"11\" height=\"11\" stroke=\"black\"/>"
+                             "<rect x=\"0\" y=\"1\" width=\"12\" height=\"12\"/></g>");
+        GridFit(12, 13, 18, rows, 12).Fit(document.first_child());
+        pugi::xml_node const body = document.first_child().first_child(), shadow = body.next_sibling();
+        auto const end = [rows](pugi::xml_node rect) {
+            return (rect.attribute("y").as_double() + rect.attribute("height").as_double() +
+                    rect.attribute("stroke-width").as_double() / 2) *
+                   rows / 13;
+        };
+        EXPECT_NEAR(18, end(body), 0.1) << rows; // the outline's width is that of the other axis
+        EXPECT_NEAR(rows, end(shadow), kExact) << rows;
+    }
 }
