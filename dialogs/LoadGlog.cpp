@@ -12,7 +12,6 @@
 
 namespace {
 
-int const kOnTop = -1;
 std::size_t const kMostBytes = std::size_t(64) << 20; // of a dialog of records
 
 Desktop &OpenDesktop() {
@@ -138,7 +137,7 @@ void LoadItems(std::string const &path, CompoundPane *into) {
     for (DialogItem const &item : dialog.items)
         panes.push_back(maker.Make(item));
     for (GlogPane *pane : panes)
-        into->Add(pane, kOnTop);
+        GrowingPanes::MoveInto(*into, pane);
     PaneMaker::Guard(PlacesIn(maker, path), [&] { desktop.FinishGlog(glog); });
 }
 

@@ -27,7 +27,8 @@ glogRec *LoadGlogFromRecords(void const *bytes, std::size_t size, GlogOptions co
 glogRec *ReloadGlog(glogRec *shown, std::string const &path);
 
 // Adds the panes of an XML dialog to a container of a glog that stands already, and starts them; what the
-// dialog says about its own window is only checked. When that fails the container stays as it is.
+// dialog says about its own window is only checked. The glog is not drawn until the panes stand. When that
+// fails the container stays as it is.
 void LoadItems(std::string const &path, CompoundPane *into);
 
 // What LoadGlog would make the XML dialog's window with.

@@ -9,11 +9,7 @@
 #include "host/TarnError.h"
 #include <new>
 
-namespace {
-
-int const kOnTop = -1;
-
-} // namespace
+namespace {} // namespace
 
 void PaneMaker::Guard(PlaceOfKey const &placeOf, std::function<void()> const &make) {
     try {
@@ -68,5 +64,5 @@ void PaneMaker::MakeInside(GlogPane *pane, DialogItem const &item) {
     if (!container)
         throw LoadError(item.place, "panes of this type hold no items");
     for (DialogItem const &inner : item.items)
-        container->Add(Make(inner), kOnTop);
+        GrowingPanes::MoveInto(*container, Make(inner));
 }

@@ -301,6 +301,8 @@ void Glog::DamageAll() { DamageWindowRect({0, 0, Coordinate16(height), Coordinat
 void Glog::DamageWindowRect(Rect const &r) { port.DamageWindow(r); }
 
 void Glog::Update() {
+    if (makings > 0)
+        return;
     if (started && hasNewPanes)
         StartPanes();
     if (!shown || !surface || updateRegion)
@@ -325,7 +327,9 @@ void Glog::Update() {
         Present(shownBoxes);
 }
 
-bool Glog::NeedsUpdate() const { return shown && (layoutInvalid || !Region::IsEmpty(port.GetDamage())); }
+bool Glog::NeedsUpdate() const {
+    return shown && makings == 0 && (layoutInvalid || !Region::IsEmpty(port.GetDamage()));
+}
 
 DeviceRect Glog::DeviceBounds(OSRgn const &region) const {
     Rect const bounds = Region::Bounds(region);

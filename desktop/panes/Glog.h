@@ -68,6 +68,10 @@ public:
     // Drawing
     // Redraws what is damaged and presents it, and what was drawn outside an update too.
     void Update();
+    // In between, Update does nothing: panes that are being made do not stand yet where they will, and have
+    // not been started. Calls may be nested.
+    void BeginMakingPanes() { ++makings; }
+    void EndMakingPanes() { --makings; }
     void DamageAll();
     void DamageWindowRect(Rect const &);
     bool NeedsUpdate() const; // something visible waits to be redrawn
@@ -151,6 +155,7 @@ private:
     bool activatedByMouseDown = false;
     bool idling = false;
     bool hasNewPanes = false;
+    int makings = 0;
     bool placed = false;
     Rect screenPlace{0, 0, 0, 0};
 };

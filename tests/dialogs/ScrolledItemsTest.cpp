@@ -1,7 +1,10 @@
+#include "desktop/drawing/Surface.h"
 #include "scrolling/ScrollGridPlus.h"
 #include "scrolling/ScrollPane.h"
 #include "tests/dialogs/DialogTest.h"
 #include "tests/resources/TemporaryDirectory.h"
+#include <cstdint>
+#include <vector>
 
 namespace {
 
@@ -9,7 +12,20 @@ std::string const kPlace = "<BoundsRect top=\"10\" left=\"20\" bottom=\"110\" ri
 std::string const kBox =
     "<Item type=\"Box\"><BoundsRect top=\"300\" left=\"30\" bottom=\"340\" right=\"530\"/></Item>";
 
-class ScrolledItems : public DialogTest {};
+// Thirty pixels of its box lie beyond its right edge.
+std::string const kStuckGrid =
+    "<Item type=\"ScrollGrid\">" + kPlace +
+    "<StickToEnd>1</StickToEnd><Items><Item type=\"Box\"><BoundsRect top=\"0\" left=\"0\" bottom=\"40\" "
+    "right=\"230\"/></Item></Items></Item>";
+
+class ScrolledItems : public DialogTest {
+protected:
+    std::vector<std::uint32_t> Pixels(glogRec *glog) {
+        DesktopRep::Of(desktop).UpdateAll();
+        Surface const &drawn = *Glog::From(glog).Pixels();
+        return std::vector<std::uint32_t>(drawn.Pixels(), drawn.Pixels() + drawn.Width() * drawn.Height());
+    }
+};
 
 } // namespace
 
@@ -92,4 +108,34 @@ TEST_F(ScrolledItems, AreScrolledByTheBarsThatCameWithThem) {
         ScrollBarPane *const fresh = dynamic_cast<ScrollBarPane *>(place->FindByID(5));
         EXPECT_EQ(fresh->GetClient(), dynamic_cast<ScrollPane *>(place->FindByID(1)));
     }
+}
+
+// A grid that sticks to its end moves pixels, and updates its window, as soon as it holds a box that is
+// wider.
+TEST_F(ScrolledItems, AreNotDrawnBeforeTheyLieWhereTheyWill) {
+    TemporaryDirectory directory;
+    std::string const path =
+        directory.Write("page.xml", Dialog("<Item type=\"Group\"><Items>" + kStuckGrid + "</Items></Item>"));
+    glogRec *const glog = Load(Dialog("<Item type=\"Group\" id=\"9\"/>" + Item("OvalButton", kPlace)));
+    CompoundPane *const place = dynamic_cast<CompoundPane *>(GetGlogItem(glog, 9));
+    ShowGlog(glog, kShowGlog);
+    place->Hide();
+    std::vector<std::uint32_t> const before = Pixels(glog);
+    desktop.TakeDrawing();
+    LoadItems(path, place);
+    for (std::string const &line : desktop.TakeDrawing())
+        EXPECT_TRUE(Holds(line, "ScrollRect") || Holds(line, "InvalRgn")) << line;
+    EXPECT_EQ(Pixels(glog), before);
+}
+
+TEST_F(ScrolledItems, LeaveNothingOfThemselvesWhenTheyCannotBeMade) {
+    TemporaryDirectory directory;
+    std::string const path = directory.Write(
+        "page.xml", Dialog(kStuckGrid + Item("ScrollGrid", kPlace + "<ScrollBar>99</ScrollBar>")));
+    glogRec *const glog = Load(Dialog("<Item type=\"Group\" id=\"9\"/>" + Item("OvalButton", kPlace)));
+    CompoundPane *const place = dynamic_cast<CompoundPane *>(GetGlogItem(glog, 9));
+    ShowGlog(glog, kShowGlog);
+    std::vector<std::uint32_t> const before = Pixels(glog);
+    EXPECT_THROW(LoadItems(path, place), LoadError);
+    EXPECT_EQ(Pixels(glog), before);
 }
