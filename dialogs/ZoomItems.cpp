@@ -99,6 +99,7 @@ public:
     DialogZoomButtons(glogRec *owner, ZoomLevel const &first, ZoomControlPane::Orientation orientation)
         : ZoomControlPane(owner, this, orientation)
         , level(first) {
+        SetNoErase(1); // what the buttons stand on shows at their corners
         UpdateControls();
     }
     ZoomLevel const &Level() const { return level; }

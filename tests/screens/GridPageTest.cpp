@@ -108,7 +108,7 @@ TEST_F(GridPage, AClickOnARowDrawsItAndTheOneThatWasChosenBefore) {
     Lines const texts = TextsIn(DrawingOf("click 600 333\n"));
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Drums 1"), 1);
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 9"), 1);
-    EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 9, row 9 of 1000"), 1);
+    EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 9, row 9 of 1,000"), 1);
     EXPECT_EQ(std::count(texts.begin(), texts.end(), "Percussion 2"), 0);
 }
 

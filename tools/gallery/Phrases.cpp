@@ -30,5 +30,5 @@ UString Phrases::Fill(Phrase phrase, std::initializer_list<UString> texts) {
 }
 
 UString Phrases::Fill(Phrase phrase, std::initializer_list<int> numbers) {
-    return Filled(phrase, numbers, LabelText::OfNumber);
+    return Filled(phrase, numbers, LabelText::OfThousands);
 }

@@ -87,6 +87,6 @@ UString Get(Phrase);
 // The phrase with its ^0 replaced by the first text, ^1 by the second, and so on; a mark without a text
 // stays.
 UString Fill(Phrase, std::initializer_list<UString> texts);
-UString Fill(Phrase, std::initializer_list<int> numbers); // in digits
+UString Fill(Phrase, std::initializer_list<int> numbers); // in digits, thousands apart
 
 } // namespace Phrases

@@ -3,6 +3,7 @@
 #include "frame/ResourceReading.h"
 #include "host/GlogLayout.h"
 #include "host/GlogStyleSheet.h"
+#include "host/PaneWatch.h"
 #include "host/glogRec.h"
 #include "tools/gallery/LabelText.h"
 #include <algorithm>
@@ -13,6 +14,7 @@ namespace {
 
 short const kWidth = 15, kHeight = 21; // pixels, of the icon
 int const kLeast = 1, kMost = 999;
+int const kHandled = -1;
 int const kUpperHalf = 1, kLowerHalf = 2; // as NextPrevClicked has them
 
 } // namespace
@@ -47,11 +49,13 @@ void StepperPane::BindToGroup() {
         group->SetAutoBinding(this, groupButton);
 }
 
+// Who hears that the stepper is used may do away with it.
 int StepperPane::HandleClick(EventRecordAdapter *event) {
     BindToGroup();
+    PaneWatch const watch(this);
     if (Provider<AutoSetActivityListener>::HasDependents())
         Provider<AutoSetActivityListener>::BroadcastChange(AutoSetActivityMsg(this), nullptr);
-    return NextPrevButton::HandleClick(event);
+    return watch.PaneExists() ? NextPrevButton::HandleClick(event) : kHandled;
 }
 
 void StepperPane::NextPrevClicked(int which) {

@@ -316,9 +316,9 @@ short TrackListPane::ChosenIndex() const { return chosen ? rows->Find(chosen) : 
 void TrackListPane::TellChosen() {
     if (!container)
         return;
-    UString const count = LabelText::OfNumber(rows->NumSubpanes());
+    UString const count = LabelText::OfThousands(rows->NumSubpanes());
     LabelText::Show(container->FindByID(labelID),
                     chosen ? Phrases::Fill(Phrase::kTrackRow,
-                                           {chosen->Name(), LabelText::OfNumber(ChosenIndex() + 1), count})
+                                           {chosen->Name(), LabelText::OfThousands(ChosenIndex() + 1), count})
                            : Phrases::Fill(Phrase::kNoTrack, {count}));
 }

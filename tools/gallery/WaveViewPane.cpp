@@ -86,6 +86,15 @@ private:
     WaveViewPane &view;
 };
 
+// The card shows at its corners.
+class WaveViewPane::ButtonPair : public ZoomControlPane {
+public:
+    ButtonPair(glogRec *owner, Client *zoomed)
+        : ZoomControlPane(owner, zoomed, kHorizontal) {
+        SetNoErase(1);
+    }
+};
+
 void WaveViewPane::Buttons::Zoom(bool zoomIn, bool) { view.ZoomStep(zoomIn); }
 
 bool WaveViewPane::Buttons::CanZoom(bool zoomIn) { return zoomIn ? view.zoom < 1.0f : view.zoom > 0.0f; }
@@ -120,7 +129,7 @@ void WaveViewPane::AddParts() {
     wave = new Wave(GetGlog(), *this, {0, 0, static_cast<short>(strip - 4), width});
     Add(wave, -1);
 
-    ZoomControlPane *const pair = new ZoomControlPane(GetGlog(), &buttons, ZoomControlPane::kHorizontal);
+    ButtonPair *const pair = new ButtonPair(GetGlog(), &buttons);
     pair->Offset({strip, 0});
     pair->SetID(kFirstPart);
     Add(pair, -1);

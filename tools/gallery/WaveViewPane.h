@@ -31,6 +31,7 @@ public:
 private:
     class Wave;
     class Slider;
+    class ButtonPair;
     class Buttons : public ZoomControlPane::Client {
     public:
         explicit Buttons(WaveViewPane &zoomed)
