@@ -2,6 +2,7 @@
 #include "host/EventRecordAdapter.h"
 #include "host/NamedColors.h"
 #include "host/OSFont.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/Services.h"
 #include "host/TextLayout.h"
@@ -65,9 +66,10 @@ void ListHeaderPane::Resize(int column, Point start) {
     int const width = columns->GetWidth(column), last = columns->GetNumColumns() - 1;
     int const widest =
         columns->GetRightEdge(last) - columns->GetLeftEdge(column) - (last - column) * kNarrowest;
+    PaneWatch const watch(this);
     Prepare();
     Point place = start;
-    while (MouseIsDragging(&place, nullptr)) {
+    while (MouseIsDragging(&place, nullptr) && watch.PaneExists()) {
         int const wanted = std::clamp(width + place.h - start.h, kNarrowest, std::max(widest, kNarrowest));
         columns->ResizeColumn(column, wanted);
         Inval();

@@ -8,6 +8,7 @@
 #include "host/GlogStyleSheet.h"
 #include "host/Icons.h"
 #include "host/NamedColors.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/TextLayout.h"
 #include "host/VelaDrawing.h"
@@ -65,7 +66,10 @@ public:
 
 protected:
     int HandleClick(EventRecordAdapter *event) override {
+        PaneWatch const watch(this);
         int const result = GListPane::HandleClick(event);
+        if (!watch.PaneExists())
+            return result;
         int line = 0, column = 0;
         GetClickParameters(line, column);
         if (result > 0 && line >= 0 && column >= 0) {

@@ -6,6 +6,7 @@
 #include "host/Icons.h"
 #include "host/NamedColors.h"
 #include "host/OSRgn.h"
+#include "host/PaneWatch.h"
 #include "host/PortSavers.h"
 #include "host/VelaDrawing.h"
 #include "text/LabelPane.h"
@@ -197,7 +198,9 @@ void TrackRowPane::DrawClips(OSRgn *updateRegion, Rect const &box) const {
 }
 
 int TrackRowPane::HandleClick(EventRecordAdapter *event) {
+    PaneWatch const watch(this);
     int const answer = CompoundPane::HandleClick(event);
-    listener(*this);
+    if (watch.PaneExists())
+        listener(*this);
     return answer ? answer : -1;
 }
