@@ -266,7 +266,11 @@ void EventLoop::WindowHidden(PlatformWindow *window) {
     if (!window)
         return;
     auto isHidden = [=](InputEvent const &event) { return event.window == window; };
-    pointer.erase(std::remove_if(pointer.begin(), pointer.end(), isHidden), pointer.end());
+    pointer.remove_if(isHidden);
+    // A press that waits goes too: its release may never come.
+    deferred.remove_if([=](InputEvent const &event) {
+        return isHidden(event) && (event.kind == InputEvent::kMouseDown || Drags(event));
+    });
     if (menuWindow == window)
         menuWindow = nullptr;
     if (heldWindow == window)
@@ -278,8 +282,7 @@ void EventLoop::WindowGone(PlatformWindow *window) {
     if (!window)
         return;
     WindowHidden(window);
-    auto isGone = [=](InputEvent const &event) { return event.window == window; };
-    deferred.erase(std::remove_if(deferred.begin(), deferred.end(), isGone), deferred.end());
+    deferred.remove_if([=](InputEvent const &event) { return event.window == window; });
     if (activatedWindow == window)
         activatedWindow = nullptr;
     if (shownWindow == window)

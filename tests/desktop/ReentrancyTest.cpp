@@ -113,6 +113,21 @@ TEST_F(ReentrancyTest, ADragEndsWithItsWindow) {
     EXPECT_EQ(steps, 0);
 }
 
+TEST_F(ReentrancyTest, APressThatWaitsGoesWithItsWindow) {
+    Show();
+    int clicks = 0;
+    pane->onClick = [&](EventRecordAdapter *) {
+        ++clicks;
+        Yield(0.1);
+        ShowGlog(glog, kHideGlog);
+        ShowGlog(glog, kShowGlog);
+    };
+    desktop.Play("click 30 20\npress 30 20\nmove 31 20");
+    EXPECT_EQ(clicks, 1);
+    desktop.Play("release\nclick 30 20");
+    EXPECT_EQ(clicks, 2);
+}
+
 TEST_F(ReentrancyTest, WaitingForTheReleaseByAskingForTheButtonEnds) {
     Show();
     int asked = 0;
