@@ -170,6 +170,9 @@ TEST_P(ScrolledPage, ShowsWhatAFreshOneShowsAfterAStorm) {
             return TheGlog().Width() == width && TheGlog().Height() == height &&
                    !EventLoop::Instance().IsTracking();
         });
+        ASSERT_FALSE(HasFailure()) << TheGlog().Width() << " x " << TheGlog().Height() << " in place of "
+                                   << width << " x " << height << ", tracking "
+                                   << EventLoop::Instance().IsTracking() << ", round " << round;
         desktop.ProcessEvents(0.1); // what lies behind the last release
         Pixels const shown = Shown(), drawn = Drawn(), fresh = DrawnAfresh();
         ASSERT_EQ(DifferenceOf(drawn, fresh), "") << "what is drawn, round " << round;
