@@ -82,9 +82,9 @@ void SoundNames::Search(UString const &search) {
         std::iota(found.begin(), found.end(), 0);
     }
     sought = form;
+    UStrings const &forms = FormsInSystemLanguage(); // made with the page, not at its first letter
     if (search.empty())
         return;
-    UStrings const &forms = FormsInSystemLanguage();
     auto const fails = [&](int sound) {
         return forms[static_cast<std::size_t>(sound)].find(form, 0) == UString::npos;
     };
