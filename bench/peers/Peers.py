@@ -3,8 +3,9 @@
 
     Peers.py [--check] [--record FILE] --rounds N --server PID DIRECTORY
 
-The programs of the directory take turns in each round, so that all meet the same conditions. With --check the exit
-status is 1 when a goal is missed. With --record the table is written to a document too, with what it was measured on.
+The programs of the directory take turns at each thing that is measured, so that all meet the same conditions, and
+another one begins in each round: whoever comes first finds a server that has rested. With --check the exit status is 1
+when a goal is missed. With --record the table is written to a document too, with what it was measured on.
 """
 import argparse
 import contextlib
@@ -67,21 +68,23 @@ def measure(program, *arguments):
     return values
 
 
-def run_round(directory, peer, server, values):
-    program = os.path.join(directory, f"peer_{peer}")
-    for what in ("window", "offscreen", "list", "table", "tabs", "text"):
-        for name, measured in measure(program, what, server).items():
+def take_turns(values, programs, *arguments):
+    """Runs the programs, a dictionary by name, one after the other with the same arguments."""
+    for name, program in programs.items():
+        for what, measured in measure(program, *arguments).items():
             # The median of a run counts once, so that no run counts for more than another.
-            values.setdefault((peer, name), []).append(statistics.median(measured))
-    resident = {boxes: measure(program, "memory", boxes)[f"resident-{boxes}"][0] for boxes in (FEW_BOXES, MANY_BOXES)}
-    growth = (resident[MANY_BOXES] - resident[FEW_BOXES]) / (MANY_BOXES - FEW_BOXES)
-    values.setdefault((peer, "memory"), []).append(growth)
+            values.setdefault((name, what), []).append(statistics.median(measured))
 
 
-def run_notify_round(directory, values):
-    for way in (OURS,) + NOTIFY_WAYS:
-        for name, measured in measure(os.path.join(directory, f"notify_{way}")).items():
-            values.setdefault((way, name), []).append(statistics.median(measured))
+def run_round(directory, peers, server, values):
+    programs = {peer: os.path.join(directory, f"peer_{peer}") for peer in peers}
+    for what in ("window", "offscreen", "list", "table", "tabs", "text"):
+        take_turns(values, programs, what, server)
+    for boxes in (FEW_BOXES, MANY_BOXES):
+        take_turns(values, programs, "memory", boxes)
+    for peer in peers:
+        few, many = (values[peer, f"resident-{boxes}"][-1] for boxes in (FEW_BOXES, MANY_BOXES))
+        values.setdefault((peer, "memory"), []).append((many - few) / (MANY_BOXES - FEW_BOXES))
 
 
 def print_notifications(medians):
@@ -173,10 +176,11 @@ def main():
     options = parser.parse_args()
 
     values = {}
+    peers = [OURS, OURS_IN_PANES, *PEERS]
     for _ in range(options.rounds):
-        for peer in (OURS, OURS_IN_PANES) + PEERS:
-            run_round(options.directory, peer, options.server, values)
-        run_notify_round(options.directory, values)
+        run_round(options.directory, peers, options.server, values)
+        take_turns(values, {way: os.path.join(options.directory, f"notify_{way}") for way in (OURS, *NOTIFY_WAYS)})
+        peers.append(peers.pop(0))
     medians = {key: statistics.median(measured) for key, measured in values.items()}
 
     table = io.StringIO()

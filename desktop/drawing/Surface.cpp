@@ -156,6 +156,9 @@ void Surface::Fill(DeviceRect const &r, std::uint32_t pixel) {
         FillByBlocks<kBlock>(row, width, r, pixel);
     else if (r.Width() >= kBlock / 2)
         FillByBlocks<kBlock / 2>(row, width, r, pixel);
+    else if (r.Width() == 1) // the sides of every frame
+        for (int y = r.top; y < r.bottom; ++y, row += width)
+            *row = pixel;
     else
         for (int y = r.top; y < r.bottom; ++y, row += width)
             for (int i = 0; i < r.Width(); ++i)

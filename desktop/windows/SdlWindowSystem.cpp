@@ -109,13 +109,17 @@ void SdlWindowSystem::Send(InputEvent::Kind kind, SdlWindow *window) {
     queue.Push(event);
 }
 
-// The server is asked as seldom as that goes: each look for events is several calls of the system.
+static bool IsLong(double pause) { return pause < 0 || pause >= kLongestPause; }
+
+// The server is asked as seldom as that goes: each look for events is several calls of the system. Before a
+// long pause it is asked, so that a signal from before does not wait until that is over.
 bool SdlWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter, char const *) {
     if (queue.HasOnlyLasting() && TakeEvent(event))
         return true;
     double const end = Now() + timeout;
     bool const blocks = timeout < 0 || timeout > kShortestBlock;
-    bool mayHaveCome = !blocks || !queue.Empty() || hasPaused || Now() > lookedAt + kLongestUnseen;
+    bool mayHaveCome =
+        !blocks || IsLong(timeout) || !queue.Empty() || hasPaused || Now() > lookedAt + kLongestUnseen;
     for (;;) {
         if (mayHaveCome)
             Pump();
@@ -124,7 +128,7 @@ bool SdlWindowSystem::WaitEvent(InputEvent &event, double timeout, Waiter, char 
         double const left = timeout < 0 ? kLongestBlock : end - Now();
         if (!(left > 0)) // also true for what is not a number
             return false;
-        mayHaveCome = Block(left);
+        mayHaveCome = Block(left) || IsLong(left);
         if (!mayHaveCome && timeout >= 0 && end <= Now())
             return false;
     }
@@ -139,16 +143,16 @@ bool SdlWindowSystem::TakeEvent(InputEvent &event) {
     return false;
 }
 
-// Whether something came. SDL looks for events before it waits: for a pause of a moment that is more than all
-// the rest, so it is put off until the pause is over.
+// Whether something came. SDL's own wait looks for events first, which for a pause of a moment is more than
+// all the rest, and has the server wake it once more for each event that has just woken it.
 bool SdlWindowSystem::Block(double seconds) {
     if (windows.empty() && waker == nullptr)
         OpenWaker();
     double longest = keyboard.MustAskInputMethod() ? kInputMethodInterval : kLongestBlock;
     // Rounded up: a rest of less than a millisecond would be waited for without blocking.
     int milliseconds = static_cast<int>(std::ceil(std::min(seconds, longest) * kMillisecondsPerSecond));
-    bool const brief = seconds < kLongestPause && !keyboard.MustAskInputMethod() && SdlScreen::CanWait();
-    if (brief && !SDL_HasEvents(SDL_FIRSTEVENT, SDL_LASTEVENT)) {
+    bool const bySdl = keyboard.MustAskInputMethod() || !SdlScreen::CanWait();
+    if (!bySdl && !SDL_HasEvents(SDL_FIRSTEVENT, SDL_LASTEVENT)) {
         bool const came = SdlScreen::Wait(milliseconds);
         hasPaused = hasPaused || came;
         return came;

@@ -45,31 +45,32 @@ void ShownPixels::TakeTiles(Surface::Rows const &rows, DeviceRect const &area, D
         DeviceRect const place = Place(column, row).Intersected(area);
         Tile &tile = At(column, row);
         tile.top = tile.bottom = place.top;
-        parts.push_back({&tile, place, place.Intersected(tile.unknown).Empty()});
+        parts.push_back({&tile, place, static_cast<std::size_t>(place.Width()) * sizeof(std::uint32_t),
+                         place.Intersected(tile.unknown).Empty()});
     }
-    DeviceRect const band = parts.front().place;
-    for (int y = band.top; y < band.bottom; ++y) {
-        std::uint32_t const *const from = rows[y];
-        std::uint32_t *const to = memory + static_cast<std::size_t>(y) * static_cast<std::size_t>(width);
-        for (Part const &part : parts)
-            TakeRow(from, to, part, y);
-    }
+    TakeRows(rows);
     for (Part const &part : parts)
         if (!part.known && part.place.Contains(part.tile->unknown))
             part.tile->unknown = {0, 0, 0, 0};
 }
 
-void ShownPixels::TakeRow(std::uint32_t const *from, std::uint32_t *to, Part const &part, int y) {
-    std::size_t const bytes = static_cast<std::size_t>(part.place.Width()) * sizeof(std::uint32_t);
-    from += part.place.left;
-    to += part.place.left;
-    if (part.known && std::memcmp(to, from, bytes) == 0)
-        return;
-    std::memcpy(to, from, bytes);
-    Tile &tile = *part.tile;
-    if (tile.top == tile.bottom)
-        tile.top = y;
-    tile.bottom = y + 1;
+void ShownPixels::TakeRows(Surface::Rows const &rows) {
+    Part const *const first = parts.data(), *const end = first + parts.size();
+    int const top = first->place.top, bottom = first->place.bottom;
+    std::uint32_t *to = memory + static_cast<std::size_t>(top) * static_cast<std::size_t>(width);
+    for (int y = top; y < bottom; ++y, to += width) {
+        std::uint32_t const *const from = rows[y];
+        for (Part const *part = first; part != end; ++part) {
+            int const left = part->place.left;
+            if (part->known && std::memcmp(to + left, from + left, part->bytes) == 0)
+                continue;
+            std::memcpy(to + left, from + left, part->bytes);
+            Tile &tile = *part->tile;
+            if (tile.top == tile.bottom)
+                tile.top = y;
+            tile.bottom = y + 1;
+        }
+    }
 }
 
 // Runs of differing rows down each column of tiles; what is alike in neighbouring columns becomes one.
@@ -117,7 +118,14 @@ void ShownPixels::Take(Surface const &surface, DeviceRect const &area, std::vect
         changed[i] = changed[i].Intersected(area);
 }
 
-static void Unite(DeviceRect &all, DeviceRect const &part) { all = all.Empty() ? part : all.United(part); }
+void ShownPixels::Forget(Tile &tile, DeviceRect const &place, DeviceRect const &part) {
+    if (part.Contains(place)) { // as of most, when a view scrolls
+        tile.unknown = place;
+        return;
+    }
+    DeviceRect const lost = part.Intersected(place);
+    tile.unknown = tile.unknown.Empty() ? lost : tile.unknown.United(lost);
+}
 
 void ShownPixels::Forget(DeviceRect const &rect) {
     DeviceRect const part = rect.Intersected({0, 0, width, height});
@@ -126,7 +134,7 @@ void ShownPixels::Forget(DeviceRect const &rect) {
     DeviceRect const range = TilesOf(part);
     for (int row = range.top; row < range.bottom; ++row)
         for (int column = range.left; column < range.right; ++column)
-            Unite(At(column, row).unknown, part.Intersected(Place(column, row)));
+            Forget(At(column, row), Place(column, row), part);
 }
 
 void ShownPixels::ForgetAll() { Forget({0, 0, width, height}); }

@@ -37,9 +37,11 @@ private:
     struct Part { // of a tile, to be taken
         Tile *tile;
         DeviceRect place;
-        bool known; // all of it
+        std::size_t bytes; // of a row
+        bool known;        // all of it
     };
-    static void TakeRow(std::uint32_t const *from, std::uint32_t *to, Part const &, int y);
+    void TakeRows(Surface::Rows const &); // of all parts
+    static void Forget(Tile &, DeviceRect const &place, DeviceRect const &part);
     void Collect(DeviceRect const &tiles, std::vector<DeviceRect> &changed);
 
     std::uint32_t *memory;

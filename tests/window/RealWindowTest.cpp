@@ -1,5 +1,6 @@
 #include "desktop/drawing/PixelMove.h"
 #include "tests/window/WindowTest.h"
+#include <csignal>
 #include <cstdlib>
 #include <stdexcept>
 #include <sys/resource.h>
@@ -195,6 +196,13 @@ TEST_F(RealWindow, AQuestionWhereOneLiesThatWasJustClosedDoesNotEndTheProgram) {
 TEST_F(RealWindow, TheTerminationSignalQuits) {
     Window window = Open(At(200, 150, 300, 200));
     std::system(("(sleep 0.3; kill -TERM " + std::to_string(getpid()) + ") &").c_str());
+    EXPECT_EQ(Await(InputEvent::kQuit).window, nullptr);
+}
+
+TEST_F(RealWindow, ASignalFromBeforeALongPauseDoesNotWaitForItsEnd) {
+    Window window = Open(At(200, 150, 300, 200));
+    Drain();
+    std::raise(SIGTERM);
     EXPECT_EQ(Await(InputEvent::kQuit).window, nullptr);
 }
 
