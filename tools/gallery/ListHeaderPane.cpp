@@ -62,19 +62,24 @@ int ListHeaderPane::HandleClick(EventRecordAdapter *event) {
     return -1;
 }
 
+// Whoever is told, and whoever is drawn, may do away with the headings.
 void ListHeaderPane::Resize(int column, Point start) {
     int const width = columns->GetWidth(column), last = columns->GetNumColumns() - 1;
     int const widest =
         columns->GetRightEdge(last) - columns->GetLeftEdge(column) - (last - column) * kNarrowest;
     PaneWatch const watch(this);
+    glogRec *const window = glog;
+    std::function<void()> const tell = resized;
     Prepare();
     Point place = start;
     while (MouseIsDragging(&place, nullptr) && watch.PaneExists()) {
         int const wanted = std::clamp(width + place.h - start.h, kNarrowest, std::max(widest, kNarrowest));
         columns->ResizeColumn(column, wanted);
         Inval();
-        resized();
-        UpdateGlog(glog);
+        tell();
+        UpdateGlog(window);
+        if (!watch.PaneExists())
+            return;
         Prepare();
     }
 }
