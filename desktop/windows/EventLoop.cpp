@@ -298,6 +298,12 @@ PlatformWindow *EventLoop::WindowOf(DrawingPort &port) const {
 
 // Nested loops
 
+// What follows the release belongs to the next press, which waits too.
+bool EventLoop::BelongsToDrag(InputEvent const &event) const {
+    bool const released = !pointer.empty() && IsRelease(pointer.back());
+    return heldWindow && !released && Drags(event);
+}
+
 void EventLoop::Sort(InputEvent const &event) {
     PortKeeper const keeper;
     if (HandleWindowEvent(event))
@@ -306,9 +312,7 @@ void EventLoop::Sort(InputEvent const &event) {
         pointer.push_back(event); // an open menu takes it when it has its turn again
         return;
     }
-    // What follows the release belongs to the next press, which waits too.
-    bool const released = !pointer.empty() && IsRelease(pointer.back());
-    if (heldWindow && !released && Drags(event))
+    if (BelongsToDrag(event))
         pointer.push_back(event);
     else if (event.kind == InputEvent::kMouseMove && !deferred.empty() &&
              deferred.back().kind == InputEvent::kMouseMove && deferred.back().window == event.window)
@@ -412,13 +416,29 @@ void EventLoop::BeginMenu(PlatformWindow *window) {
     helpTags->Hide();
     windows.SetCursor(Cursors::kArrow);
     windows.CaptureMouse(window);
+    // What the user did while nobody had time for it was meant for the menu too: the release of a press that
+    // waits would come to it, and the press after it had gone.
+    for (auto i = deferred.begin(); i != deferred.end();) {
+        auto const event = i++;
+        if (IsInput(event->kind))
+            pointer.splice(pointer.end(), deferred, event);
+    }
 }
 
-// The release that is still to come is the window's whose press it ends.
+// The release that is still to come is the window's whose press it ends. What the menu has not taken goes
+// where it would have gone without one. Must not throw.
 void EventLoop::EndMenu() {
     menuWindow = nullptr;
     if (!heldWindow)
         windows.CaptureMouse(nullptr);
+    std::list<InputEvent> left;
+    left.swap(pointer);
+    auto const later = deferred.begin();
+    while (!left.empty())
+        if (BelongsToDrag(left.front()))
+            pointer.splice(pointer.end(), left, left.begin());
+        else
+            deferred.splice(later, left, left.begin());
 }
 
 bool EventLoop::NextMenuEvent(double deadline, InputEvent &event) {

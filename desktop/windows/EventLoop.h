@@ -44,8 +44,8 @@ public:
     bool ButtonStillDown();
     PlatformWindow *WindowOf(DrawingPort &) const; // null for a port without window
 
-    // An open menu takes all input, of every window, until EndMenu. The mouse is captured for the window that
-    // it belongs to.
+    // An open menu takes all input, of every window, until EndMenu, and before that what has waited for the
+    // main loop. The mouse is captured for the window that it belongs to.
     void BeginMenu(PlatformWindow *);
     // The next event of mouse, keyboard or windows; what it means to the window itself has been done. False
     // when the deadline has passed (negative: none), or the menu is over.
@@ -100,6 +100,7 @@ private:
     // In a nested loop: window events are handled, pointer events go to `pointer`, everything else waits for
     // the main loop.
     void Sort(InputEvent const &);
+    bool BelongsToDrag(InputEvent const &) const;
     bool HandleWindowEvent(InputEvent const &);
     void Handle(InputEvent const &);
     void NoteActivation(InputEvent const &);

@@ -1,4 +1,6 @@
 // Listeners and others that change or delete the pane, its menu or its window while the menu is at work.
+#include "buttons/OvalButtonPane.h"
+#include "desktop/windows/EventLoop.h"
 #include "host/PaneWatch.h"
 #include "tests/menus/MenuTest.h"
 
@@ -16,6 +18,30 @@ protected:
 
     PopMPane *pane;
     OSMenuHandle submenu;
+};
+
+// With a button, which shows a press for a while: what comes meanwhile has to wait.
+class MenuInAHurry : public MenuReentrancy {
+protected:
+    MenuInAHurry() {
+        gobResRec record = {gobResRec::kKind, 20, 200, 80, 1, 0};
+        OvalButtonPane::NewOvalButtonPane(glog, &record);
+        Show();
+    }
+
+    // What the clicks of the script came to, in their order.
+    Lines Results(std::string const &script) {
+        desktop.TakeMessages();
+        desktop.Play(script);
+        Lines results;
+        for (std::string const &line : desktop.TakeMessages())
+            results.push_back(line.substr(line.find("\"pane\"")));
+        return results;
+    }
+
+    std::string const button =
+        "\"pane\":\"OvalButtonPane\",\"id\":0,\"message\":\"HandleClick\",\"result\":1}";
+    std::string const menu = "\"pane\":\"PopMPane\",\"id\":7,\"message\":\"HandleClick\",\"result\":";
 };
 
 // Does something when it hears of a change, of a choice, of activity.
@@ -216,4 +242,19 @@ TEST_F(MenuReentrancy, AListenerDeletesThePaneOutsideOfAnyMenu) {
         action();
         EXPECT_FALSE(watch.PaneExists());
     }
+}
+
+TEST_F(MenuInAHurry, KeysThatHadToWaitAreTheMenus) {
+    EXPECT_EQ(Results("click 220 30\nclick 60 20\nkey Down\nkey Return"), (Lines{button, menu + "2}"}));
+}
+
+TEST_F(MenuInAHurry, APressThatHadToWaitDismissesTheMenuAndItsReleaseEndsIt) {
+    EXPECT_EQ(Results("click 220 30\nclick 60 20\npress 300 190\nwait 1\nrelease\nwait 1"),
+              (Lines{button, menu + "-1}"}));
+    EXPECT_FALSE(EventLoop::Instance().IsTracking());
+}
+
+TEST_F(MenuInAHurry, WhatTheMenuLeavesIsHeardAfterIt) {
+    EXPECT_EQ(Results("click 220 30\nclick 60 20\nkey Escape\nclick 220 30"),
+              (Lines{button, menu + "-1}", button}));
 }
