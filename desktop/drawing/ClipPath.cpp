@@ -77,32 +77,30 @@ cairo_path_t *DevicePath(OSPath const &path, int originH, int originV, double fa
 
 ClipPath::ClipPath(OSPath const &local, int originH, int originV, DeviceScale scale, int deviceWidth,
                    int deviceHeight, std::shared_ptr<ClipPath const> outer_)
-    : path(nullptr)
-    , outer(std::move(outer_)) {
+    : outer(std::move(outer_)) {
     DeviceRect bounds = {0, 0, 0, 0};
-    path = DevicePath(local, originH, originV, scale.Factor(), bounds);
+    path.reset(DevicePath(local, originH, originV, scale.Factor(), bounds));
     bounds = bounds.Intersected({0, 0, deviceWidth, deviceHeight});
     if (bounds.Empty()) {
         pixman_region32_init(&pixels);
         return;
     }
     Mask mask(bounds);
-    mask.Fill(path);
+    mask.Fill(path.get());
     std::vector<pixman_box32_t> runs = mask.Runs();
     pixman_region32_init_rects(&pixels, runs.data(), static_cast<int>(runs.size()));
     if (outer)
         pixman_region32_intersect(&pixels, &pixels, const_cast<pixman_region32_t *>(outer->Pixels()));
 }
 
-ClipPath::~ClipPath() {
-    pixman_region32_fini(&pixels);
-    cairo_path_destroy(path);
-}
+ClipPath::~ClipPath() { pixman_region32_fini(&pixels); }
+
+void ClipPath::DestroyPath::operator()(cairo_path *path) const { cairo_path_destroy(path); }
 
 void ClipPath::Narrow(cairo_t *context) const {
     if (outer)
         outer->Narrow(context);
     cairo_new_path(context);
-    cairo_append_path(context, path);
+    cairo_append_path(context, path.get());
     cairo_clip(context);
 }

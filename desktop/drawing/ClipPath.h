@@ -28,7 +28,10 @@ public:
     void Narrow(cairo_t *) const;
 
 private:
-    cairo_path *path; // device coordinates
+    struct DestroyPath {
+        void operator()(cairo_path *) const;
+    };
+    std::unique_ptr<cairo_path, DestroyPath> path; // device coordinates
     pixman_region32_t pixels;
     std::shared_ptr<ClipPath const> outer;
 };

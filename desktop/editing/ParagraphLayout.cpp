@@ -77,8 +77,9 @@ PangoLogAttr const *AttributesOf(PangoLayout *layout, std::size_t &count) {
 
 } // namespace
 
+// What has been made is let go too where memory for the rest is wanting.
 ParagraphLayout::ParagraphLayout(std::u16string_view units, StyleRuns::List const &given, Room const &room)
-    : text(units) {
+    : ParagraphLayout(units) {
     StyleRuns::List runs = given;
     Make(runs, room);
     if (pango_layout_get_unknown_glyphs_count(layout) != 0 && FontLibrary::Instance().AddSystemFonts())
@@ -89,16 +90,23 @@ ParagraphLayout::ParagraphLayout(std::u16string_view units, StyleRuns::List cons
     generation = FontLibrary::Instance().Generation();
 }
 
-ParagraphLayout::~ParagraphLayout() { g_object_unref(layout); }
+ParagraphLayout::ParagraphLayout(std::u16string_view units)
+    : text(units) {}
+
+ParagraphLayout::~ParagraphLayout() { Replace(nullptr); }
+
+void ParagraphLayout::Replace(PangoLayout *other) {
+    if (layout)
+        g_object_unref(layout);
+    layout = other;
+}
 
 bool ParagraphLayout::IsCurrent() const { return generation == FontLibrary::Instance().Generation(); }
 
 void ParagraphLayout::Make(StyleRuns::List const &runs, Room const &room) {
-    if (layout)
-        g_object_unref(layout);
     for (StyleRuns::Run const &run : runs)
         FontLibrary::Instance().Description(run.style.Font());
-    layout = FontLibrary::Instance().NewLayout(runs.front().style.Font());
+    Replace(FontLibrary::Instance().NewLayout(runs.front().style.Font()));
     bool const plain = runs.size() == 1 && !runs.front().style.colored &&
                        !(runs.front().style.Font().face & FontFace::kUnderline);
     if (!plain) {

@@ -74,6 +74,8 @@ public:
     void DrawLine(cairo_t *, std::size_t line, int h, int v) const;
 
 private:
+    explicit ParagraphLayout(std::u16string_view units);
+    void Replace(PangoLayout *);
     void Make(StyleRuns::List const &, Room const &);
     bool MakeSmaller(StyleRuns::List &) const;
     void MeasureLines(StyleRuns::List const &, Room const &);

@@ -242,9 +242,11 @@ PangoLayout *FontLibrary::NewLayout(FontSpec const &spec) {
 PlainShaper const &FontLibrary::Plain(FontSpec const &spec) {
     std::unique_ptr<PlainShaper> &plain = Find(spec).plain;
     if (!plain) {
-        PangoLayout *const layout = NewLayout(spec);
-        plain = std::make_unique<PlainShaper>(layout);
-        g_object_unref(layout);
+        struct Unref {
+            void operator()(PangoLayout *layout) const { g_object_unref(layout); }
+        };
+        std::unique_ptr<PangoLayout, Unref> const layout(NewLayout(spec));
+        plain = std::make_unique<PlainShaper>(layout.get());
     }
     return *plain;
 }

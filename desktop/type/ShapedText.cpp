@@ -80,7 +80,9 @@ float TextShape::CleanSpacing(float spacing) {
     return std::isnan(spacing) ? 0 : std::clamp(spacing, -kMostSpacing, kMostSpacing);
 }
 
-ShapedText::ShapedText(std::u16string_view text, TextShape const &shape) {
+// What has been made is let go too where memory for the rest is wanting.
+ShapedText::ShapedText(std::u16string_view text, TextShape const &shape)
+    : ShapedText() {
     TakeMetrics(shape.font);
     if (!ShapePlain(text, shape)) {
         Shape(text, shape);
@@ -94,6 +96,8 @@ ShapedText::ShapedText(std::u16string_view text, TextShape const &shape) {
     rightToLeft = !lines.empty() && lines.front().rightToLeft;
     generation = FontLibrary::Instance().Generation();
 }
+
+ShapedText::ShapedText() {}
 
 ShapedText::~ShapedText() {
     DropGlyphs();

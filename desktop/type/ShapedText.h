@@ -77,6 +77,7 @@ public:
     static int LineStart(int lineWidth, int boxWidth, TextSettings::Alignment, bool rightToLeft);
 
 private:
+    ShapedText();
     // Places are in units of Pango, from the start of the line and its baseline.
     struct Glyph {
         std::uint32_t index;
