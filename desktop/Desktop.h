@@ -68,7 +68,9 @@ public:
 
 // Opens the window system and the resources; closes all glogs and both when it goes. One at a time: a second
 // one throws std::logic_error. The constructor throws std::runtime_error with the reason when there is no
-// display or no artwork.
+// display or no artwork. For a display it has Xlib keep its table of composed keys in the folder glogpanes of
+// the user's cache, by a variable of the environment that is set meanwhile: no other thread may read the
+// environment then.
 class Desktop {
 public:
     explicit Desktop(DesktopOptions const & = DesktopOptions()); // real windows

@@ -1,10 +1,12 @@
 #include "desktop/windows/SdlSession.h"
+#include "desktop/windows/SdlComposeCache.h"
 #include "desktop/windows/SdlScreen.h"
 #include <SDL.h>
 #include <SDL_syswm.h>
 #include <cstring>
 #include <stdexcept>
 #include <string>
+#include <unistd.h>
 
 static char const *const kVideoDriver = "x11";
 
@@ -67,6 +69,7 @@ static std::runtime_error NoDisplay(std::string const &reason) {
 }
 
 SdlSession::SdlSession() {
+    SdlComposeCache const cache(geteuid()); // SDL has Xlib read the table
     for (Hint const &hint : kHints)
         SDL_SetHintWithPriority(hint.name, hint.value, SDL_HINT_OVERRIDE);
     theHandlerBeforeSdl = XSetErrorHandler(HandleBehindSdl);
