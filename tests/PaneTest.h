@@ -138,6 +138,17 @@ protected:
         return found;
     }
 
+    // What the desktop reports while the script is played, each line from the key on: before it stands the
+    // time.
+    Lines ReportsOf(std::string const &script, std::string const &key) {
+        desktop.TakeMessages();
+        desktop.Play(script);
+        Lines reports;
+        for (std::string const &line : desktop.TakeMessages())
+            reports.push_back(line.substr(line.find("\"" + key + "\"")));
+        return reports;
+    }
+
     // What the pane's HandleClick answers, by the desktop's own report, when the script is played.
     static constexpr int kNoClick = -1000;
     int ResultOfClick(std::string const &script) {

@@ -14,14 +14,7 @@ protected:
         Show();
     }
 
-    Lines Results(std::string const &script) {
-        desktop.TakeMessages();
-        desktop.Play(script);
-        Lines results;
-        for (std::string const &line : desktop.TakeMessages())
-            results.push_back(line.substr(line.find("\"id\"")));
-        return results;
-    }
+    Lines Results(std::string const &script) { return ReportsOf(script, "id"); }
 };
 
 TEST_F(QuickPresses, EachGetsItsOwnRelease) {

@@ -30,14 +30,7 @@ protected:
     }
 
     // What the clicks of the script came to, in their order.
-    Lines Results(std::string const &script) {
-        desktop.TakeMessages();
-        desktop.Play(script);
-        Lines results;
-        for (std::string const &line : desktop.TakeMessages())
-            results.push_back(line.substr(line.find("\"pane\"")));
-        return results;
-    }
+    Lines Results(std::string const &script) { return ReportsOf(script, "pane"); }
 
     std::string const button =
         "\"pane\":\"OvalButtonPane\",\"id\":0,\"message\":\"HandleClick\",\"result\":1}";
