@@ -138,8 +138,7 @@ protected:
         return found;
     }
 
-    // What the desktop reports while the script is played, each line from the key on: before it stands the
-    // time.
+    // What the desktop reports while the script is played, each line from the key on.
     Lines ReportsOf(std::string const &script, std::string const &key) {
         desktop.TakeMessages();
         desktop.Play(script);
