@@ -1,40 +1,22 @@
 #include "desktop/windows/SdlCapture.h"
+#include "desktop/windows/SdlNativeWindow.h"
 #include "desktop/windows/SdlWindow.h"
 #include <SDL.h>
-#include <SDL_syswm.h>
 
-namespace {
+// What the server tells the program of the window; 0 when there is no knowing.
+static long AskEventMask(SDL_Window *window) {
+    SdlNativeWindow const native = SdlNativeWindow::Of(window);
+    XWindowAttributes attributes;
+    bool const told =
+        native.window != None && XGetWindowAttributes(native.display, native.window, &attributes) != 0;
+    return told ? attributes.your_event_mask : 0;
+}
 
-// A window of SDL as the X library knows it.
-class XWindow {
-public:
-    explicit XWindow(SDL_Window *window)
-        : info() {
-        SDL_VERSION(&info.version);
-        known = SDL_GetWindowWMInfo(window, &info) == SDL_TRUE;
-    }
-    long EventMask() const {
-        XWindowAttributes attributes;
-        bool told =
-            known && XGetWindowAttributes(info.info.x11.display, info.info.x11.window, &attributes) != 0;
-        return told ? attributes.your_event_mask : 0;
-    }
-    void Select(long eventMask) const {
-        if (known)
-            XSelectInput(info.info.x11.display, info.info.x11.window, eventMask);
-    }
-    // Returns once the server has done everything that it was asked for; the events of it wait to be taken.
-    void Synchronize() const {
-        if (known)
-            XSync(info.info.x11.display, False);
-    }
-
-private:
-    SDL_SysWMinfo info;
-    bool known;
-};
-
-} // namespace
+static void Select(SDL_Window *window, long eventMask) {
+    SdlNativeWindow const native = SdlNativeWindow::Of(window);
+    if (native.window != None)
+        XSelectInput(native.display, native.window, eventMask);
+}
 
 SdlCapture::SdlCapture(std::vector<SdlWindow *> const &windows_)
     : windows(windows_) {}
@@ -43,7 +25,7 @@ SdlCapture::SdlCapture(std::vector<SdlWindow *> const &windows_)
 long SdlCapture::EventMaskOf(SDL_Window *window) {
     long &mask = eventMasks[window];
     if (mask == 0)
-        mask = XWindow(window).EventMask();
+        mask = AskEventMask(window);
     return mask;
 }
 
@@ -52,10 +34,11 @@ void SdlCapture::IgnoreEntering() {
         long mask = EventMaskOf(window->Raw());
         if (mask == 0 || !ignoring.insert(window->Raw()).second)
             continue;
-        XWindow(window->Raw()).Select(mask & ~EnterWindowMask);
+        Select(window->Raw(), mask & ~EnterWindowMask);
     }
-    if (!windows.empty())
-        XWindow(windows.front()->Raw()).Synchronize();
+    Display *const display = windows.empty() ? nullptr : SdlNativeWindow::Of(windows.front()->Raw()).display;
+    if (display != nullptr)
+        XSync(display, False); // all is done then, and the events of it wait to be taken
 }
 
 void SdlCapture::Hold() {
@@ -76,6 +59,6 @@ void SdlCapture::End() {
     holds = false;
     SDL_CaptureMouse(SDL_FALSE);
     for (SDL_Window *window : ignoring)
-        XWindow(window).Select(eventMasks[window]);
+        Select(window, eventMasks[window]);
     ignoring.clear();
 }

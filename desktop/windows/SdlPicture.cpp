@@ -2,10 +2,8 @@
 #include "desktop/drawing/FreshMemory.h"
 #include "desktop/drawing/PixelMove.h"
 #include "desktop/drawing/Surface.h"
-#include "desktop/windows/SdlScreen.h"
+#include "desktop/windows/SdlNativeWindow.h"
 #include "desktop/windows/ShownPixels.h"
-#include <SDL.h>
-#include <SDL_syswm.h>
 #include <X11/Xutil.h>
 #include <X11/extensions/XShm.h>
 #include <algorithm>
@@ -20,13 +18,11 @@ static long long const kMostSentPixels = 8192; // 32 KB: a label, a strip that s
 
 struct SdlPicture::Shared {
     Display *display = nullptr; // SDL's
-    SDL_Window *of = nullptr;
     ::Window window = 0;
     GC context = nullptr;
     XImage *image = nullptr;
     XShmSegmentInfo segment = {};
     bool attached = false;
-    bool watched = false; // for what a move misses
     std::unique_ptr<ShownPixels> pixels;
     bool lost = true;                // the window does not show all that was taken
     std::vector<DeviceRect> changed; // of one call; kept for its memory
@@ -58,15 +54,11 @@ SdlPicture::Shared::~Shared() {
         shmdt(segment.shmaddr);
 }
 
-bool SdlPicture::Shared::FindWindow(SDL_Window *of_) {
-    of = of_;
-    SDL_SysWMinfo info;
-    SDL_VERSION(&info.version);
-    if (SDL_GetWindowWMInfo(of, &info) != SDL_TRUE || info.subsystem != SDL_SYSWM_X11)
-        return false;
-    display = info.info.x11.display;
-    window = info.info.x11.window;
-    return XShmQueryExtension(display) == True;
+bool SdlPicture::Shared::FindWindow(SDL_Window *of) {
+    SdlNativeWindow const native = SdlNativeWindow::Of(of);
+    display = native.display;
+    window = native.window;
+    return window != None && XShmQueryExtension(display) == True;
 }
 
 static bool HasOurPixels(XImage const &image, int width) {
@@ -218,10 +210,6 @@ void SdlPicture::ShowAll() {
 bool SdlPicture::Move(PixelMove const &move) {
     if (shared->lost)
         return false;
-    if (!shared->watched) {
-        SdlScreen::WatchMoves(shared->of);
-        shared->watched = true;
-    }
     shared->AwaitReading();
     DeviceRect const from = move.From(), &to = move.to;
     XCopyArea(shared->display, shared->window, shared->window, shared->context, from.left, from.top,

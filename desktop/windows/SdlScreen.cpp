@@ -1,22 +1,37 @@
 #include "desktop/windows/SdlScreen.h"
-#include <SDL.h>
-#include <SDL_syswm.h>
+#include "desktop/windows/SdlEventFilter.h"
+#include "desktop/windows/SdlNativeWindow.h"
 #include <X11/extensions/XInput2.h>
-#include <algorithm>
 #include <poll.h>
-#include <vector>
 
 static Display *theDisplay = nullptr; // SDL's
 static Atom theTimeOfUse = None;
 static unsigned long theFlushed = 0; // number of the request that was to come next when all were sent
 
-void SdlScreen::IgnoreOtherWindowsMouse(SDL_Window *window) {
-    SDL_SysWMinfo info;
-    SDL_VERSION(&info.version);
-    if (theDisplay != nullptr || window == nullptr || SDL_GetWindowWMInfo(window, &info) != SDL_TRUE)
+// SDL notes at the window when it was used last, for window managers, and the server says so.
+static bool IsNoNoteOfUse(XEvent &change) { return change.xproperty.atom != theTimeOfUse; }
+
+// SDL itself would not take it for one.
+static bool MakeExposure(XEvent &event) {
+    XGraphicsExposeEvent const missing = event.xgraphicsexpose;
+    event.xexpose = {Expose,    missing.serial, missing.send_event, missing.display, missing.drawable,
+                     missing.x, missing.y,      missing.width,      missing.height,  missing.count};
+    return true;
+}
+
+static bool Drop(XEvent &) { return false; }
+
+void SdlScreen::LimitEvents(SDL_Window *window) {
+    if (theDisplay != nullptr)
         return;
-    theDisplay = info.info.x11.display;
+    theDisplay = SdlNativeWindow::Of(window).display;
+    if (theDisplay == nullptr)
+        return;
     theTimeOfUse = XInternAtom(theDisplay, "_NET_WM_USER_TIME", False); // known here since SDL asked
+    SdlEventFilter::Set(theDisplay, PropertyNotify, IsNoNoteOfUse);
+    SdlEventFilter::Set(theDisplay, GraphicsExpose, MakeExposure);
+    SdlEventFilter::Set(theDisplay, NoExpose, Drop);
+    // Every movement and press of the mouse on the whole screen.
     int opcode = 0, event = 0, error = 0;
     if (!XQueryExtension(theDisplay, "XInputExtension", &opcode, &event, &error))
         return; // then SDL has not asked either
@@ -38,19 +53,6 @@ void SdlScreen::GetMousePlace(int &x, int &y) {
 
 bool SdlScreen::CanWait() { return theDisplay != nullptr; }
 
-// With each press and key SDL notes at the window when it was used last, for window managers, and the server
-// says so. Nobody wants to know: whether that was all that came.
-static bool TakeNoteOfUse() {
-    if (XEventsQueued(theDisplay, QueuedAfterReading) != 1)
-        return false;
-    XEvent event;
-    XPeekEvent(theDisplay, &event);
-    if (event.type != PropertyNotify || event.xproperty.atom != theTimeOfUse)
-        return false;
-    XNextEvent(theDisplay, &event);
-    return true;
-}
-
 // Where nothing has been asked of the server since the last time, nothing waits to be sent, and what had come
 // until then has been taken.
 bool SdlScreen::Wait(int milliseconds) {
@@ -62,57 +64,10 @@ bool SdlScreen::Wait(int milliseconds) {
     }
     pollfd connection = {ConnectionNumber(theDisplay), POLLIN, 0};
     int const came = poll(&connection, 1, milliseconds);
-    return came != 0 && !(came > 0 && TakeNoteOfUse()); // an interruption by a signal counts
-}
-
-namespace {
-struct Watched {
-    ::Window window;
-    Uint32 id; // SDL's
-};
-} // namespace
-
-static std::vector<Watched> theWatched;
-
-// Called by SDL for every event before it is queued, and for every message of the server while it hands those
-// on: they end here, one of missing pixels as the exposure that SDL would not make of it.
-static int SDLCALL TakeMissing(void *, SDL_Event *event) {
-    if (event->type != SDL_SYSWMEVENT)
-        return 1;
-    XEvent const &message = event->syswm.msg->msg.x11.event;
-    if (message.type != GraphicsExpose)
-        return 0;
-    auto const found = std::find_if(theWatched.begin(), theWatched.end(), [&](Watched const &watched) {
-        return watched.window == message.xgraphicsexpose.drawable;
-    });
-    if (found == theWatched.end())
-        return 0;
-    SDL_WindowEvent exposure = {};
-    exposure.type = SDL_WINDOWEVENT;
-    exposure.windowID = found->id;
-    exposure.event = SDL_WINDOWEVENT_EXPOSED;
-    event->window = exposure;
-    return 1;
-}
-
-void SdlScreen::WatchMoves(SDL_Window *window) {
-    SDL_SysWMinfo info;
-    SDL_VERSION(&info.version);
-    if (SDL_GetWindowWMInfo(window, &info) != SDL_TRUE || info.subsystem != SDL_SYSWM_X11)
-        return;
-    if (theWatched.empty()) {
-        SDL_SetEventFilter(TakeMissing, nullptr);
-        SDL_EventState(SDL_SYSWMEVENT, SDL_ENABLE);
-    }
-    ::Window const watched = info.info.x11.window; // the server gives numbers anew
-    theWatched.erase(std::remove_if(theWatched.begin(), theWatched.end(),
-                                    [&](Watched const &other) { return other.window == watched; }),
-                     theWatched.end());
-    theWatched.push_back({watched, SDL_GetWindowID(window)});
+    return came > 0 ? XEventsQueued(theDisplay, QueuedAfterReading) > 0 : came < 0; // a signal counts
 }
 
 void SdlScreen::Forget() {
     theDisplay = nullptr;
     theFlushed = 0;
-    theWatched.clear();
 }

@@ -5,11 +5,11 @@ struct SDL_Window;
 
 namespace SdlScreen {
 
-// To be called for every window of SDL that is made; only the first one of a session has an effect. SDL asks
-// the server for every movement and press of the mouse on the whole screen, and so wakes the program whenever
-// the mouse moves anywhere: the server is told that these are not wanted. What concerns the windows comes as
-// before.
-void IgnoreOtherWindowsMouse(SDL_Window *);
+// To be called for every window of SDL that is made; only the first one of a session has an effect. What
+// would wake the program for nothing does not reach it any more: the mouse over other windows, for which SDL
+// has asked the server, its own notes of when a window was used, and that a move of pixels within a window
+// has missed none. Those that it has missed are an exposure, as when other windows uncover them.
+void LimitEvents(SDL_Window *);
 
 // Where the mouse is, in device pixels. The server is asked: SDL keeps a place that those events would renew.
 // (0, 0) while there has been no window.
@@ -20,10 +20,6 @@ bool CanWait();
 // Waits for the server to send something, or for a signal, no longer than so many milliseconds. Whether
 // something came; may end early without. SDL, whose own wait looks for events first, does not learn of it.
 bool Wait(int milliseconds);
-
-// From now on SDL reports the window as exposed, as it does for what other windows uncover, when pixels are
-// moved within it and some of them were not on the screen.
-void WatchMoves(SDL_Window *);
 
 // SDL has given up its connection to the server.
 void Forget();

@@ -1,6 +1,7 @@
 #include "desktop/windows/SdlSession.h"
 #include "desktop/windows/SdlComposeCache.h"
 #include "desktop/windows/SdlScreen.h"
+#include "desktop/windows/SdlTimeOfUse.h"
 #include <SDL.h>
 #include <SDL_syswm.h>
 #include <cstring>
@@ -90,6 +91,7 @@ SdlSession::SdlSession() {
 }
 
 SdlSession::~SdlSession() {
+    SdlTimeOfUse::Forget();
     SdlScreen::Forget();
     SDL_QuitSubSystem(SDL_INIT_VIDEO);
     XSetErrorHandler(theHandlerBeforeSdl);

@@ -3,6 +3,7 @@
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/windows/SdlPicture.h"
 #include "desktop/windows/SdlScreen.h"
+#include "desktop/windows/SdlTimeOfUse.h"
 #include "desktop/windows/SdlWindowSystem.h"
 #include <SDL.h>
 #include <algorithm>
@@ -31,7 +32,8 @@ static SDL_Window *MakeWindow(WindowSpec const &spec, DeviceScale scale) {
                                           std::max(scale.Edge(spec.height), 1), WindowFlags(spec));
     if (window == nullptr)
         throw std::runtime_error("cannot open the window \"" + spec.title + "\": " + SDL_GetError());
-    SdlScreen::IgnoreOtherWindowsMouse(window);
+    SdlScreen::LimitEvents(window);
+    SdlTimeOfUse::Follow(window);
     return window;
 }
 
@@ -52,6 +54,7 @@ SdlWindow::SdlWindow(SdlWindowSystem &system_, WindowSpec const &spec, DeviceSca
 SdlWindow::~SdlWindow() {
     system.Remove(this);
     picture.reset();
+    SdlTimeOfUse::Leave(window);
     SDL_DestroyWindow(window);
 }
 

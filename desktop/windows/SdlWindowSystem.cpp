@@ -1,6 +1,7 @@
 #include "desktop/windows/SdlWindowSystem.h"
 #include "desktop/drawing/WholePixels.h"
 #include "desktop/windows/SdlScreen.h"
+#include "desktop/windows/SdlTimeOfUse.h"
 #include "desktop/windows/SdlWindow.h"
 #include <SDL.h>
 #include <algorithm>
@@ -163,7 +164,7 @@ bool SdlWindowSystem::Block(double seconds) {
 // SDL blocks only while there is a window of its own, and polls a thousand times a second otherwise.
 void SdlWindowSystem::OpenWaker() {
     waker = SDL_CreateWindow("", 0, 0, 1, 1, SDL_WINDOW_HIDDEN);
-    SdlScreen::IgnoreOtherWindowsMouse(waker);
+    SdlScreen::LimitEvents(waker);
 }
 
 // Takes over everything that SDL knows, so that moves of the mouse can take each other's place.
@@ -171,6 +172,7 @@ void SdlWindowSystem::Pump() {
     hasPaused = false;
     lookedAt = Now();
     SDL_PumpEvents();
+    SdlTimeOfUse::Note();
     SDL_Event event;
     while (SDL_PeepEvents(&event, 1, SDL_GETEVENT, SDL_FIRSTEVENT, SDL_LASTEVENT) > 0)
         Translate(event);

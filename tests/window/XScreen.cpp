@@ -1,6 +1,7 @@
 #include "tests/window/XScreen.h"
 #include <SDL.h>
 #include <SDL_syswm.h>
+#include <X11/Xatom.h>
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
 #include <X11/extensions/Xfixes.h>
@@ -8,6 +9,7 @@
 #include <stdexcept>
 
 static int const kDeepColourDepth = 24;
+static int const kAtomBits = 32; // as sent
 static int const kFullBits = 8, kReducedBits = 5;
 
 struct XScreen::Connection {
@@ -23,6 +25,7 @@ struct XScreen::Connection {
         XDestroyWindow(display, window);
         return window;
     }
+    Atom Supported() const { return XInternAtom(display, "_NET_SUPPORTED", False); }
     // As 0xRRGGBB.
     std::uint32_t ColourOf(unsigned long pixel) const {
         XColor colour = {};
@@ -83,6 +86,36 @@ std::vector<std::uint32_t> XScreen::PixelsIn(int x, int y, int width, int height
 void XScreen::PointAt(int x, int y) const {
     Display *display = connection->display;
     XWarpPointer(display, None, DefaultRootWindow(display), 0, 0, 0, 0, x, y);
+    XSync(display, False);
+}
+
+std::vector<std::string> XScreen::SaidByManager() const {
+    long const most = 1000;
+    Display *const display = connection->display;
+    Atom type = None;
+    int bits = 0;
+    unsigned long count = 0, rest = 0;
+    unsigned char *data = nullptr;
+    XGetWindowProperty(display, DefaultRootWindow(display), connection->Supported(), 0, most, False, XA_ATOM,
+                       &type, &bits, &count, &rest, &data);
+    std::vector<std::string> names;
+    for (unsigned long i = 0; i < count; ++i) {
+        char *const name = XGetAtomName(display, reinterpret_cast<Atom *>(data)[i]);
+        names.push_back(name);
+        XFree(name);
+    }
+    XFree(data);
+    return names;
+}
+
+void XScreen::LetManagerSay(std::vector<std::string> const &names) const {
+    Display *const display = connection->display;
+    std::vector<Atom> atoms;
+    for (std::string const &name : names)
+        atoms.push_back(XInternAtom(display, name.c_str(), False));
+    XChangeProperty(display, DefaultRootWindow(display), connection->Supported(), XA_ATOM, kAtomBits,
+                    PropModeReplace, reinterpret_cast<unsigned char *>(atoms.data()),
+                    static_cast<int>(atoms.size()));
     XSync(display, False);
 }
 

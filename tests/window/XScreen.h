@@ -2,6 +2,7 @@
 #pragma once
 #include <cstdint>
 #include <memory>
+#include <string>
 #include <vector>
 
 class XScreen {
@@ -23,6 +24,9 @@ public:
     void LookForAWindowThatIsGone() const;
     // The window that has the clipboard, 0 for none.
     unsigned long ClipboardOwner() const;
+    // What the window manager says it knows, by name; LetManagerSay lets it say something else.
+    std::vector<std::string> SaidByManager() const;
+    void LetManagerSay(std::vector<std::string> const &names) const;
     // Bits of each of the colours red, green and blue that the screen can show.
     int ColourBits() const;
 
