@@ -29,6 +29,7 @@ function(glog_library name)
   # replace are variables.
   target_compile_options(${name} PRIVATE -fno-semantic-interposition)
   target_link_options(${name} PRIVATE -Wl,-Bsymbolic-functions)
+  glog_order_code(${name})
 endfunction()
 
 # glog_program(NAME SOURCES...): a program of this tree.
