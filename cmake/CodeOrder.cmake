@@ -27,7 +27,7 @@ endfunction()
 # that cannot.
 function(glog_order_code name)
   set(list ${CMAKE_SOURCE_DIR}/cmake/order/${name}.txt)
-  if(NOT CMAKE_BUILD_TYPE STREQUAL Release OR GLOG_SANITIZE OR NOT EXISTS ${list})
+  if(NOT CMAKE_BUILD_TYPE MATCHES "^Rel" OR GLOG_SANITIZE OR NOT EXISTS ${list})
     return()
   endif()
   glog_find_linker_script(script)
