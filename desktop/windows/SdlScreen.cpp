@@ -5,11 +5,7 @@
 #include <poll.h>
 
 static Display *theDisplay = nullptr; // SDL's
-static Atom theTimeOfUse = None;
-static unsigned long theFlushed = 0; // number of the request that was to come next when all were sent
-
-// SDL notes at the window when it was used last, for window managers, and the server says so.
-static bool IsNoNoteOfUse(XEvent &change) { return change.xproperty.atom != theTimeOfUse; }
+static unsigned long theFlushed = 0;  // number of the request that was to come next when all were sent
 
 // SDL itself would not take it for one.
 static bool MakeExposure(XEvent &event) {
@@ -27,8 +23,6 @@ void SdlScreen::LimitEvents(SDL_Window *window) {
     theDisplay = SdlNativeWindow::Of(window).display;
     if (theDisplay == nullptr)
         return;
-    theTimeOfUse = XInternAtom(theDisplay, "_NET_WM_USER_TIME", False); // known here since SDL asked
-    SdlEventFilter::Set(theDisplay, PropertyNotify, IsNoNoteOfUse);
     SdlEventFilter::Set(theDisplay, GraphicsExpose, MakeExposure);
     SdlEventFilter::Set(theDisplay, NoExpose, Drop);
     // Every movement and press of the mouse on the whole screen.

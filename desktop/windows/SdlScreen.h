@@ -7,8 +7,8 @@ namespace SdlScreen {
 
 // To be called for every window of SDL that is made; only the first one of a session has an effect. What
 // would wake the program for nothing does not reach it any more: the mouse over other windows, for which SDL
-// has asked the server, its own notes of when a window was used, and that a move of pixels within a window
-// has missed none. Those that it has missed are an exposure, as when other windows uncover them.
+// has asked the server, and that a move of pixels within a window has missed none. Those that it has missed
+// are an exposure, as when other windows uncover them.
 void LimitEvents(SDL_Window *);
 
 // Where the mouse is, in device pixels. The server is asked: SDL keeps a place that those events would renew.

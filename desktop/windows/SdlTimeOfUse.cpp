@@ -52,6 +52,9 @@ static bool CopyTimeOfKey(XEvent &key) {
     return true;
 }
 
+// That SDL has noted a time is news to nobody here.
+static bool IsNoNoteOfUse(XEvent &change) { return change.xproperty.atom != theAtoms[kTime]; }
+
 // Reads nothing where no window manager says what it knows: then nobody wants the times.
 static bool ManagerReadsOnlyAtWindows() {
     Atom type = None;
@@ -73,6 +76,7 @@ static void Connect(Display *display) {
     XInternAtoms(display, const_cast<char **>(kNames), kAtomNames, False, theAtoms);
     SdlEventFilter::Set(display, ButtonPress, TakeTimeOfPress);
     SdlEventFilter::Set(display, KeyPress, CopyTimeOfKey);
+    SdlEventFilter::Set(display, PropertyNotify, IsNoNoteOfUse);
 }
 
 void SdlTimeOfUse::Follow(SDL_Window *made) {
