@@ -14,10 +14,11 @@ struct Symbol {
     std::string size; // in bytes, hexadecimal
 };
 
-// The dynamic symbols that the library defines, read from its file.
-inline std::map<std::string, Symbol> ExportsOfTheLibrary() {
+// The symbols that a library defines and that have a size, read from its file; nm takes the options.
+inline std::map<std::string, Symbol> SymbolsOf(std::string const &library, std::string const &options) {
     std::map<std::string, Symbol> symbols;
-    std::FILE *const output = popen("'" GLOG_NM "' -D --defined-only -S -P '" GLOG_PANES_LIBRARY "'", "r");
+    std::string const command = "'" GLOG_NM "' " + options + " --defined-only -S -P '" + library + "'";
+    std::FILE *const output = popen(command.c_str(), "r");
     EXPECT_NE(output, nullptr);
     std::array<char, 4096> line;
     while (output && std::fgets(line.data(), line.size(), output)) {
@@ -30,6 +31,9 @@ inline std::map<std::string, Symbol> ExportsOfTheLibrary() {
     EXPECT_EQ(output ? pclose(output) : -1, 0);
     return symbols;
 }
+
+// The dynamic ones of the library under test.
+inline std::map<std::string, Symbol> ExportsOfTheLibrary() { return SymbolsOf(GLOG_PANES_LIBRARY, "-D"); }
 
 // The variable as a program finds it that knows no more than its name.
 template <class Procedure> Procedure *Find(char const *name) {
